@@ -1,0 +1,19 @@
+# Warnings are errors, in everything that is ours. Linked by each target of the project.
+add_library(project_options INTERFACE)
+target_compile_options(project_options INTERFACE
+    -Wall -Wextra -Wpedantic -Werror
+    -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual -Wformat=2
+    -Wimplicit-fallthrough -Wnull-dereference -Wextra-semi -Wundef -Wvla)
+target_compile_definitions(project_options INTERFACE UNICODE _UNICODE)
+target_include_directories(project_options INTERFACE "${PROJECT_SOURCE_DIR}")
+
+if(QUILLON_SANITIZE)
+    add_compile_options(-fsanitize=${QUILLON_SANITIZE} -fno-omit-frame-pointer
+                        -fno-sanitize-recover=all)
+    add_link_options(-fsanitize=${QUILLON_SANITIZE})
+endif()
+
+find_program(CCACHE ccache)
+if(CCACHE)
+    set(CMAKE_CXX_COMPILER_LAUNCHER "${CCACHE}")
+endif()

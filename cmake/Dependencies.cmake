@@ -1,0 +1,20 @@
+find_package(PkgConfig REQUIRED)
+find_package(wxWidgets 3.2 REQUIRED COMPONENTS core xml base)
+
+# wxWidgets as one target; its headers are not ours to warn about.
+add_library(wxwidgets INTERFACE)
+separate_arguments(wx_flags NATIVE_COMMAND "${wxWidgets_CXX_FLAGS}")
+target_compile_options(wxwidgets INTERFACE ${wx_flags})
+target_compile_definitions(wxwidgets INTERFACE ${wxWidgets_DEFINITIONS})
+target_include_directories(wxwidgets SYSTEM INTERFACE ${wxWidgets_INCLUDE_DIRS})
+target_link_libraries(wxwidgets INTERFACE ${wxWidgets_LIBRARIES})
+
+if(NOT WIN32)
+    pkg_check_modules(GSF REQUIRED IMPORTED_TARGET libgsf-1)
+    pkg_check_modules(POPPLER REQUIRED IMPORTED_TARGET poppler-glib)
+    pkg_check_modules(CAIRO REQUIRED IMPORTED_TARGET cairo-ps)
+    find_package(Cups REQUIRED)
+endif()
+find_package(CLI11 REQUIRED)
+find_package(nlohmann_json REQUIRED)
+find_package(GTest REQUIRED)

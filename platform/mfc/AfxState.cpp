@@ -1,0 +1,29 @@
+#include <afxwin.h>
+
+namespace {
+
+AFX_MODULE_STATE g_processState;
+thread_local AFX_MODULE_STATE* t_moduleState = nullptr;
+
+} // namespace
+
+AFX_MODULE_STATE* AfxGetModuleState() {
+    return t_moduleState ? t_moduleState : &g_processState;
+}
+
+AFX_MODULE_STATE* AfxSetModuleState(AFX_MODULE_STATE* state) noexcept {
+    AFX_MODULE_STATE* previous = AfxGetModuleState();
+    t_moduleState = state;
+    return previous;
+}
+
+AFX_MAINTAIN_STATE2::AFX_MAINTAIN_STATE2(AFX_MODULE_STATE* state) noexcept
+    : m_previous(AfxSetModuleState(state)) {}
+
+AFX_MAINTAIN_STATE2::~AFX_MAINTAIN_STATE2() {
+    AfxSetModuleState(m_previous);
+}
+
+BOOL AfxWinInit(HINSTANCE instance, HINSTANCE previous, LPTSTR /*commandLine*/, int /*show*/) {
+    return instance != nullptr && previous == nullptr;
+}

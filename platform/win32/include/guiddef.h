@@ -1,0 +1,30 @@
+#pragma once
+
+#include <windef.h>
+
+#include <cstring>
+
+struct GUID {
+    std::uint32_t Data1;
+    std::uint16_t Data2;
+    std::uint16_t Data3;
+    std::uint8_t Data4[8];
+};
+
+using IID = GUID;
+using CLSID = GUID;
+using REFGUID = const GUID&;
+using REFIID = const IID&;
+using REFCLSID = const CLSID&;
+using LPCLSID = CLSID*;
+
+inline bool operator==(REFGUID left, REFGUID right) {
+    return std::memcmp(&left, &right, sizeof(GUID)) == 0;
+}
+inline bool operator!=(REFGUID left, REFGUID right) {
+    return !(left == right);
+}
+
+#define IsEqualGUID(left, right) ((left) == (right))
+#define IsEqualIID(left, right) ((left) == (right))
+#define IsEqualCLSID(left, right) ((left) == (right))

@@ -1,0 +1,46 @@
+#pragma once
+
+// Structured storage, for reading only.
+
+#include <objbase.h>
+
+#define STGM_READ 0x00000000U
+#define STGM_WRITE 0x00000001U
+#define STGM_READWRITE 0x00000002U
+#define STGM_SHARE_EXCLUSIVE 0x00000010U
+#define STGM_SHARE_DENY_WRITE 0x00000020U
+#define STGM_SHARE_DENY_READ 0x00000030U
+#define STGM_SHARE_DENY_NONE 0x00000040U
+
+#define STREAM_SEEK_SET 0U
+#define STREAM_SEEK_CUR 1U
+#define STREAM_SEEK_END 2U
+
+using SNB = LPOLESTR*;
+
+struct IStream : IUnknown {
+    virtual HRESULT STDMETHODCALLTYPE Read(void* buffer, ULONG size, ULONG* read) = 0;
+    virtual HRESULT STDMETHODCALLTYPE Seek(LARGE_INTEGER distance, DWORD origin,
+                                           ULARGE_INTEGER* newPosition) = 0;
+
+protected:
+    ~IStream() = default;
+};
+
+struct IStorage : IUnknown {
+    virtual HRESULT STDMETHODCALLTYPE OpenStream(const OLECHAR* name, void* reserved1, DWORD mode,
+                                                 DWORD reserved2, IStream** stream) = 0;
+
+protected:
+    ~IStorage() = default;
+};
+
+EXTERN_C {
+
+HRESULT WINAPI StgOpenStorage(const WCHAR* fileName, IStorage* priority, DWORD mode, SNB exclude,
+                              DWORD reserved, IStorage** storage);
+
+extern const IID IID_IStream;
+extern const IID IID_IStorage;
+
+} // EXTERN_C

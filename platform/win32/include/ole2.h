@@ -1,0 +1,5 @@
+#pragma once
+
+#include <objbase.h>
+#include <objidl.h>
+#include <oleauto.h>

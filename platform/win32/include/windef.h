@@ -1,0 +1,102 @@
+#pragma once
+
+// The basic types of the Windows API. Sizes are those of 64-bit Windows (a LONG has 32 bits), but
+// for WCHAR, which is the compiler's wchar_t and so has 4 bytes here.
+
+#include <cstddef>
+#include <cstdint>
+
+#define WINAPI
+#define CALLBACK
+#define APIENTRY
+#define STDMETHODCALLTYPE
+#define EXTERN_C extern "C"
+
+#define FALSE 0
+#define TRUE 1
+#define MAX_PATH 260
+
+using BOOL = int;
+using BYTE = std::uint8_t;
+using CHAR = char;
+using WCHAR = wchar_t;
+using SHORT = std::int16_t;
+using USHORT = std::uint16_t;
+using WORD = std::uint16_t;
+using INT = int;
+using UINT = unsigned int;
+using LONG = std::int32_t;
+using ULONG = std::uint32_t;
+using DWORD = std::uint32_t;
+using LONGLONG = std::int64_t;
+using ULONGLONG = std::uint64_t;
+using DWORD64 = std::uint64_t;
+using INT_PTR = std::intptr_t;
+using UINT_PTR = std::uintptr_t;
+using LONG_PTR = std::intptr_t;
+using ULONG_PTR = std::uintptr_t;
+using DWORD_PTR = std::uintptr_t;
+using SIZE_T = std::size_t;
+
+using PVOID = void*;
+using LPVOID = void*;
+using LPCVOID = const void*;
+using LPBYTE = BYTE*;
+using PLONG = LONG*;
+using LPDWORD = DWORD*;
+using PDWORD = DWORD*;
+using LPBOOL = BOOL*;
+using LPSTR = char*;
+using LPCSTR = const char*;
+using LPWSTR = wchar_t*;
+using LPCWSTR = const wchar_t*;
+using LPTSTR = LPWSTR;
+using LPCTSTR = LPCWSTR;
+
+using HANDLE = void*;
+using LPHANDLE = HANDLE*;
+
+#define DECLARE_HANDLE(name)                                                                       \
+    struct name##__;                                                                               \
+    using name = name##__*
+
+DECLARE_HANDLE(HINSTANCE);
+DECLARE_HANDLE(HKEY);
+using HMODULE = HINSTANCE;
+using PHKEY = HKEY*;
+
+using FARPROC = INT_PTR (*)();
+
+#define INVALID_HANDLE_VALUE (reinterpret_cast<HANDLE>(static_cast<INT_PTR>(-1)))
+
+union LARGE_INTEGER {
+    LONGLONG QuadPart;
+};
+using PLARGE_INTEGER = LARGE_INTEGER*;
+
+union ULARGE_INTEGER {
+    ULONGLONG QuadPart;
+};
+
+struct FILETIME {
+    DWORD dwLowDateTime;
+    DWORD dwHighDateTime;
+};
+using PFILETIME = FILETIME*;
+
+struct SECURITY_ATTRIBUTES {
+    DWORD nLength;
+    LPVOID lpSecurityDescriptor;
+    BOOL bInheritHandle;
+};
+using LPSECURITY_ATTRIBUTES = SECURITY_ATTRIBUTES*;
+using PSECURITY_DESCRIPTOR = PVOID;
+
+// Standard access rights, which files, registry keys and printers share.
+#define READ_CONTROL 0x00020000U
+#define STANDARD_RIGHTS_REQUIRED 0x000F0000U
+#define STANDARD_RIGHTS_READ READ_CONTROL
+#define STANDARD_RIGHTS_WRITE READ_CONTROL
+#define SYNCHRONIZE 0x00100000U
+#define GENERIC_READ 0x80000000U
+#define GENERIC_WRITE 0x40000000U

@@ -1,0 +1,114 @@
+#pragma once
+
+// System error codes and COM result codes: the ones that this layer answers and its callers test.
+
+#include <windef.h>
+
+using HRESULT = LONG;
+using SCODE = LONG;
+
+#define SUCCEEDED(hr) (static_cast<HRESULT>(hr) >= 0)
+#define FAILED(hr) (static_cast<HRESULT>(hr) < 0)
+
+#define FACILITY_WIN32 7
+#define HRESULT_CODE(hr) ((hr) & 0xFFFF)
+
+/// The HRESULT that stands for a system error code; a value that is one already stays as it is.
+constexpr HRESULT HRESULT_FROM_WIN32(unsigned long error) {
+    return static_cast<HRESULT>(error) <= 0
+               ? static_cast<HRESULT>(error)
+               : static_cast<HRESULT>((error & 0x0000FFFFU) | (FACILITY_WIN32 << 16) | 0x80000000U);
+}
+
+#define ERROR_SUCCESS 0
+#define ERROR_INVALID_FUNCTION 1
+#define ERROR_FILE_NOT_FOUND 2
+#define ERROR_PATH_NOT_FOUND 3
+#define ERROR_TOO_MANY_OPEN_FILES 4
+#define ERROR_ACCESS_DENIED 5
+#define ERROR_INVALID_HANDLE 6
+#define ERROR_NOT_ENOUGH_MEMORY 8
+#define ERROR_OUTOFMEMORY 14
+#define ERROR_WRITE_PROTECT 19
+#define ERROR_GEN_FAILURE 31
+#define ERROR_SHARING_VIOLATION 32
+#define ERROR_NOT_SUPPORTED 50
+#define ERROR_FILE_EXISTS 80
+#define ERROR_INVALID_PARAMETER 87
+#define ERROR_DISK_FULL 112
+#define ERROR_CALL_NOT_IMPLEMENTED 120
+#define ERROR_INSUFFICIENT_BUFFER 122
+#define ERROR_INVALID_NAME 123
+#define ERROR_INVALID_LEVEL 124
+#define ERROR_MOD_NOT_FOUND 126
+#define ERROR_PROC_NOT_FOUND 127
+#define ERROR_NEGATIVE_SEEK 131
+#define ERROR_ALREADY_EXISTS 183
+#define ERROR_BAD_EXE_FORMAT 193
+#define ERROR_FILENAME_EXCED_RANGE 206
+#define ERROR_MORE_DATA 234
+#define ERROR_NO_MORE_ITEMS 259
+#define ERROR_KEY_DELETED 1018
+#define ERROR_NO_UNICODE_TRANSLATION 1113
+#define ERROR_IO_DEVICE 1117
+#define ERROR_UNKNOWN_PRINTER_DRIVER 1797
+#define ERROR_UNKNOWN_PRINTPROCESSOR 1798
+#define ERROR_INVALID_PRINTER_NAME 1801
+#define ERROR_PRINTER_ALREADY_EXISTS 1802
+#define ERROR_INVALID_ENVIRONMENT 1805
+#define ERROR_PRINTER_DRIVER_ALREADY_INSTALLED 1795
+#define ERROR_UNKNOWN_PORT 1796
+#define ERROR_PRINTER_DRIVER_IN_USE 3001
+
+#define S_OK (static_cast<HRESULT>(0x00000000))
+#define S_FALSE (static_cast<HRESULT>(0x00000001))
+#define E_NOTIMPL (static_cast<HRESULT>(0x80004001))
+#define E_NOINTERFACE (static_cast<HRESULT>(0x80004002))
+#define E_POINTER (static_cast<HRESULT>(0x80004003))
+#define E_ABORT (static_cast<HRESULT>(0x80004004))
+#define E_FAIL (static_cast<HRESULT>(0x80004005))
+#define E_UNEXPECTED (static_cast<HRESULT>(0x8000FFFF))
+#define E_ACCESSDENIED (static_cast<HRESULT>(0x80070005))
+#define E_OUTOFMEMORY (static_cast<HRESULT>(0x8007000E))
+#define E_INVALIDARG (static_cast<HRESULT>(0x80070057))
+#define E_BOUNDS (static_cast<HRESULT>(0x8000000B))
+
+#define CO_E_NOTINITIALIZED (static_cast<HRESULT>(0x800401F0))
+#define CO_E_CLASSSTRING (static_cast<HRESULT>(0x800401F3))
+#define CO_E_DLLNOTFOUND (static_cast<HRESULT>(0x800401F8))
+#define CO_E_ERRORINDLL (static_cast<HRESULT>(0x800401F9))
+#define CO_E_OBJNOTREG (static_cast<HRESULT>(0x800401FB))
+#define RPC_E_CHANGED_MODE (static_cast<HRESULT>(0x80010106))
+#define REGDB_E_CLASSNOTREG (static_cast<HRESULT>(0x80040154))
+#define CLASS_E_NOAGGREGATION (static_cast<HRESULT>(0x80040110))
+#define CLASS_E_CLASSNOTAVAILABLE (static_cast<HRESULT>(0x80040111))
+#define SELFREG_E_CLASS (static_cast<HRESULT>(0x80040201))
+
+#define DISP_E_UNKNOWNINTERFACE (static_cast<HRESULT>(0x80020001))
+#define DISP_E_MEMBERNOTFOUND (static_cast<HRESULT>(0x80020003))
+#define DISP_E_PARAMNOTFOUND (static_cast<HRESULT>(0x80020004))
+#define DISP_E_TYPEMISMATCH (static_cast<HRESULT>(0x80020005))
+#define DISP_E_UNKNOWNNAME (static_cast<HRESULT>(0x80020006))
+#define DISP_E_NONAMEDARGS (static_cast<HRESULT>(0x80020007))
+#define DISP_E_BADVARTYPE (static_cast<HRESULT>(0x80020008))
+#define DISP_E_EXCEPTION (static_cast<HRESULT>(0x80020009))
+#define DISP_E_OVERFLOW (static_cast<HRESULT>(0x8002000A))
+#define DISP_E_BADPARAMCOUNT (static_cast<HRESULT>(0x8002000E))
+#define TYPE_E_ELEMENTNOTFOUND (static_cast<HRESULT>(0x8002802B))
+
+#define STG_E_INVALIDFUNCTION (static_cast<HRESULT>(0x80030001))
+#define STG_E_FILENOTFOUND (static_cast<HRESULT>(0x80030002))
+#define STG_E_PATHNOTFOUND (static_cast<HRESULT>(0x80030003))
+#define STG_E_ACCESSDENIED (static_cast<HRESULT>(0x80030005))
+#define STG_E_INVALIDHANDLE (static_cast<HRESULT>(0x80030006))
+#define STG_E_INSUFFICIENTMEMORY (static_cast<HRESULT>(0x80030008))
+#define STG_E_INVALIDPOINTER (static_cast<HRESULT>(0x80030009))
+#define STG_E_READFAULT (static_cast<HRESULT>(0x8003001E))
+#define STG_E_SHAREVIOLATION (static_cast<HRESULT>(0x80030020))
+#define STG_E_INVALIDPARAMETER (static_cast<HRESULT>(0x80030057))
+#define STG_E_FILEALREADYEXISTS (static_cast<HRESULT>(0x80030050))
+#define STG_E_INVALIDHEADER (static_cast<HRESULT>(0x800300FB))
+#define STG_E_INVALIDNAME (static_cast<HRESULT>(0x800300FC))
+#define STG_E_UNIMPLEMENTEDFUNCTION (static_cast<HRESULT>(0x800300FE))
+#define STG_E_INVALIDFLAG (static_cast<HRESULT>(0x800300FF))
+#define STG_E_REVERTED (static_cast<HRESULT>(0x80030102))

@@ -1,0 +1,57 @@
+#pragma once
+
+// The registry: one per process, empty at start, in memory only. Values are typed bytes; texts
+// are UTF-16LE in them, with their terminating zero, as on Windows.
+
+#include <windef.h>
+#include <winerror.h>
+
+using REGSAM = DWORD;
+using LSTATUS = LONG;
+
+#define HKEY_CLASSES_ROOT (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000000U)))
+#define HKEY_CURRENT_USER (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000001U)))
+#define HKEY_LOCAL_MACHINE (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000002U)))
+#define HKEY_USERS (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000003U)))
+
+#define KEY_QUERY_VALUE 0x0001U
+#define KEY_SET_VALUE 0x0002U
+#define KEY_CREATE_SUB_KEY 0x0004U
+#define KEY_ENUMERATE_SUB_KEYS 0x0008U
+#define KEY_NOTIFY 0x0010U
+#define KEY_READ 0x20019U
+#define KEY_WRITE 0x20006U
+#define KEY_ALL_ACCESS 0xF003FU
+
+#define REG_OPTION_NON_VOLATILE 0x00000000U
+
+#define REG_CREATED_NEW_KEY 1U
+#define REG_OPENED_EXISTING_KEY 2U
+
+#define REG_NONE 0U
+#define REG_SZ 1U
+#define REG_EXPAND_SZ 2U
+#define REG_BINARY 3U
+#define REG_DWORD 4U
+#define REG_MULTI_SZ 7U
+#define REG_QWORD 11U
+
+EXTERN_C {
+
+LSTATUS WINAPI RegOpenKeyExW(HKEY key, LPCWSTR subKey, DWORD options, REGSAM access, PHKEY result);
+LSTATUS WINAPI RegCreateKeyExW(HKEY key, LPCWSTR subKey, DWORD reserved, LPWSTR keyClass,
+                               DWORD options, REGSAM access,
+                               LPSECURITY_ATTRIBUTES securityAttributes, PHKEY result,
+                               LPDWORD disposition);
+LSTATUS WINAPI RegCloseKey(HKEY key);
+LSTATUS WINAPI RegQueryValueExW(HKEY key, LPCWSTR valueName, LPDWORD reserved, LPDWORD type,
+                                LPBYTE data, LPDWORD dataSize);
+LSTATUS WINAPI RegSetValueExW(HKEY key, LPCWSTR valueName, DWORD reserved, DWORD type,
+                              const BYTE* data, DWORD dataSize);
+LSTATUS WINAPI RegDeleteValueW(HKEY key, LPCWSTR valueName);
+LSTATUS WINAPI RegDeleteTreeW(HKEY key, LPCWSTR subKey);
+LSTATUS WINAPI RegEnumKeyExW(HKEY key, DWORD index, LPWSTR name, LPDWORD nameSize,
+                             LPDWORD reserved, LPWSTR keyClass, LPDWORD keyClassSize,
+                             PFILETIME lastWriteTime);
+
+} // EXTERN_C
