@@ -46,8 +46,13 @@ public:
     static WQTranslations& GetInstance();
 
     /// @param key the English text
-    /// @return that text and its translations, one per installed language that has one
+    /// @return that text and its translations, each once, one per installed language that has one
     wxArrayString GetTranslations(const wxString& key) const;
+
+    /// For the host, before it has threads: reads the languages of another folder in place of the
+    /// one beside the program.
+    /// @param folder holds <language>/LC_MESSAGES/quillon.mo; one that is missing has no languages
+    void ReadFolder(const wxString& folder);
 
     WQTranslations(const WQTranslations&) = delete;
     WQTranslations& operator=(const WQTranslations&) = delete;
