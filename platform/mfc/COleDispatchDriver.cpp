@@ -210,10 +210,9 @@ void COleDispatchDriver::InvokeHelper(DISPID member, WORD flags, VARTYPE resultT
     COleVariant answer;
     EXCEPINFO raised{};
     UINT badArgument = 0;
-    const HRESULT invoked =
-        m_lpDispatch->Invoke(member, IID_NULL, LOCALE_USER_DEFAULT, flags, &call,
-                             resultType == VT_EMPTY ? nullptr : static_cast<VARIANT*>(&answer),
-                             &raised, &badArgument);
+    const HRESULT invoked = m_lpDispatch->Invoke(
+        member, IID_NULL, LOCALE_USER_DEFAULT, flags, &call,
+        resultType == VT_EMPTY ? nullptr : static_cast<VARIANT*>(&answer), &raised, &badArgument);
     if (invoked == DISP_E_EXCEPTION)
         ThrowRaised(raised);
     if (FAILED(invoked))

@@ -41,8 +41,8 @@ public:
     ~COleVariant();
 
     void Clear();
-    operator LPVARIANT() { return this; }             // NOLINT(google-explicit-constructor)
-    operator const VARIANT*() const { return this; }  // NOLINT(google-explicit-constructor)
+    operator LPVARIANT() { return this; }            // NOLINT(google-explicit-constructor)
+    operator const VARIANT*() const { return this; } // NOLINT(google-explicit-constructor)
 };
 
 /// Calls an automation object by DISPID. Owns one reference to the object, as MFC's class does.

@@ -2,9 +2,8 @@
 
 // MFC's start-up, module state and exceptions: what the filter uses of them.
 
-#include <windows.h>
-
 #include <afxcoll.h>
+#include <windows.h>
 
 #include <string>
 

@@ -1,0 +1,39 @@
+#include "office/OutputWait.h"
+
+#include "pstools/FileProbe.h"
+
+#include <windows.h>
+
+#include <wx/utils.h>
+
+OutputWaitLimits& GetOutputWaitLimits() {
+    static OutputWaitLimits limits;
+    return limits;
+}
+
+bool WaitForOutput(const wxString& path, const OutputWait& wait) {
+    using Clock = std::chrono::steady_clock;
+    const OutputWaitLimits limits = GetOutputWaitLimits();
+    const Clock::time_point start = Clock::now();
+    Clock::time_point lastGrowth = start;
+
+    std::uint64_t size = 0;
+    QueryFileSize(path, size);
+    for (;;) {
+        Sleep(static_cast<DWORD>(wait.pollInterval.count()));
+        std::uint64_t newSize = size; // a reading that fails changes nothing
+        QueryFileSize(path, newSize);
+        if (newSize == size && (size != 0 || wait.emptyIsStable))
+            break;
+
+        const Clock::time_point now = Clock::now();
+        if (newSize != size)
+            lastGrowth = now;
+        if (now - lastGrowth >= limits.withoutGrowth || now - start >= limits.altogether)
+            return false;
+        size = newSize;
+    }
+    if (size >= LargeOutputSize && wait.settleTimeOfLargeFile.count() > 0)
+        wxSleep(static_cast<int>(wait.settleTimeOfLargeFile.count()));
+    return true;
+}

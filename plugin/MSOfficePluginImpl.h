@@ -1,0 +1,62 @@
+#pragma once
+
+#include "plugin/PowerPointOptions.h"
+#include "plugin/ResultCodes.h"
+#include "plugin/SettingsMap.h"
+#include "plugin/WQPlugin.h"
+
+class wxFileName;
+
+/// The filter as the host drives it. One object holds the settings and the findings of one use;
+/// objects share nothing.
+///
+/// The operations stand in four files: this class's own (identity, initialisation), and
+/// MSOfficePluginSettings, MSOfficePluginScreening and MSOfficePluginConversion.
+class MSOfficePluginImpl : public WQPlugin {
+public:
+    MSOfficePluginImpl() = default;
+    MSOfficePluginImpl(const MSOfficePluginImpl&) = delete;
+    MSOfficePluginImpl& operator=(const MSOfficePluginImpl&) = delete;
+
+    int Initialize(const wxString& serverInfo) override;
+    int ApplySettings(const wxXmlNode* settings) override;
+    void GetVersion(wxString& text) override;
+    void GetVendor(wxString& text) override;
+    void GetIdentifier(wxString& text) override;
+    void GetFlagLists(wxArrayString& first, wxArrayString& second) override;
+    int GetPluginKind() override;
+    wxWindow* CreateSettingsPanel(wxWindow* parent) override;
+    bool GetErrorText(int code, wxString& text) override;
+    int ScreenFiles(const wxArrayString& files, wxArrayString& spare, wxArrayString& refused,
+                    JobItemArray& items) override;
+    int ScreenFolder(const wxString& folder, wxArrayString& refused, JobItemArray& items) override;
+    int ScreenFileList(const wxString& folder, wxArrayString& refused, JobItemArray& items,
+                       wxArrayString** files) override;
+    int Convert(void* reserved, const JobItem& item, const wxString& outputFolder,
+                wxString& outputName, ProgressSink* progress) override;
+    int SaveSettings(wxXmlNode* parent) override;
+    int LoadSettings(const wxXmlNode* settings) override;
+    bool IsReady() override;
+    int GetAuxiliaryCode() override;
+
+    /// Whether a document can be converted now: Office is installed and a printer known.
+    virtual bool CanConvert();
+
+private:
+    enum class Screening { GoOn, Stop };
+
+    void FindPrinter();
+    Screening ScreenFile(const wxString& path, wxArrayString& refused, JobItemArray& items);
+    void Accept(const wxString& path, JobItemArray& items);
+    ResultCode PrintDocument(const wxFileName& input, const wxString& outputFolder,
+                             wxString& outputName, ProgressSink* progress);
+
+    bool m_printerAvailable = true;
+    bool m_currentServer = false;
+    bool m_psOutput = false;
+    ResultCode m_lastResult = Result::Success;
+    wxString m_printerName;
+    wxString m_distillerProfile;
+    SettingsMap m_settings{100};
+    PowerPointOptions m_powerPointOptions;
+};

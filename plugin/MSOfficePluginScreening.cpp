@@ -1,0 +1,120 @@
+#include "plugin/Boundary.h"
+#include "plugin/MSOfficePluginImpl.h"
+#include "plugin/ScreeningRules.h"
+
+#include <wx/dir.h>
+#include <wx/filename.h>
+
+#include <memory>
+#include <new>
+
+namespace {
+
+/// Whether UTF-8 has a form for every character. wxString's own conversion writes a lone surrogate
+/// without complaint, so the units are looked at here; a pair is one character only where wchar_t
+/// is a UTF-16 unit.
+bool IsRepresentableInUtf8(const wxString& text) {
+    constexpr wxUint32 FirstSurrogate = 0xD800;
+    constexpr wxUint32 FirstLowSurrogate = 0xDC00;
+    constexpr wxUint32 LastSurrogate = 0xDFFF;
+    constexpr wxUint32 LastCharacter = 0x10FFFF;
+    const auto isLow = [](wxUint32 unit) {
+        return unit >= FirstLowSurrogate && unit <= LastSurrogate;
+    };
+
+    const std::wstring units = text.ToStdWstring();
+    for (std::size_t i = 0; i < units.size(); ++i) {
+        const auto unit = static_cast<wxUint32>(units[i]);
+        const bool isPair = sizeof(wchar_t) == 2 && unit >= FirstSurrogate &&
+                            unit < FirstLowSurrogate && i + 1 < units.size() &&
+                            isLow(static_cast<wxUint32>(units[i + 1]));
+        if (isPair)
+            ++i;
+        else if (unit > LastCharacter || (unit >= FirstSurrogate && unit <= LastSurrogate))
+            return false;
+    }
+    return true;
+}
+
+} // namespace
+
+int MSOfficePluginImpl::ScreenFiles(const wxArrayString& files, wxArrayString& spare,
+                                    wxArrayString& refused, JobItemArray& items) {
+    return AtBoundary(Result::Failure, [&] {
+        spare.Clear();
+        for (const wxString& path : files)
+            if (ScreenFile(path, refused, items) == Screening::Stop)
+                break;
+        return m_lastResult;
+    });
+}
+
+/// Classifies one file and leaves its outcome as the last result. What stands in the way of every
+/// later file too, and a list that is broken in itself, end the run.
+MSOfficePluginImpl::Screening
+MSOfficePluginImpl::ScreenFile(const wxString& path, wxArrayString& refused, JobItemArray& items) {
+    const auto refuse = [&](ResultCode code) {
+        refused.Add(wxFileName(path).GetFullPath());
+        m_lastResult = code;
+    };
+
+    if (path.empty()) {
+        m_lastResult = Result::InputFileNotFound;
+        return Screening::Stop;
+    }
+    if (!IsRepresentableInUtf8(path)) {
+        refuse(Result::InvalidInputFile);
+        return Screening::Stop;
+    }
+    const ScreeningRule* rule = FindScreeningRule(wxFileName(path).GetExt());
+    if (!rule) {
+        refuse(Result::InvalidInputFile);
+        return Screening::GoOn;
+    }
+    const bool isAdmitted = rule->isVersionSufficient
+                                ? rule->isVersionSufficient() && m_printerAvailable
+                                : CanConvert();
+    if (!isAdmitted) {
+        refuse(Result::NotInitialized);
+        return Screening::Stop;
+    }
+
+    m_lastResult = rule->check(path);
+    if (m_lastResult == Result::Success)
+        Accept(path, items);
+    return Screening::GoOn;
+}
+
+void MSOfficePluginImpl::Accept(const wxString& path, JobItemArray& items) {
+    const wxFileName name(path);
+    try {
+        auto item = std::make_unique<JobItem>();
+        GetIdentifier(item->pluginIdentifier);
+        item->fileName = name.GetFullName();
+        item->paths.Add(name.GetFullPath());
+        items.Add(item.get());
+        item.release();               // NOLINT(bugprone-unused-return-value): the array has it now
+    } catch (const std::bad_alloc&) { // NOLINT(bugprone-empty-catch)
+        // This file gets no item; the others need not suffer for it.
+    }
+}
+
+int MSOfficePluginImpl::ScreenFolder(const wxString& folder, wxArrayString& refused,
+                                     JobItemArray& items) {
+    return AtBoundary(Result::Failure, [&]() -> int {
+        wxArrayString files;
+        if (wxDir::Exists(folder))
+            wxDir::GetAllFiles(folder, &files, wxEmptyString, wxDIR_FILES);
+        wxArrayString spare;
+        return ScreenFiles(files, spare, refused, items);
+    });
+}
+
+int MSOfficePluginImpl::ScreenFileList(const wxString& /*folder*/, wxArrayString& refused,
+                                       JobItemArray& items, wxArrayString** files) {
+    return AtBoundary(Result::Failure, [&]() -> int {
+        const wxArrayString copy = **files;
+        wxArrayString spare;
+        return ScreenFiles(copy, spare, refused, items);
+    });
+}

@@ -1,0 +1,48 @@
+#include "plugin/Boundary.h"
+#include "plugin/MSOfficePluginImpl.h"
+#include "plugin/SettingsXml.h"
+
+int MSOfficePluginImpl::ApplySettings(const wxXmlNode* settings) {
+    return AtBoundary(Result::Success, [&] {
+        ReadSettingsXml(settings, m_settings);
+
+        // Asking for a missing key enters it with an empty value: from here on the map, and what
+        // is saved of it, holds every key that the filter knows.
+        const auto isOn = [this](const char* key) { return m_settings[key] == "1"; };
+
+        m_printerName = m_settings["PRINTER"];
+        m_psOutput = isOn("OUTPUTFILETYPEPS");
+        m_distillerProfile = m_settings["SELECTEDDISTILLERPROFILE"];
+
+        PowerPointOptions& options = m_powerPointOptions;
+        options.outputType = m_settings["PRINTOUTPUTTYPE"];
+        options.colour = m_settings["COLOR"];
+        options.slidesPerPage = m_settings["SLIDESPERPAGE"];
+        const bool horizontal = isOn("HANDOUTSHORIZONTAL");
+        const bool vertical = isOn("HANDOUTSVERTICAL");
+        if (horizontal)
+            options.handoutOrder = "1";
+        else if (vertical)
+            options.handoutOrder = "2";
+        options.scaleToFit = isOn("SCALETOFITPAGE");
+        options.frameSlides = isOn("FRAMESLIDES");
+        options.printHiddenSlides = isOn("PRINTHIDDENSLIDES");
+        options.printCommentsAndInkMarkup = isOn("PRINTCOMMENTSANDINKMARKUP");
+        options.highQuality = isOn("HIGHQUALITY");
+        return m_lastResult = Result::Success;
+    });
+}
+
+int MSOfficePluginImpl::LoadSettings(const wxXmlNode* settings) {
+    return AtBoundary(Result::Success, [&] {
+        ReadSettingsXml(settings, m_settings);
+        return m_lastResult = Result::Success;
+    });
+}
+
+int MSOfficePluginImpl::SaveSettings(wxXmlNode* parent) {
+    return AtBoundary(Result::Success, [&] {
+        AppendSettingsXml(parent, m_settings);
+        return m_lastResult = Result::Success;
+    });
+}

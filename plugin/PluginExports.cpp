@@ -1,0 +1,58 @@
+#include "office/AutomationScope.h"
+#include "plugin/Boundary.h"
+#include "plugin/MSOfficePluginImpl.h"
+#include "plugin/PluginIdentity.h"
+#include "plugin/WQPlugin.h"
+
+#include <objbase.h>
+
+#include <memory>
+#include <new>
+
+namespace {
+
+/// There while the module is initialised.
+std::unique_ptr<char> g_moduleToken;
+bool g_comInitialised = false;
+
+} // namespace
+
+void InitializePlugin() {
+    if (g_moduleToken)
+        return;
+    std::unique_ptr<char> token(new (std::nothrow) char{});
+    if (!token)
+        return;
+    g_comInitialised = InitializeMfcAndCom();
+    g_moduleToken = std::move(token);
+}
+
+void UninitializePlugin() {
+    if (!g_moduleToken)
+        return;
+    if (g_comInitialised)
+        CoUninitialize();
+    g_comInitialised = false;
+    g_moduleToken.reset();
+}
+
+void GetPluginInfo(PluginInfo* info) {
+    AtBoundary([info] {
+        info->kind = PluginIdentity::Kind;
+        info->version = PluginIdentity::Version;
+        info->identifier = PluginIdentity::Identifier;
+        info->vendor = PluginIdentity::Vendor;
+        // The four-letter extensions are not announced; screening takes them all the same.
+        for (const char* extension : {"doc", "xls", "ppt", "pps", "pub"})
+            info->extensions.Add(extension);
+    });
+}
+
+WQPlugin* GetPluginInstance(void* /*context*/) {
+    return AtBoundary<WQPlugin*>(nullptr,
+                                 [] { return std::make_unique<MSOfficePluginImpl>().release(); });
+}
+
+void ReleasePluginInstance(WQPlugin* plugin) {
+    const std::unique_ptr<WQPlugin> released(plugin);
+}
