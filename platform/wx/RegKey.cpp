@@ -1,8 +1,7 @@
+#include "platform/win32/text/Environment.h"
 #include "platform/win32/text/Utf16.h"
 
 #include <wx/msw/registry.h>
-
-#include <wx/utils.h>
 
 #include <vector>
 
@@ -71,8 +70,7 @@ bool wxRegKey::Exists() const {
 bool wxRegKey::Open(AccessMode mode) {
     Close();
     const REGSAM access = mode == Read ? KEY_READ : KEY_READ | KEY_WRITE;
-    return m_root &&
-           RegOpenKeyExW(m_root, m_path.wc_str(), 0, access, &m_key) == ERROR_SUCCESS;
+    return m_root && RegOpenKeyExW(m_root, m_path.wc_str(), 0, access, &m_key) == ERROR_SUCCESS;
 }
 
 bool wxRegKey::Create(bool okIfExists) {
@@ -101,8 +99,8 @@ bool wxRegKey::HasValue(const wxString& name) const {
 bool wxRegKey::QueryValue(const wxString& name, wxString& value, bool raw) const {
     DWORD type = REG_NONE;
     DWORD size = 0;
-    if (!OpenForQuery() || RegQueryValueExW(m_key, ValueName(name), nullptr, &type, nullptr,
-                                            &size) != ERROR_SUCCESS)
+    if (!OpenForQuery() ||
+        RegQueryValueExW(m_key, ValueName(name), nullptr, &type, nullptr, &size) != ERROR_SUCCESS)
         return false;
     if (type != REG_SZ && type != REG_EXPAND_SZ)
         return false;
@@ -110,9 +108,8 @@ bool wxRegKey::QueryValue(const wxString& name, wxString& value, bool raw) const
     if (size > 0 && RegQueryValueExW(m_key, ValueName(name), nullptr, nullptr, bytes.data(),
                                      &size) != ERROR_SUCCESS)
         return false;
-    value = win32::FromUtf16Bytes(bytes.data(), size);
-    if (type == REG_EXPAND_SZ && !raw)
-        value = wxExpandEnvVars(value);
+    const std::wstring text = win32::FromUtf16Bytes(bytes.data(), size);
+    value = type == REG_EXPAND_SZ && !raw ? win32::ExpandEnvironment(text) : text;
     return true;
 }
 
@@ -144,8 +141,7 @@ bool wxRegKey::SetValue(const wxString& name, const wxString& value) {
 }
 
 bool wxRegKey::DeleteValue(const wxString& name) {
-    return (IsOpened() || Open(Write)) &&
-           RegDeleteValueW(m_key, ValueName(name)) == ERROR_SUCCESS;
+    return (IsOpened() || Open(Write)) && RegDeleteValueW(m_key, ValueName(name)) == ERROR_SUCCESS;
 }
 
 bool wxRegKey::DeleteSelf() {

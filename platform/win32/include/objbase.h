@@ -2,8 +2,9 @@
 
 // COM: apartments, class objects, in-process servers.
 
-#include <guiddef.h>
 #include <winerror.h>
+
+#include <guiddef.h>
 
 #define STDAPI EXTERN_C HRESULT STDMETHODCALLTYPE
 #define STDMETHODIMP HRESULT STDMETHODCALLTYPE
@@ -51,7 +52,7 @@ enum COINIT : DWORD {
     COINIT_MULTITHREADED = 0x0,
 };
 
-EXTERN_C {
+extern "C" {
 
 HRESULT WINAPI CoInitialize(LPVOID reserved);
 HRESULT WINAPI CoInitializeEx(LPVOID reserved, DWORD model);
@@ -70,7 +71,7 @@ HRESULT WINAPI CoRevokeClassObject(DWORD cookie);
 extern const IID IID_IUnknown;
 extern const IID IID_IClassFactory;
 
-} // EXTERN_C
+} // extern "C"
 
 // What an in-process server exports.
 STDAPI DllGetClassObject(REFCLSID clsid, REFIID iid, LPVOID* object);

@@ -35,7 +35,7 @@ protected:
     ~IStorage() = default;
 };
 
-EXTERN_C {
+extern "C" {
 
 HRESULT WINAPI StgOpenStorage(const WCHAR* fileName, IStorage* priority, DWORD mode, SNB exclude,
                               DWORD reserved, IStorage** storage);
@@ -43,4 +43,4 @@ HRESULT WINAPI StgOpenStorage(const WCHAR* fileName, IStorage* priority, DWORD m
 extern const IID IID_IStream;
 extern const IID IID_IStorage;
 
-} // EXTERN_C
+} // extern "C"

@@ -108,7 +108,7 @@ using LPDISPATCH = IDispatch*;
 #define V_UNKNOWN(v) ((v)->punkVal)
 #define V_VARIANTREF(v) ((v)->pvarVal)
 
-EXTERN_C {
+extern "C" {
 
 BSTR WINAPI SysAllocString(const OLECHAR* text);
 BSTR WINAPI SysAllocStringLen(const OLECHAR* text, UINT length);
@@ -126,4 +126,4 @@ HRESULT WINAPI VariantChangeType(VARIANTARG* target, const VARIANTARG* source, U
 extern const IID IID_IDispatch;
 extern const IID IID_NULL;
 
-} // EXTERN_C
+} // extern "C"

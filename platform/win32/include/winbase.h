@@ -5,7 +5,7 @@
 #include <windef.h>
 #include <winerror.h>
 
-EXTERN_C {
+extern "C" {
 
 // The error of the last call, one per thread.
 DWORD WINAPI GetLastError();
@@ -43,7 +43,7 @@ DWORD WINAPI GetCurrentProcessId();
 void WINAPI Sleep(DWORD milliseconds);
 void WINAPI OutputDebugStringW(LPCWSTR text);
 
-} // EXTERN_C
+} // extern "C"
 
 #define FILE_SHARE_READ 0x00000001U
 #define FILE_SHARE_WRITE 0x00000002U

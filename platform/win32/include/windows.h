@@ -4,7 +4,7 @@
 // under Microsoft's names and in Microsoft's headers, and nothing else. docs/platform.md lists
 // where the behaviour differs from Windows.
 
+#include <winbase.h>
 #include <windef.h>
 #include <winerror.h>
-#include <winbase.h>
 #include <winreg.h>

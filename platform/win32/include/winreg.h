@@ -36,7 +36,7 @@ using LSTATUS = LONG;
 #define REG_MULTI_SZ 7U
 #define REG_QWORD 11U
 
-EXTERN_C {
+extern "C" {
 
 LSTATUS WINAPI RegOpenKeyExW(HKEY key, LPCWSTR subKey, DWORD options, REGSAM access, PHKEY result);
 LSTATUS WINAPI RegCreateKeyExW(HKEY key, LPCWSTR subKey, DWORD reserved, LPWSTR keyClass,
@@ -50,8 +50,7 @@ LSTATUS WINAPI RegSetValueExW(HKEY key, LPCWSTR valueName, DWORD reserved, DWORD
                               const BYTE* data, DWORD dataSize);
 LSTATUS WINAPI RegDeleteValueW(HKEY key, LPCWSTR valueName);
 LSTATUS WINAPI RegDeleteTreeW(HKEY key, LPCWSTR subKey);
-LSTATUS WINAPI RegEnumKeyExW(HKEY key, DWORD index, LPWSTR name, LPDWORD nameSize,
-                             LPDWORD reserved, LPWSTR keyClass, LPDWORD keyClassSize,
-                             PFILETIME lastWriteTime);
+LSTATUS WINAPI RegEnumKeyExW(HKEY key, DWORD index, LPWSTR name, LPDWORD nameSize, LPDWORD reserved,
+                             LPWSTR keyClass, LPDWORD keyClassSize, PFILETIME lastWriteTime);
 
-} // EXTERN_C
+} // extern "C"

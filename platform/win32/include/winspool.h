@@ -66,7 +66,7 @@ using LPPRINTER_DEFAULTSW = PRINTER_DEFAULTSW*;
 #define PRINTER_ALL_ACCESS                                                                         \
     (STANDARD_RIGHTS_REQUIRED | PRINTER_ACCESS_ADMINISTER | PRINTER_ACCESS_USE)
 
-EXTERN_C {
+extern "C" {
 
 BOOL WINAPI EnumPrintersW(DWORD flags, LPWSTR name, DWORD level, LPBYTE printers, DWORD size,
                           LPDWORD needed, LPDWORD returned);
@@ -79,4 +79,4 @@ BOOL WINAPI DeletePrinterDriverW(LPWSTR name, LPWSTR environment, LPWSTR driverN
 HANDLE WINAPI AddPrinterW(LPWSTR name, DWORD level, LPBYTE printer);
 BOOL WINAPI DeletePrinter(HANDLE printer);
 
-} // EXTERN_C
+} // extern "C"

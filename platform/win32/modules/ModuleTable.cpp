@@ -1,0 +1,96 @@
+#include "platform/win32/modules/ModuleTable.h"
+
+#include <dlfcn.h>
+#include <link.h>
+
+#include <filesystem>
+
+namespace win32 {
+
+ModuleTable& ModuleTable::Instance() {
+    static ModuleTable table;
+    return table;
+}
+
+HMODULE ModuleTable::Enter(void* loaded, const std::string& path, bool addReference) {
+    const auto module = static_cast<HMODULE>(loaded);
+    Entry& entry = m_modules.try_emplace(module, Entry{path, 0}).first->second;
+    if (addReference)
+        ++entry.references;
+    return module;
+}
+
+HMODULE ModuleTable::Load(const std::string& path, std::string& reason) {
+    const std::lock_guard lock(m_mutex);
+    void* loaded = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL);
+    if (!loaded) {
+        const char* message = dlerror();
+        reason = message ? message : "unknown reason";
+        return nullptr;
+    }
+    return Enter(loaded, path, true);
+}
+
+HMODULE ModuleTable::FindLoaded(const std::string& path) {
+    const std::lock_guard lock(m_mutex);
+    void* loaded = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL | RTLD_NOLOAD);
+    if (!loaded)
+        return nullptr;
+    dlclose(loaded); // it stays: somebody else loaded it
+    return Enter(loaded, path, false);
+}
+
+HMODULE ModuleTable::FindByAddress(const void* address, bool addReference) {
+    Dl_info info{};
+    void* found = nullptr;
+    if (dladdr1(address, &info, &found, RTLD_DL_LINKMAP) == 0 || !found)
+        return nullptr;
+    const auto* map = static_cast<const link_map*>(found);
+    const std::string path = *map->l_name ? map->l_name : ProgramPath();
+    const std::lock_guard lock(m_mutex);
+    if (addReference && *map->l_name)
+        found = dlopen(map->l_name, RTLD_NOW | RTLD_LOCAL | RTLD_NOLOAD);
+    return found ? Enter(found, path, addReference && *map->l_name) : nullptr;
+}
+
+HMODULE ModuleTable::Program() {
+    const std::lock_guard lock(m_mutex);
+    void* program = dlopen(nullptr, RTLD_NOW | RTLD_NOLOAD);
+    return Enter(program, ProgramPath(), false);
+}
+
+std::optional<std::string> ModuleTable::PathOf(HMODULE module) {
+    const std::lock_guard lock(m_mutex);
+    const auto found = m_modules.find(module);
+    if (found == m_modules.end())
+        return std::nullopt;
+    return found->second.path;
+}
+
+bool ModuleTable::Release(HMODULE module) {
+    const std::lock_guard lock(m_mutex);
+    const auto found = m_modules.find(module);
+    if (found == m_modules.end())
+        return false;
+    Entry& entry = found->second;
+    if (entry.references == 0)
+        return true;
+    const bool last = --entry.references == 0;
+    const std::string path = entry.path;
+    dlclose(module);
+    if (last) {
+        void* left = dlopen(path.c_str(), RTLD_NOW | RTLD_LOCAL | RTLD_NOLOAD);
+        if (left)
+            dlclose(left);
+        else
+            m_modules.erase(found);
+    }
+    return true;
+}
+
+std::string ProgramPath() {
+    std::error_code error;
+    return std::filesystem::read_symlink("/proc/self/exe", error).string();
+}
+
+} // namespace win32
