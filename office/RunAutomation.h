@@ -18,3 +18,12 @@ bool RunAutomation(Steps&& steps) noexcept {
     }
     return false;
 }
+
+/// Tells an application to quit that failed half-way; it may be past listening.
+template <typename Application>
+void QuitAfterFailure(Application& application) noexcept {
+    RunAutomation([&] {
+        application.Quit();
+        return true;
+    });
+}

@@ -48,8 +48,10 @@ private:
     void FindPrinter();
     Screening ScreenFile(const wxString& path, wxArrayString& refused, JobItemArray& items);
     void Accept(const wxString& path, JobItemArray& items);
-    ResultCode PrintDocument(const wxFileName& input, const wxString& outputFolder,
+    ResultCode PrintDocument(const wxFileName& document, const wxString& outputFolder,
                              wxString& outputName, ProgressSink* progress);
+    ResultCode DistillDocument(const wxFileName& document, const wxString& outputFolder,
+                               wxString& outputName);
 
     bool m_printerAvailable = true;
     bool m_currentServer = false;

@@ -15,7 +15,6 @@ constexpr ResultCode Success = 0;
 constexpr ResultCode Failure = -1;
 
 constexpr ResultCode InputFileNotFound = -1002;
-constexpr ResultCode ConversionFailed = -1003;
 constexpr ResultCode InvalidInputFile = -1005;
 constexpr ResultCode NotInitialized = -1006;
 constexpr ResultCode PdfConversionFailed = -1007;

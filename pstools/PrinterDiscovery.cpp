@@ -2,6 +2,7 @@
 
 #include "common/UniqueHandle.h"
 
+#include <windows.h>
 #include <winspool.h>
 
 #include <wchar.h>

@@ -11,6 +11,9 @@ class Workbook : public DispatchWrapper {
 public:
     using DispatchWrapper::DispatchWrapper;
 
+    void PrintOut(const VARIANT* from, const VARIANT* to, const VARIANT* copies,
+                  const VARIANT* preview, const VARIANT* activePrinter, const VARIANT* printToFile,
+                  const VARIANT* collate, const VARIANT* prToFileName);
     void Close(const VARIANT* saveChanges, const VARIANT* fileName, const VARIANT* routeWorkbook);
 };
 

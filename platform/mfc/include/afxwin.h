@@ -49,6 +49,18 @@ class AFX_MODULE_STATE {};
 /// The state of the module whose code runs on this thread; the host's unless it was switched.
 AFX_MODULE_STATE* AfxGetModuleState();
 
+#ifdef __ELF__
+#    define AFX_PER_MODULE __attribute__((visibility("hidden")))
+#else
+#    define AFX_PER_MODULE
+#endif
+
+/// The state of the module that the caller is linked into.
+AFX_PER_MODULE inline AFX_MODULE_STATE* AfxGetStaticModuleState() {
+    static AFX_MODULE_STATE state;
+    return &state;
+}
+
 /// Makes `state` the thread's module state and answers the one before.
 AFX_MODULE_STATE* AfxSetModuleState(AFX_MODULE_STATE* state) noexcept;
 

@@ -1,0 +1,17 @@
+#pragma once
+
+#include "plugin/ProgressSink.h"
+#include "plugin/ResultCodes.h"
+
+#include <wx/string.h>
+
+/// Prints a publication into a PostScript file through Publisher.
+/// @param inputPath the publication's full path
+/// @param outputFolder where the PostScript file goes; no separator at its end
+/// @param psFileName receives that file's name, whatever the result, unless `inputPath` is empty
+/// @param progress receives the publication's base name and a percentage; may be null
+/// @param printer the user's printer, used when there is no Distiller printer; not null
+/// @return 0, -1002, -1010, 1015, 1019, 1020, 1021, 1022 or 1023
+ResultCode PrintPublisherDocument(const wxString& inputPath, const wxString& outputFolder,
+                                  wxString& psFileName, ProgressSink* progress,
+                                  const wxString* printer);

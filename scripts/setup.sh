@@ -1,0 +1,75 @@
+# What the scripts share: the packages that the project needs, and how it is built.
+# Sourced by run and test; expects $project, the checkout's folder.
+
+# One line a package. Where several serve, they stand on one line with a bar between them; the last
+# one is installed when none is there.
+build_packages=(
+    g++ cmake ninja-build ccache pkg-config
+    libwxgtk3.2-dev libgsf-1-dev libcups2-dev libexpat1-dev
+    libpoppler-glib-dev libcairo2-dev
+    libcli11-dev nlohmann-json3-dev
+    libgtest-dev libgmock-dev libbenchmark-dev
+)
+run_packages=(
+    'libreoffice-writer|libreoffice-writer-nogui'
+    'libreoffice-calc|libreoffice-calc-nogui'
+    'libreoffice-impress|libreoffice-impress-nogui'
+    'libreoffice-draw|libreoffice-draw-nogui'
+    ghostscript
+    fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
+)
+test_packages=(poppler-utils)
+lint_packages=(clang-format clang-tidy)
+
+fail() {
+    printf '%s\n' "$*" >&2
+    exit 2
+}
+
+# Installs those of the packages given that are not there. Says nothing when all are.
+ensure_packages() {
+    local wanted missing=() installed alternative
+    installed=" $(dpkg-query -W -f '${db:Status-Abbrev}${Package} ' 2>/dev/null) "
+    for wanted in "$@"; do
+        for alternative in ${wanted//|/ }; do
+            [[ $installed == *" ii $alternative "* || $installed == *" hi $alternative "* ]] && continue 2
+        done
+        missing+=("${wanted##*|}")
+    done
+    ((${#missing[@]})) || return 0
+
+    local as_root=()
+    if ((EUID != 0)); then
+        command -v sudo >/dev/null || fail "These packages are missing: ${missing[*]}
+Install them as root: apt-get install --no-install-recommends ${missing[*]}"
+        as_root=(sudo)
+    fi
+    printf 'Installing %s\n' "${missing[*]}" >&2
+    {
+        "${as_root[@]}" apt-get -q update &&
+            "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
+                apt-get -qy install --no-install-recommends "${missing[@]}"
+    } >&2 || fail "The packages could not be installed. Install them by hand: ${missing[*]}"
+}
+
+# Builds a target of a preset, one builder at a time; quiet unless it fails.
+# build PRESET TARGET
+build() {
+    local preset=$1 target=$2 folder="$project/build/$1" log
+    log="$folder/build.log"
+    mkdir -p "$folder" && [[ -w $folder ]] ||
+        fail "$folder cannot be written to. It may belong to another user: remove it, or run as that user."
+    exec 9>"$folder/.lock"
+    flock 9
+    if [[ ! -f $folder/build.ninja ]]; then
+        printf 'Building in %s; the first time takes a few minutes.\n' "$folder" >&2
+        (cd "$project" && cmake --preset "$preset") >"$log" 2>&1 || show_failure "$log"
+    fi
+    cmake --build "$folder" --target "$target" >"$log" 2>&1 || show_failure "$log"
+    flock -u 9
+}
+
+show_failure() {
+    grep -E -A 12 'FAILED|rror:|CMake Error' "$1" | head -n 60 >&2
+    fail "The build failed; all of its output is in $1."
+}

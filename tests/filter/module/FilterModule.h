@@ -1,0 +1,49 @@
+#pragma once
+
+#include "common/LoadedModule.h"
+#include "plugin/WQPlugin.h"
+
+/// The built filter module, loaded as the host loads it.
+class FilterModule {
+    LoadedModule m_module;
+
+public:
+    FilterModule();
+
+    decltype(&::InitializePlugin) InitializePlugin;
+    decltype(&::GetPluginInfo) GetPluginInfo;
+    decltype(&::GetPluginInstance) GetPluginInstance;
+    decltype(&::ReleasePluginInstance) ReleasePluginInstance;
+    decltype(&::UninitializePlugin) UninitializePlugin;
+};
+
+/// A plug-in object from the initialised module.
+class PluginUnderTest {
+public:
+    PluginUnderTest()
+        : m_plugin((m_module.InitializePlugin(), m_module.GetPluginInstance(nullptr))) {}
+    ~PluginUnderTest() {
+        m_module.ReleasePluginInstance(m_plugin);
+        m_module.UninitializePlugin();
+    }
+    PluginUnderTest(const PluginUnderTest&) = delete;
+    PluginUnderTest& operator=(const PluginUnderTest&) = delete;
+
+    WQPlugin* operator->() const { return m_plugin; }
+
+private:
+    FilterModule m_module;
+    WQPlugin* m_plugin;
+};
+
+/// The items of a screening run; deletes them, as the host does.
+class OwnedItems : public JobItemArray {
+public:
+    OwnedItems() = default;
+    OwnedItems(const OwnedItems&) = delete;
+    OwnedItems& operator=(const OwnedItems&) = delete;
+    ~OwnedItems() {
+        for (JobItem* item : *this)
+            delete item;
+    }
+};

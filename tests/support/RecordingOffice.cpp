@@ -1,0 +1,314 @@
+#include "tests/support/RecordingOffice.h"
+
+#include "tests/support/RegistryText.h"
+
+#include <wx/string.h>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <utility>
+
+struct RecordingOffice::State {
+    std::vector<std::string> journal;
+    std::map<std::pair<std::string, DISPID>, Action> actions;
+    std::size_t liveObjects = 0;
+    bool refusesToStart = false;
+};
+
+namespace {
+
+struct Application {
+    const wchar_t* progId;
+    const char* object;
+    CLSID clsid;
+};
+
+const Application Applications[] = {
+    {L"Word.Application",
+     "Word",
+     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x01}}},
+    {L"Excel.Application",
+     "Excel",
+     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x02}}},
+    {L"PowerPoint.Application",
+     "PowerPoint",
+     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x03}}},
+    {L"Publisher.Application",
+     "Publisher",
+     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x04}}},
+};
+
+const Application* FindApplication(const std::wstring& progId) {
+    const auto* found =
+        std::find_if(std::begin(Applications), std::end(Applications),
+                     [&](const Application& application) { return progId == application.progId; });
+    return found == std::end(Applications) ? nullptr : found;
+}
+
+/// Which object a member answers; every other member answers nothing.
+struct AnsweredObject {
+    const char* object;
+    DISPID member;
+    WORD kind;
+    const char* answer;
+};
+
+const AnsweredObject AnsweredObjects[] = {
+    {"Word", 6, DISPATCH_PROPERTYGET, "Documents"},
+    {"Documents", 14, DISPATCH_METHOD, "AddedDocument"},
+    {"Documents", 15, DISPATCH_METHOD, "Document"},
+    {"Word", 19, DISPATCH_PROPERTYGET, "Dialogs"},
+    {"Dialogs", 0, DISPATCH_METHOD, "Dialog"},
+    {"Excel", 572, DISPATCH_PROPERTYGET, "Workbooks"},
+    {"Workbooks", 682, DISPATCH_METHOD, "Workbook"},
+    {"PowerPoint", 2001, DISPATCH_PROPERTYGET, "Presentations"},
+    {"Presentations", 2004, DISPATCH_METHOD, "Presentation"},
+    {"Presentation", 2033, DISPATCH_PROPERTYGET, "PrintOptions"},
+    {"Publisher", 38, DISPATCH_METHOD, "Publication"},
+};
+
+std::string Utf8(const wchar_t* text) {
+    return std::string(wxString(text ? text : L"").utf8_str());
+}
+
+std::string Described(const VARIANT& value) {
+    switch (value.vt) {
+    case VT_VARIANT | VT_BYREF:
+        return "&" + Described(*value.pvarVal);
+    case VT_I2:
+        return "I2 " + std::to_string(value.iVal);
+    case VT_I4:
+        return "I4 " + std::to_string(value.lVal);
+    case VT_BOOL:
+        return value.boolVal == VARIANT_TRUE    ? "true"
+               : value.boolVal == VARIANT_FALSE ? "false"
+                                                : "BOOL " + std::to_string(value.boolVal);
+    case VT_BSTR:
+        return '"' + Utf8(value.bstrVal) + '"';
+    case VT_ERROR:
+        return value.scode == DISP_E_PARAMNOTFOUND ? "omitted" : "another error";
+    default:
+        return "type " + std::to_string(value.vt);
+    }
+}
+
+void CollectText(const VARIANT& value, std::vector<std::wstring>& texts) {
+    if (value.vt == (VT_VARIANT | VT_BYREF))
+        CollectText(*value.pvarVal, texts);
+    else if (value.vt == VT_BSTR && value.bstrVal)
+        texts.emplace_back(value.bstrVal);
+}
+
+const char* KindName(WORD flags) {
+    switch (flags) {
+    case DISPATCH_METHOD:
+        return "method";
+    case DISPATCH_PROPERTYGET:
+        return "get";
+    case DISPATCH_PROPERTYPUT:
+        return "put";
+    default:
+        return "another kind";
+    }
+}
+
+using SharedState = std::shared_ptr<RecordingOffice::State>;
+
+/// Counts references; the object goes with its last.
+template <typename Interface>
+class Counted : public Interface {
+public:
+    ULONG STDMETHODCALLTYPE AddRef() override { return ++m_references; }
+    ULONG STDMETHODCALLTYPE Release() override {
+        const ULONG left = --m_references;
+        if (left == 0)
+            delete this;
+        return left;
+    }
+
+protected:
+    virtual ~Counted() = default;
+
+private:
+    ULONG m_references = 1;
+};
+
+class RecordingObject final : public Counted<IDispatch> {
+public:
+    RecordingObject(std::string name, SharedState state)
+        : m_name(std::move(name)), m_state(std::move(state)) {
+        ++m_state->liveObjects;
+    }
+
+    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) override {
+        if (!IsEqualIID(iid, IID_IUnknown) && !IsEqualIID(iid, IID_IDispatch)) {
+            *object = nullptr;
+            return E_NOINTERFACE;
+        }
+        *object = static_cast<IDispatch*>(this);
+        AddRef();
+        return S_OK;
+    }
+    HRESULT STDMETHODCALLTYPE GetTypeInfoCount(UINT* count) override {
+        *count = 0;
+        return S_OK;
+    }
+    HRESULT STDMETHODCALLTYPE GetTypeInfo(UINT /*index*/, LCID /*locale*/,
+                                          ITypeInfo** /*info*/) override {
+        return E_NOTIMPL;
+    }
+    HRESULT STDMETHODCALLTYPE GetIDsOfNames(REFIID /*reserved*/, LPOLESTR* /*names*/,
+                                            UINT /*count*/, LCID /*locale*/,
+                                            DISPID* /*ids*/) override {
+        return DISP_E_UNKNOWNNAME;
+    }
+    HRESULT STDMETHODCALLTYPE Invoke(DISPID member, REFIID /*reserved*/, LCID /*locale*/,
+                                     WORD flags, DISPPARAMS* arguments, VARIANT* result,
+                                     EXCEPINFO* exception, UINT* /*badArgument*/) override {
+        std::vector<std::wstring> texts;
+        Note(member, flags, *arguments, texts);
+        try {
+            const auto action = m_state->actions.find({m_name, member});
+            if (action != m_state->actions.end())
+                action->second(texts);
+        } catch (const RecordingOffice::Raise& raised) {
+            exception->bstrSource = SysAllocString(L"Recording Office");
+            exception->bstrDescription = SysAllocString(raised.description.c_str());
+            exception->scode = E_FAIL;
+            return DISP_E_EXCEPTION;
+        } catch (const RecordingOffice::Fail& failed) {
+            return failed.result;
+        }
+        Answer(member, flags, result);
+        return S_OK;
+    }
+
+private:
+    ~RecordingObject() override {
+        m_state->journal.push_back("~" + m_name);
+        --m_state->liveObjects;
+    }
+
+    void Note(DISPID member, WORD flags, const DISPPARAMS& arguments,
+              std::vector<std::wstring>& texts) {
+        std::string line = m_name + "." + std::to_string(member) + " " + KindName(flags);
+        if (flags == DISPATCH_PROPERTYPUT &&
+            (arguments.cNamedArgs != 1 || arguments.rgdispidNamedArgs[0] != DISPID_PROPERTYPUT))
+            line += " unnamed";
+        for (UINT i = arguments.cArgs; i-- > 0;) {
+            const VARIANT& value = arguments.rgvarg[i];
+            line += (i + 1 == arguments.cArgs ? " (" : ", ") + Described(value);
+            CollectText(value, texts);
+        }
+        m_state->journal.push_back(line + (arguments.cArgs > 0 ? ")" : ""));
+    }
+
+    void Answer(DISPID member, WORD flags, VARIANT* result) {
+        for (const AnsweredObject& answered : AnsweredObjects) {
+            if (result && m_name == answered.object && member == answered.member &&
+                flags == answered.kind) {
+                result->vt = VT_DISPATCH;
+                result->pdispVal = new RecordingObject(answered.answer, m_state);
+            }
+        }
+    }
+
+    std::string m_name;
+    SharedState m_state;
+};
+
+class RecordingClass final : public Counted<IClassFactory> {
+public:
+    RecordingClass(std::string name, SharedState state)
+        : m_name(std::move(name)), m_state(std::move(state)) {}
+
+    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) override {
+        if (!IsEqualIID(iid, IID_IUnknown) && !IsEqualIID(iid, IID_IClassFactory)) {
+            *object = nullptr;
+            return E_NOINTERFACE;
+        }
+        *object = static_cast<IClassFactory*>(this);
+        AddRef();
+        return S_OK;
+    }
+    HRESULT STDMETHODCALLTYPE CreateInstance(IUnknown* /*outer*/, REFIID iid,
+                                             void** object) override {
+        if (m_state->refusesToStart)
+            return E_FAIL;
+        auto* created = new RecordingObject(m_name, m_state);
+        const HRESULT result = created->QueryInterface(iid, object);
+        created->Release();
+        return result;
+    }
+    HRESULT STDMETHODCALLTYPE LockServer(BOOL /*lock*/) override { return S_OK; }
+
+private:
+    ~RecordingClass() override = default;
+
+    std::string m_name;
+    SharedState m_state;
+};
+
+void EnterProgId(const Application& application, int version) {
+    const std::wstring progId = application.progId;
+    wchar_t clsid[40];
+    StringFromGUID2(application.clsid, clsid, 40);
+    WriteRegistryText(HKEY_CLASSES_ROOT, progId, L"", L"Recording " + progId);
+    WriteRegistryText(HKEY_CLASSES_ROOT, progId + L"\\CLSID", L"", clsid);
+    if (version != 0)
+        WriteRegistryText(HKEY_CLASSES_ROOT, progId + L"\\CurVer", L"",
+                          progId + L"." + std::to_wstring(version));
+}
+
+} // namespace
+
+RecordingOffice::RecordingOffice(const std::vector<std::wstring>& progIds, int version)
+    : m_state(std::make_shared<State>()), m_progIds(progIds) {
+    CoInitialize(nullptr);
+    for (const std::wstring& progId : progIds) {
+        const Application* application = FindApplication(progId);
+        if (!application) {
+            ADD_FAILURE() << "no such application";
+            continue;
+        }
+        EnterProgId(*application, version);
+        DWORD cookie = 0;
+        auto* classObject = new RecordingClass(application->object, m_state);
+        EXPECT_EQ(S_OK, CoRegisterClassObject(application->clsid, classObject, CLSCTX_INPROC_SERVER,
+                                              REGCLS_MULTIPLEUSE, &cookie));
+        classObject->Release();
+        m_cookies.push_back(cookie);
+    }
+}
+
+RecordingOffice::~RecordingOffice() {
+    for (const DWORD cookie : m_cookies)
+        CoRevokeClassObject(cookie);
+    for (const std::wstring& progId : m_progIds)
+        RegDeleteTreeW(HKEY_CLASSES_ROOT, progId.c_str());
+    CoUninitialize();
+}
+
+void RecordingOffice::On(const std::string& object, DISPID member, Action action) {
+    m_state->actions[{object, member}] = std::move(action);
+}
+
+void RecordingOffice::RefuseToStart() {
+    m_state->refusesToStart = true;
+}
+
+const std::vector<std::string>& RecordingOffice::Journal() const {
+    return m_state->journal;
+}
+
+std::vector<std::string> RecordingOffice::JournalInShort() const {
+    std::vector<std::string> lines;
+    for (const std::string& line : m_state->journal)
+        lines.push_back(line.substr(0, line.find(' ')));
+    return lines;
+}
+
+std::size_t RecordingOffice::LiveObjects() const {
+    return m_state->liveObjects;
+}
