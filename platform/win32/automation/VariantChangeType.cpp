@@ -2,6 +2,7 @@
 #include "platform/win32/log/LogSink.h"
 #include "platform/win32/text/CaseFold.h"
 
+#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <limits>
@@ -83,34 +84,34 @@ HRESULT ToBool(const VARIANT& source, VARIANT_BOOL& value) {
     }
     double number = 0;
     const HRESULT read = ToNumber(source, number);
-    value = number != 0 ? VARIANT_TRUE : VARIANT_FALSE;
+    if (SUCCEEDED(read))
+        value = number != 0 ? VARIANT_TRUE : VARIANT_FALSE;
     return read;
 }
 
+std::string RealText(double number) {
+    char text[32] = {};
+    const auto [end, error] =
+        std::to_chars(text, text + sizeof text, number, std::chars_format::general, 15);
+    std::replace(text, end, 'e', 'E');
+    return {text, end};
+}
+
 HRESULT ToText(const VARIANT& source, VARIANT& target) {
-    char text[32];
-    std::to_chars_result written{text, std::errc()};
     switch (source.vt) {
     case VT_EMPTY:
-        break;
+        return AllocateText({}, target);
     case VT_I2:
+        return AllocateText(std::to_string(source.iVal), target);
     case VT_BOOL: // "-1" or "0"
-        written = std::to_chars(text, text + sizeof text, source.iVal);
-        break;
+        return AllocateText(std::to_string(source.boolVal), target);
     case VT_I4:
-        written = std::to_chars(text, text + sizeof text, source.lVal);
-        break;
+        return AllocateText(std::to_string(source.lVal), target);
     case VT_R8:
-        written =
-            std::to_chars(text, text + sizeof text, source.dblVal, std::chars_format::general, 15);
-        break;
+        return AllocateText(RealText(source.dblVal), target);
     default:
         return DISP_E_TYPEMISMATCH;
     }
-    for (char* next = text; next != written.ptr; ++next)
-        if (*next == 'e')
-            *next = 'E';
-    return AllocateText({text, static_cast<std::size_t>(written.ptr - text)}, target);
 }
 
 HRESULT ToObject(const VARIANT& source, REFIID iid, VARIANT& target) {

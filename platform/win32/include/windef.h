@@ -56,9 +56,11 @@ using LPCTSTR = LPCWSTR;
 using HANDLE = void*;
 using LPHANDLE = HANDLE*;
 
+// NOLINTBEGIN(bugprone-macro-parentheses): the arguments are names
 #define DECLARE_HANDLE(name)                                                                       \
     struct name##__;                                                                               \
     using name = name##__*
+// NOLINTEND(bugprone-macro-parentheses)
 
 DECLARE_HANDLE(HINSTANCE);
 DECLARE_HANDLE(HKEY);
@@ -67,7 +69,13 @@ using PHKEY = HKEY*;
 
 using FARPROC = INT_PTR (*)();
 
-#define INVALID_HANDLE_VALUE (reinterpret_cast<HANDLE>(static_cast<INT_PTR>(-1)))
+/// A handle whose value Windows fixes.
+template <typename Handle>
+Handle FixedHandle(INT_PTR value) {
+    return reinterpret_cast<Handle>(value); // NOLINT(performance-no-int-to-ptr)
+}
+
+#define INVALID_HANDLE_VALUE (FixedHandle<HANDLE>(-1))
 
 union LARGE_INTEGER {
     LONGLONG QuadPart;

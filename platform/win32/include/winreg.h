@@ -9,10 +9,10 @@
 using REGSAM = DWORD;
 using LSTATUS = LONG;
 
-#define HKEY_CLASSES_ROOT (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000000U)))
-#define HKEY_CURRENT_USER (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000001U)))
-#define HKEY_LOCAL_MACHINE (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000002U)))
-#define HKEY_USERS (reinterpret_cast<HKEY>(static_cast<ULONG_PTR>(0x80000003U)))
+#define HKEY_CLASSES_ROOT (FixedHandle<HKEY>(0x80000000))
+#define HKEY_CURRENT_USER (FixedHandle<HKEY>(0x80000001))
+#define HKEY_LOCAL_MACHINE (FixedHandle<HKEY>(0x80000002))
+#define HKEY_USERS (FixedHandle<HKEY>(0x80000003))
 
 #define KEY_QUERY_VALUE 0x0001U
 #define KEY_SET_VALUE 0x0002U

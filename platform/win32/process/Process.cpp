@@ -10,7 +10,8 @@ DWORD WINAPI GetCurrentProcessId() {
 }
 
 void WINAPI Sleep(DWORD milliseconds) {
-    do
-        std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
-    while (milliseconds == INFINITE);
+    const auto day = std::chrono::hours(24);
+    while (milliseconds == INFINITE) // NOLINT(bugprone-infinite-loop): that is what it means
+        std::this_thread::sleep_for(day);
+    std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
 }

@@ -49,14 +49,17 @@ std::wstring FromUtf16Bytes(const BYTE* bytes, std::size_t size) {
         return position + 1 < size ? bytes[position] | bytes[position + 1] << 8 : 0;
     };
     std::wstring text;
-    for (std::size_t position = 0; const char32_t unit = unitAt(position); position += 2) {
+    std::size_t position = 0;
+    while (unitAt(position) != 0) {
+        const char32_t unit = unitAt(position);
         const char32_t next = unitAt(position + 2);
         if (IsHighSurrogate(unit) && IsLowSurrogate(next)) {
             text += static_cast<wchar_t>(FirstSupplementary + ((unit - 0xD800) << 10) +
                                          (next - 0xDC00));
-            position += 2;
+            position += 4;
         } else {
             text += static_cast<wchar_t>(unit); // half a pair stays what it is, as on Windows
+            position += 2;
         }
     }
     return text;

@@ -31,8 +31,8 @@ std::optional<std::string> ToUtf8(std::wstring_view text) {
 std::string ToReadableUtf8(std::wstring_view text) {
     std::string utf8;
     for (const wchar_t character : text) {
-        const auto point = static_cast<gunichar>(character);
-        AppendCharacter(utf8, g_unichar_validate(point) ? point : ReplacementCharacter);
+        const bool isValid = g_unichar_validate(static_cast<gunichar>(character));
+        AppendCharacter(utf8, isValid ? static_cast<gunichar>(character) : ReplacementCharacter);
     }
     return utf8;
 }
@@ -40,10 +40,10 @@ std::string ToReadableUtf8(std::wstring_view text) {
 std::wstring FromUtf8(std::string_view text) {
     const std::unique_ptr<char, decltype(&g_free)> valid(
         g_utf8_make_valid(text.data(), static_cast<gssize>(text.size())), g_free);
-    std::wstring wide;
-    for (const char* next = valid.get(); *next; next = g_utf8_next_char(next))
-        wide += static_cast<wchar_t>(g_utf8_get_char(next));
-    return wide;
+    glong length = 0;
+    const std::unique_ptr<gunichar, decltype(&g_free)> characters(
+        g_utf8_to_ucs4_fast(valid.get(), -1, &length), g_free);
+    return {characters.get(), characters.get() + length};
 }
 
 } // namespace win32
