@@ -1,5 +1,4 @@
 #include "common/WQServices.h"
-
 #include "host/services/Log.h"
 #include "host/services/OneLine.h"
 

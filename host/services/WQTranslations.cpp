@@ -11,32 +11,56 @@
 #include <vector>
 
 struct WQTranslations::Catalogues {
-    std::vector<std::unique_ptr<wxMsgCatalog>> languages;
+    std::vector<std::unique_ptr<wxTranslations>> languages;
 };
 
 namespace {
 
+constexpr const char* Domain = "quillon";
 constexpr wxFileOffset LargestCatalogue = 16 * 1024 * 1024;
 
 wxString DefaultFolder() {
     return wxFileName(wxStandardPaths::Get().GetExecutablePath()).GetPathWithSep() + "locale";
 }
 
-/// @return null when the file is no catalogue; the log then says so
-std::unique_ptr<wxMsgCatalog> ReadCatalogue(const wxString& path) {
-    const wxLogNull quiet; // the record below says it once, and where
+/// @return null when the file is no catalogue; goes to a wxTranslations, which alone can delete it
+wxMsgCatalog* ReadCatalogue(const wxString& path) {
+    const wxLogNull quiet; // the caller says it once, and where
     wxFile file(path);
     const wxFileOffset size = file.IsOpened() ? file.Length() : wxInvalidOffset;
-    std::unique_ptr<wxMsgCatalog> catalogue;
-    if (size > 0 && size <= LargestCatalogue) {
-        wxCharBuffer bytes(static_cast<std::size_t>(size));
-        if (file.Read(bytes.data(), bytes.length()) == size)
-            catalogue.reset(wxMsgCatalog::CreateFromData(bytes, "quillon"));
+    if (size <= 0 || size > LargestCatalogue)
+        return nullptr;
+    wxCharBuffer bytes(static_cast<std::size_t>(size));
+    if (file.Read(bytes.data(), bytes.length()) != size)
+        return nullptr;
+    return wxMsgCatalog::CreateFromData(bytes, Domain);
+}
+
+/// Gives a wxTranslations one file, whatever language it asks for.
+class OneFile : public wxTranslationsLoader {
+public:
+    explicit OneFile(wxString path) : m_path(std::move(path)) {}
+
+    wxMsgCatalog* LoadCatalog(const wxString& /*domain*/, const wxString& /*language*/) override {
+        return ReadCatalogue(m_path);
     }
-    if (!catalogue)
-        SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-            << "The translation catalogue " << path << " is broken and not used.";
-    return catalogue;
+
+    wxArrayString GetAvailableTranslations(const wxString& /*domain*/) const override { return {}; }
+
+private:
+    wxString m_path;
+};
+
+/// @return null when the file is no catalogue; the log then says so
+std::unique_ptr<wxTranslations> LoadLanguage(const wxString& path) {
+    auto language = std::make_unique<wxTranslations>();
+    language->SetLoader(new OneFile(path)); // owned by it
+    language->SetLanguage("x");             // its name does not matter to a loader of one file
+    if (language->AddCatalog(Domain))
+        return language;
+    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+        << "The translation catalogue " << path << " is broken and not used.";
+    return nullptr;
 }
 
 wxArrayString LanguagesIn(const wxString& folder) {
@@ -72,8 +96,8 @@ void WQTranslations::ReadFolder(const wxString& folder) {
                               wxFileName::GetPathSeparator() + "quillon.mo";
         if (!wxFileExists(path))
             continue;
-        if (auto catalogue = ReadCatalogue(path))
-            m_catalogues->languages.push_back(std::move(catalogue));
+        if (auto loaded = LoadLanguage(path))
+            m_catalogues->languages.push_back(std::move(loaded));
     }
 }
 
@@ -82,8 +106,8 @@ wxArrayString WQTranslations::GetTranslations(const wxString& key) const {
     texts.Add(key);
     if (key.empty()) // that is where a catalogue keeps its header
         return texts;
-    for (const auto& catalogue : m_catalogues->languages) {
-        const wxString* text = catalogue->GetString(key);
+    for (const auto& language : m_catalogues->languages) {
+        const wxString* text = language->GetTranslatedString(key);
         if (text && !text->empty() && texts.Index(*text) == wxNOT_FOUND)
             texts.Add(*text);
     }

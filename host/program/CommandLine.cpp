@@ -1,0 +1,149 @@
+#include "host/program/CommandLine.h"
+
+#include "host/program/ExitCode.h"
+#include "host/program/SettingsKeys.h"
+
+#include <CLI/CLI.hpp>
+#include <iomanip>
+#include <iostream>
+#include <sstream>
+
+namespace {
+
+constexpr unsigned LongestSeconds = 24 * 60 * 60;
+
+constexpr const char* Description =
+    "quillon converts Office documents (doc docx xls xlsx ppt pptx pps ppsx pub) into files\n"
+    "ready for print.\n";
+
+constexpr const char* Notes = R"(
+Files and folders
+  A PATH may be a file or a folder, which means the files directly in it; in a folder, files that
+  no filter takes are skipped. DIR is created if only itself is missing.
+  An output has the name of its document: letter.docx becomes letter.ps, in place of an older
+  letter.ps. When two documents of one run have the same name, budget.doc and budget.xls, the
+  second keeps its ending: budget.ps and budget.xls.ps; a third becomes budget.xls (2).ps.
+  An output appears in DIR whole or not at all; a hidden folder .quillon-… that a killed run has
+  left there can be deleted.
+  Put -- in front of names that begin with a dash.
+
+Settings
+  A settings file is XML with an element UI that has one element for each setting. A --set goes
+  before the file, --printer before both. Without OUTPUTFILETYPEPS the output is PostScript;
+  without PRINTER, the Distiller printer is used or else the program's own file printer.
+)";
+
+constexpr const char* ExitCodes = R"(
+Exit codes
+  0  done; for status: ready to convert
+  1  some documents were refused or could not be converted
+  2  the machine is at fault: no Office application, no printer, no filter, a full disk
+  3  wrong usage: the command line, the settings file or the output folder
+  4  interrupted: Ctrl-C, or a request to end, came before all was done. The document under way
+     is finished first; a second Ctrl-C ends the program at once
+
+Output
+  One line for each file when it is done: input, output, state, result code, its text, seconds.
+  With --json, JSON Lines on stdout: records of "type" filter, application, engine, printer,
+  missing, document, summary and error; lines for people then go to stderr.
+)";
+
+std::string SettingsTable() {
+    std::ostringstream table;
+    for (const SettingsKey& key : KnownSettings())
+        table << "  " << std::left << std::setw(27) << key.name << std::setw(13) << key.values
+              << key.meaning << '\n';
+    return table.str();
+}
+
+void AddPaths(CLI::App& command, CommandLine& line) {
+    // One value at a time: of a longer list CLI11 would take a name like "[draft]" apart.
+    command.add_option("PATH", line.paths, "Files, or folders of files")
+        ->required()
+        ->allow_extra_args(false);
+}
+
+void AddConvert(CLI::App& app, CommandLine& line) {
+    CLI::App* const convert =
+        app.add_subcommand("convert", "Convert documents: quillon convert PATH… --out DIR");
+    AddPaths(*convert, line);
+    convert->add_option("-o,--out", line.out, "The folder for the output")
+        ->required()
+        ->type_name("DIR");
+    convert->add_option("--printer", line.printer, "The printer to print on")->type_name("NAME");
+    convert->add_option("--settings", line.settingsFile, "A file with settings")
+        ->type_name("FILE.xml");
+    convert->add_option("--set", line.settings, "One setting; may be given several times")
+        ->type_name("KEY=VALUE")
+        ->allow_extra_args(false);
+    convert->final_callback([&line] { line.command = Command::Convert; });
+}
+
+void AddCommands(CLI::App& app, CommandLine& line) {
+    app.add_subcommand("status", "Show what there is to convert with, and what is missing")
+        ->final_callback([&line] { line.command = Command::Status; });
+    CLI::App* const screen = app.add_subcommand(
+        "screen", "Show which files can be converted, converting none: quillon screen PATH…");
+    AddPaths(*screen, line);
+    screen->final_callback([&line] { line.command = Command::Screen; });
+    AddConvert(app, line);
+    app.require_subcommand(1);
+    for (CLI::App* const command : app.get_subcommands({}))
+        command->fallthrough();
+}
+
+void AddCommonOptions(CLI::App& app, CommandLine& line) {
+    const CLI::Range seconds(1U, LongestSeconds);
+    app.add_flag("--json", line.json, "Write JSON Lines to stdout, lines for people to stderr");
+    app.add_flag("-v,--verbose", line.verbose, "Show the whole log on stderr, not only warnings");
+    app.add_option("--log", line.logFile, "Append the whole log to a file")->type_name("FILE");
+    app.add_option("--engine-stall", line.stallSeconds,
+                   "How long an Office engine may show no sign of life")
+        ->type_name("SECONDS")
+        ->check(seconds);
+    app.add_option("--engine-limit", line.limitSeconds,
+                   "How long an Office engine may take for a document")
+        ->type_name("SECONDS")
+        ->check(seconds);
+    app.add_option("--filters", line.filtersFolder,
+                   "The folder of filters, if not Filters beside the program")
+        ->type_name("DIR");
+    app.add_option("--stand-ins", line.standInsFolder,
+                   "The folder of Office stand-ins, if not StandIns beside the program")
+        ->type_name("DIR");
+}
+
+/// CLI11 shows the help of the one command that was given; ours is one text, and says it all.
+std::string HelpOf(CLI::App& app) {
+    app.clear();
+    return app.help("", CLI::AppFormatMode::All);
+}
+
+} // namespace
+
+std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, int& exitCode) {
+    CommandLine line;
+    CLI::App app(Description, "quillon");
+    app.set_help_flag("-h,--help", "Print this help");
+    app.footer(Notes + SettingsTable() + ExitCodes);
+    AddCommonOptions(app, line);
+    AddCommands(app, line);
+    for (CLI::App* const command : app.get_subcommands({}))
+        command->set_help_flag();
+    try {
+        if (argc < 2)
+            throw CLI::RequiredError("A command");
+        app.parse(argc, argv);
+        return line;
+    } catch (const CLI::CallForHelp&) {
+        std::cout << HelpOf(app) << std::flush;
+        exitCode = static_cast<int>(ExitCode::Done);
+    } catch (const CLI::ParseError& error) {
+        exitCode = static_cast<int>(ExitCode::WrongUsage);
+        if (argc < 2)
+            std::cerr << HelpOf(app) << std::flush;
+        else
+            std::cerr << "quillon: " << error.what() << "\nSee quillon --help.\n" << std::flush;
+    }
+    return std::nullopt;
+}

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <optional>
+#include <string>
+#include <vector>
+
+enum class Command { Status, Screen, Convert };
+
+/// What the command line asks for. Texts and paths are as they were given.
+struct CommandLine {
+    Command command = Command::Status;
+    std::vector<std::string> paths; ///< of screen and convert
+
+    std::string out;
+    std::optional<std::string> printer;
+    std::optional<std::string> settingsFile;
+    std::vector<std::string> settings; ///< KEY=VALUE
+
+    bool json = false;
+    bool verbose = false;
+    std::optional<std::string> logFile;
+    std::optional<unsigned> stallSeconds;
+    std::optional<unsigned> limitSeconds;
+    std::optional<std::string> filtersFolder;
+    std::optional<std::string> standInsFolder;
+};
+
+/// Reads the command line; answers a question for help, or a mistake, itself.
+/// @param exitCode receives the code to end with when there is no result
+/// @return nothing when there is no command to run
+std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, int& exitCode);

@@ -1,0 +1,94 @@
+#include "host/program/Conversion.h"
+
+#include "host/program/PathText.h"
+#include "host/program/Progress.h"
+#include "host/program/Workplace.h"
+#include "plugin/ResultCodes.h"
+
+#include <wx/filename.h>
+
+#include <chrono>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+/// The shared table's code for a failure that no filter is to blame for.
+constexpr int ConversionFailed = -1003;
+
+void Fail(int code, const wxString& reason, const Filter& filter, Outcome& outcome) {
+    outcome.state = State::Failed;
+    outcome.code = code;
+    outcome.text = filter.ErrorText(code);
+    outcome.reason = reason;
+    outcome.machineAtFault = IsMachineCode(code);
+}
+
+/// What the host can see of why the filter failed.
+void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
+    if (outcome.machineAtFault) {
+        outcome.reason = MachineReason();
+    } else if (outputFolder.IsFull()) {
+        outcome.reason = "there is no space left for the output or for temporary files";
+        outcome.machineAtFault = true;
+    } else if (outcome.code == Result::PrintFailed) {
+        outcome.reason = "its application could not open or print it: it may be damaged or "
+                         "protected; --log FILE notes more";
+    }
+}
+
+/// Moves the output, and what else the filter has made of the document, to the output folder.
+/// @return whether the output is there
+bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wxString& baseName,
+                wxString& fault) {
+    const wxString ownBase = wxFileName(outputName).GetName();
+    std::error_code error;
+    for (const auto& entry : fs::directory_iterator(workplace.Path(), error)) {
+        const wxString name = ToText(entry.path().filename()).value_or(wxString());
+        wxString ending;
+        wxString ignored;
+        if (name != outputName && name.StartsWith(ownBase + '.', &ending))
+            workplace.Deliver(name, baseName + '.' + ending, ignored);
+    }
+    return workplace.Deliver(outputName, baseName + '.' + wxFileName(outputName).GetExt(), fault);
+}
+
+/// Runs the filter in the workplace and takes over what it made.
+void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const wxString& baseName,
+               Reporter& reporter, Outcome& outcome) {
+    Progress progress(reporter, Shown(outcome.input.filename()));
+    wxString outputName;
+    const int code = screened.filter->Convert(
+        *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
+    if (code != Result::Success)
+        return Fail(code, {}, *screened.filter, outcome);
+    std::error_code error;
+    if (!fs::is_regular_file(workplace.Path() / FromText(outputName), error))
+        return Fail(Result::OutputFileNotFound, "the filter reported success", *screened.filter,
+                    outcome);
+    wxString fault;
+    if (!DeliverAll(workplace, outputName, baseName, fault))
+        return Fail(ConversionFailed, fault, *screened.filter, outcome);
+    outcome.state = State::Converted;
+    outcome.output =
+        workplace.Path().parent_path() / FromText(baseName + '.' + wxFileName(outputName).GetExt());
+}
+
+} // namespace
+
+Outcome Convert(const ScreenedInput& screened, const OutputFolder& outputFolder,
+                const wxString& baseName, Reporter& reporter) {
+    Outcome outcome = screened.outcome;
+    const auto start = std::chrono::steady_clock::now();
+    wxString fault;
+    const std::optional<Workplace> workplace = Workplace::Create(outputFolder.Path(), fault);
+    if (workplace)
+        RunFilter(screened, *workplace, baseName, reporter, outcome);
+    else
+        Fail(ConversionFailed, fault, *screened.filter, outcome);
+    if (outcome.state == State::Failed && outcome.reason.empty())
+        Explain(outputFolder, outcome);
+    outcome.seconds =
+        std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+    return outcome;
+}

@@ -1,0 +1,65 @@
+#include "host/program/Filter.h"
+
+#include "common/WQServices.h"
+#include "host/program/ServerInformation.h"
+#include "plugin/ResultCodes.h"
+
+#include <algorithm>
+
+std::unique_ptr<Filter> Filter::Start(std::unique_ptr<FilterModule> module) {
+    PluginInfo info = module->Describe();
+    WQPlugin* const plugin = module->NewInstance();
+    if (!plugin) {
+        SetLevelAndGetLogger(LevelError, __FILE__, __func__, __LINE__)
+            << "The filter " << info.identifier << " could not make a plug-in object";
+        return nullptr;
+    }
+    return std::unique_ptr<Filter>(new Filter(std::move(module), plugin, std::move(info)));
+}
+
+Filter::Filter(std::unique_ptr<FilterModule> module, WQPlugin* plugin, PluginInfo info)
+    : m_module(std::move(module)), m_plugin(plugin), m_info(std::move(info)) {
+    m_plugin->Initialize(ServerInformation());
+}
+
+Filter::~Filter() {
+    m_module->ReleaseInstance(m_plugin);
+}
+
+bool Filter::Claims(const wxString& extension) const {
+    return std::any_of(
+        m_info.extensions.begin(), m_info.extensions.end(), [&extension](const wxString& listed) {
+            return extension.IsSameAs(listed, false) || extension.IsSameAs(listed + 'x', false);
+        });
+}
+
+Filter::Screened Filter::Screen(const wxString& path) {
+    wxArrayString files;
+    files.Add(path);
+    wxArrayString spare;
+    wxArrayString refused;
+    JobItemArray items;
+    Screened screened;
+    screened.code = m_plugin->ScreenFiles(files, spare, refused, items);
+    for (JobItem* item : items) { // one at most, for one file
+        std::unique_ptr<JobItem> owned(item);
+        if (!screened.item)
+            screened.item = std::move(owned);
+    }
+    if (screened.code != Result::Success)
+        screened.item.reset();
+    else if (!screened.item)
+        screened.code = Result::Failure;
+    return screened;
+}
+
+int Filter::Convert(const JobItem& item, const wxString& folder, wxString& outputName,
+                    ProgressSink& progress) {
+    return m_plugin->Convert(nullptr, item, folder, outputName, &progress);
+}
+
+wxString Filter::ErrorText(int code) const {
+    wxString text;
+    m_plugin->GetErrorText(code, text);
+    return text;
+}

@@ -1,0 +1,50 @@
+#pragma once
+
+#include "host/program/FilterModule.h"
+
+#include <memory>
+
+/// A filter at work: one module and one plug-in object of it, initialised.
+class Filter {
+public:
+    /// @return null when the module has no object to give; the log says so
+    static std::unique_ptr<Filter> Start(std::unique_ptr<FilterModule> module);
+
+    ~Filter();
+    Filter(const Filter&) = delete;
+    Filter& operator=(const Filter&) = delete;
+
+    const PluginInfo& Info() const { return m_info; }
+
+    /// Whether files with this extension are the filter's. The description lists the extensions
+    /// of the old formats; the Office Open XML one of each has an x behind it.
+    bool Claims(const wxString& extension) const;
+
+    bool IsReady() const { return m_plugin->IsReady(); }
+
+    void ApplySettings(const wxXmlNode& settings) { m_plugin->ApplySettings(&settings); }
+
+    struct Screened {
+        int code = 0;
+        std::unique_ptr<JobItem> item; ///< null when the file is not accepted
+    };
+    /// One file at a time: the filter tells the code of the last file of a list only, and leaves
+    /// out without a word what fails its document check.
+    /// @param path a full path
+    Screened Screen(const wxString& path);
+
+    /// @param folder no separator at its end
+    /// @param outputName receives the output's file name
+    int Convert(const JobItem& item, const wxString& folder, wxString& outputName,
+                ProgressSink& progress);
+
+    /// The message of a result code, the host's own included.
+    wxString ErrorText(int code) const;
+
+private:
+    Filter(std::unique_ptr<FilterModule> module, WQPlugin* plugin, PluginInfo info);
+
+    std::unique_ptr<FilterModule> m_module;
+    WQPlugin* m_plugin;
+    PluginInfo m_info;
+};

@@ -1,0 +1,103 @@
+#include "host/program/InputCheck.h"
+
+#include "host/program/PathText.h"
+#include "plugin/ResultCodes.h"
+
+#include <wx/filename.h>
+
+#include <cerrno>
+#include <cstring>
+#include <fstream>
+#include <string_view>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+using namespace std::string_view_literals;
+
+wxString Because(const std::error_code& error) {
+    return wxString::FromUTF8(error.message());
+}
+
+wxString KindOf(fs::file_type type) {
+    switch (type) {
+    case fs::file_type::directory:
+        return "a folder that cannot be read";
+    case fs::file_type::fifo:
+        return "a named pipe, not a file";
+    case fs::file_type::socket:
+        return "a socket, not a file";
+    default:
+        return "a device, not a file";
+    }
+}
+
+struct Signature {
+    std::string_view bytes;
+    const char* meaning;
+};
+
+constexpr std::string_view Zip = "PK\x03\x04"sv;
+constexpr std::string_view CompoundFile = "\xD0\xCF\x11\xE0\xA1\xB1\x1A\xE1"sv;
+
+constexpr Signature OtherFiles[] = {
+    {"%PDF-"sv, "it is a PDF file"},
+    {"%!PS"sv, "it is a PostScript file"},
+    {"{\\rtf"sv, "it is a Rich Text file; save it as a Word document"},
+    {"<"sv, "it is a web page or XML text; save it from Office in its own format"},
+    {"\xEF\xBB\xBF<"sv, "it is a web page or XML text; save it from Office in its own format"},
+};
+
+bool BeginsWith(std::string_view text, std::string_view beginning) {
+    return text.substr(0, beginning.size()) == beginning;
+}
+
+std::string FirstBytes(const fs::path& file) {
+    std::ifstream stream(file, std::ios::binary);
+    char bytes[16] = {};
+    stream.read(bytes, sizeof bytes);
+    return {bytes, static_cast<std::size_t>(stream.gcount())};
+}
+
+} // namespace
+
+std::optional<Refusal> CheckInput(const fs::path& file) {
+    if (!ToText(file))
+        return Refusal{Result::InvalidInputFile, "its name is not valid UTF-8 text; rename it"};
+    std::error_code error;
+    const fs::file_status status = fs::status(file, error);
+    if (status.type() == fs::file_type::not_found)
+        return Refusal{Result::InputFileNotFound, "there is no such file"};
+    if (!fs::status_known(status))
+        return Refusal{Result::InputFileNotFound, "it cannot be reached: " + Because(error)};
+    if (!fs::is_regular_file(status))
+        return Refusal{fs::is_directory(status) ? Result::InputFileNotFound
+                                                : Result::InvalidInputFile,
+                       "it is " + KindOf(status.type())};
+    errno = 0;
+    if (!std::ifstream(file, std::ios::binary).is_open())
+        return Refusal{Result::InputFileNotFound,
+                       "it cannot be read: " + Because({errno, std::generic_category()})};
+    if (fs::file_size(file, error) == 0 && !error)
+        return Refusal{Result::InvalidInputFile, "the file is empty"};
+    return std::nullopt;
+}
+
+wxString DescribeInvalid(const fs::path& file) {
+    const std::string beginning = FirstBytes(file);
+    const wxString extension = wxFileName(ToText(file).value_or(wxString())).GetExt().Lower();
+    const bool openXml = extension.EndsWith("x");
+    if (BeginsWith(beginning, Zip))
+        return openXml ? "it is damaged, or no ." + extension + " document inside"
+                       : wxString::Format("it is a ZIP package: probably a .%sx renamed to .%s",
+                                          extension, extension);
+    if (BeginsWith(beginning, CompoundFile))
+        return openXml
+                   ? "it is protected by a password, or an older document renamed to ." + extension
+                   : "it is damaged, or a document of another application than ." + extension;
+    for (const Signature& other : OtherFiles)
+        if (BeginsWith(beginning, other.bytes))
+            return other.meaning;
+    return "its content is not an Office document";
+}

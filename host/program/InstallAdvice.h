@@ -1,0 +1,8 @@
+#pragma once
+
+#include <wx/string.h>
+
+/// What a user of this system installs to have an Office application's documents converted.
+/// @param progId the application's, for instance "Word.Application"; empty for all of them
+/// @return a sentence
+wxString InstallAdvice(const wxString& progId);

@@ -1,0 +1,52 @@
+#include "host/program/MachineStatus.h"
+
+#include "host/program/InstallAdvice.h"
+#include "host/program/RegistryNames.h"
+
+#include <wx/msw/registry.h>
+
+#include <algorithm>
+
+namespace {
+
+wxString RegisteredText(wxRegKey::StdKey root, const wxString& keyName, const wxString& valueName) {
+    const wxRegKey key(root, keyName);
+    wxString text;
+    if (key.Exists() && key.HasValue(valueName))
+        key.QueryValue(valueName, text);
+    return text;
+}
+
+OfficeApplication LookFor(const wxString& name) {
+    OfficeApplication application;
+    application.name = name;
+    application.progId = name + ".Application";
+    application.installed = wxRegKey(wxRegKey::HKCR, application.progId).Exists();
+    const wxString current =
+        RegisteredText(wxRegKey::HKCR, application.progId + "\\CurVer", wxEmptyString);
+    application.version = current.AfterLast('.'); // Word.Application.16
+    return application;
+}
+
+std::vector<MissingPart> FindMissing(const MachineStatus& status) {
+    std::vector<MissingPart> missing;
+    if (std::none_of(status.applications.begin(), status.applications.end(),
+                     [](const OfficeApplication& application) { return application.installed; }))
+        missing.push_back({"No Office application is installed", InstallAdvice({})});
+    if (!PreferredPrinter(status.printers))
+        missing.push_back({"There is no PostScript printer",
+                           "Install the program anew, which brings one, or add one to the system"});
+    return missing;
+}
+
+} // namespace
+
+MachineStatus LookAtMachine() {
+    MachineStatus status;
+    for (const char* name : {"Word", "Excel", "PowerPoint", "Publisher"})
+        status.applications.push_back(LookFor(name));
+    status.engine = RegisteredText(wxRegKey::HKLM, StandInsKey, EngineValue);
+    status.printers = ListPrinters();
+    status.missing = FindMissing(status);
+    return status;
+}

@@ -1,0 +1,71 @@
+#include "host/program/CommandLine.h"
+#include "host/program/ConvertCommand.h"
+#include "host/program/Interruption.h"
+#include "host/program/LayerLog.h"
+#include "host/program/MachineSetup.h"
+#include "host/program/PathText.h"
+#include "host/program/ProgramFolder.h"
+#include "host/program/ScreenCommand.h"
+#include "host/program/StatusCommand.h"
+#include "host/program/Terminal.h"
+#include "host/program/ToolkitLog.h"
+#include "host/services/Log.h"
+
+#include <wx/init.h>
+
+#include <exception>
+
+namespace {
+
+/// @return whether the log can be kept as asked for
+bool StartLog(const CommandLine& line, Reporter& reporter) {
+    if (line.logFile && !Log::ToFile(FromArgument(*line.logFile))) {
+        reporter.Error("the log file " + Shown(FromArgument(*line.logFile)) +
+                       " cannot be written; choose another one with --log");
+        return false;
+    }
+    if (line.verbose)
+        Log::ToStandardError(LevelInformation);
+    RouteToolkitLog();
+    RouteLayerLog();
+    return true;
+}
+
+std::filesystem::path FolderOr(const std::optional<std::string>& given, const char* standard) {
+    return given ? std::filesystem::absolute(FromArgument(*given)) : ProgramFolder() / standard;
+}
+
+ExitCode Run(const CommandLine& line) {
+    Reporter reporter(line.json);
+    if (!StartLog(line, reporter))
+        return ExitCode::WrongUsage;
+    SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds});
+    const std::filesystem::path filtersFolder = FolderOr(line.filtersFolder, "Filters");
+    switch (line.command) {
+    case Command::Status:
+        return RunStatus(filtersFolder, reporter);
+    case Command::Screen:
+        return RunScreen(line, filtersFolder, reporter);
+    case Command::Convert:
+        return RunConvert(line, filtersFolder, reporter);
+    }
+    return ExitCode::WrongUsage;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    try {
+        UseUtf8();
+        Interruption::Install();
+        int exitCode = 0;
+        const std::optional<CommandLine> line = ReadCommandLine(argc, argv, exitCode);
+        if (!line)
+            return exitCode;
+        const wxInitializer toolkit;
+        return static_cast<int>(toolkit.IsOk() ? Run(*line) : ExitCode::MachineAtFault);
+    } catch (const std::exception& error) { // out of memory, above all
+        std::fprintf(stderr, "quillon: %s\n", error.what());
+        return static_cast<int>(ExitCode::MachineAtFault);
+    }
+}

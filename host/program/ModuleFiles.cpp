@@ -1,0 +1,21 @@
+#include "host/program/ModuleFiles.h"
+
+#include "host/program/PathText.h"
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+
+std::vector<fs::path> ModuleFiles(const fs::path& folder) {
+    std::vector<fs::path> files;
+    std::error_code error;
+    for (fs::directory_iterator entry(folder, error), end; !error && entry != end;
+         entry.increment(error)) {
+        std::error_code unreadable;
+        if (entry->path().extension() == QUILLON_MODULE_SUFFIX &&
+            entry->is_regular_file(unreadable) && ToText(entry->path()))
+            files.push_back(entry->path());
+    }
+    std::sort(files.begin(), files.end());
+    return files;
+}

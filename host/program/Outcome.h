@@ -1,0 +1,48 @@
+#pragma once
+
+#include "host/program/ExitCode.h"
+#include "host/program/Reporter.h"
+
+#include <wx/string.h>
+
+#include <filesystem>
+#include <optional>
+#include <vector>
+
+/// How far a file has come.
+enum class State {
+    Accepted,     ///< by its filter; nothing more was asked for
+    Converted,    ///< its output is there
+    Skipped,      ///< found in a folder, and no filter's business
+    Refused,      ///< is no document that can be converted
+    Failed,       ///< could not be converted
+    NotConverted, ///< its turn did not come
+};
+
+/// What has become of one file.
+struct Outcome {
+    std::filesystem::path input;
+    std::filesystem::path output; ///< empty when there is none
+    State state = State::Accepted;
+    int code = 0;
+    wxString text;                 ///< the code's message
+    wxString reason;               ///< what the host can add for a person; may be empty
+    bool machineAtFault = false;   ///< and not the document
+    std::optional<double> seconds; ///< of the conversion
+};
+
+/// The state's name, as people and records have it.
+const char* NameOf(State state);
+
+/// Whether a result code says that something is missing on the machine.
+bool IsMachineCode(int code);
+
+/// The outcome as a line for people.
+wxString LineOf(const Outcome& outcome);
+
+/// The outcome as a record of type "document".
+Json RecordOf(const Outcome& outcome);
+
+/// The exit code of a command that came to these outcomes: an interruption outweighs a fault of
+/// the machine, and that a document's.
+ExitCode Verdict(const std::vector<Outcome>& outcomes);

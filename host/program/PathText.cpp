@@ -1,0 +1,53 @@
+#include "host/program/PathText.h"
+
+#include "host/services/OneLine.h"
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+bool IsSurrogate(wchar_t c) {
+    return c >= 0xD800 && c <= 0xDFFF;
+}
+
+wxString EscapeBytes(const std::string& bytes) {
+    wxString text;
+    for (const char byte : bytes) {
+        const auto value = static_cast<unsigned char>(byte);
+        if (value >= 0x20 && value < 0x7F)
+            text += byte;
+        else
+            text += wxString::Format("\\x%02x", static_cast<unsigned>(value));
+    }
+    return text;
+}
+
+} // namespace
+
+fs::path FromArgument(const std::string& utf8) {
+    return fs::u8path(utf8);
+}
+
+fs::path FromText(const wxString& text) {
+    return fs::u8path(text.utf8_string());
+}
+
+std::optional<wxString> ToText(const fs::path& path) {
+    const std::string utf8 = path.u8string();
+    wxString text = wxString::FromUTF8(utf8);
+    if (text.empty() && !utf8.empty())
+        return std::nullopt;
+    // Three bytes can spell half a surrogate pair, which the conversion above lets through where
+    // a wchar_t has 32 bits; UTF-8 has no such letters.
+    const std::wstring wide = text.ToStdWstring();
+    if (sizeof(wchar_t) == 4 && std::any_of(wide.begin(), wide.end(), IsSurrogate))
+        return std::nullopt;
+    return text;
+}
+
+wxString Shown(const fs::path& path) {
+    const std::optional<wxString> text = ToText(path);
+    return text ? OneLine(*text) : EscapeBytes(path.u8string());
+}

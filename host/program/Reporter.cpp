@@ -1,0 +1,51 @@
+#include "host/program/Reporter.h"
+
+#include "host/program/Terminal.h"
+#include "host/services/OneLine.h"
+
+namespace {
+
+void Write(std::FILE* stream, const std::string& text) {
+    std::fwrite(text.data(), 1, text.size(), stream);
+    std::fflush(stream);
+}
+
+} // namespace
+
+Reporter::Reporter(bool json)
+    : m_json(json), m_people(json ? stderr : stdout), m_forTerminal(IsTerminal(m_people)) {}
+
+void Reporter::ClearPassing() {
+    if (m_passing)
+        Write(m_people, "\r\x1b[K");
+    m_passing = false;
+}
+
+void Reporter::Line(const wxString& text) {
+    ClearPassing();
+    Write(m_people, text.utf8_string() + '\n');
+}
+
+void Reporter::Passing(const wxString& text) {
+    if (!m_forTerminal)
+        return;
+    Write(m_people, "\r\x1b[K" + text.utf8_string());
+    m_passing = true;
+}
+
+void Reporter::Record(const Json& record) {
+    if (!m_json)
+        return;
+    ClearPassing(); // both streams may show on one terminal
+    Write(stdout, record.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n');
+}
+
+void Reporter::Error(const wxString& text) {
+    ClearPassing();
+    Write(stderr, "quillon: " + OneLine(text).utf8_string() + '\n');
+    Record({{"type", "error"}, {"text", JsonText(text)}});
+}
+
+std::string JsonText(const wxString& text) {
+    return text.utf8_string();
+}

@@ -1,0 +1,42 @@
+#pragma once
+
+#include <wx/string.h>
+
+#include <cstdio>
+#include <nlohmann/json.hpp>
+
+using Json = nlohmann::ordered_json;
+
+/// What the program says: lines for people on stdout; or, if asked for, JSON Lines on stdout and
+/// the lines for people on stderr. Everything is UTF-8 and written out at once.
+class Reporter {
+public:
+    explicit Reporter(bool json);
+
+    /// A line for people.
+    void Line(const wxString& text);
+
+    /// A line that the next one takes the place of. Only for a terminal.
+    void Passing(const wxString& text);
+
+    /// Whether people read at a terminal.
+    bool ForTerminal() const { return m_forTerminal; }
+
+    /// A JSON record, written only if they were asked for.
+    /// @param record has a member "type"
+    void Record(const Json& record);
+
+    /// Why the command ends early: for people on stderr in any case, and as a record.
+    void Error(const wxString& text);
+
+private:
+    void ClearPassing();
+
+    bool m_json;
+    std::FILE* m_people;
+    bool m_forTerminal;
+    bool m_passing = false;
+};
+
+/// A text as JSON takes it.
+std::string JsonText(const wxString& text);

@@ -1,0 +1,20 @@
+#pragma once
+
+#include "host/program/CommandLine.h"
+#include "host/program/ExitCode.h"
+#include "host/program/Settings.h"
+
+#include <wx/string.h>
+
+#include <optional>
+
+/// Why a run cannot begin.
+struct Obstacle {
+    ExitCode exitCode = ExitCode::WrongUsage;
+    wxString text;
+};
+
+/// Puts together the settings of a run: the file's, the command line's in their place, and where
+/// neither says anything, PostScript output on the preferred printer.
+/// @param obstacle receives why there is no result
+std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle);

@@ -1,0 +1,22 @@
+#include "host/program/ScreenCommand.h"
+
+#include "host/program/Interruption.h"
+#include "host/program/Screening.h"
+#include "host/program/Settings.h"
+#include "host/program/Summary.h"
+
+ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                   Reporter& reporter) {
+    FilterSet filters(filtersFolder);
+    const std::vector<Input> inputs = ListInputs(line.paths);
+    if (const auto end = EndIdleRun(filters, inputs, reporter))
+        return *end;
+    filters.ApplySettings(Settings().Node());
+    std::vector<Outcome> outcomes;
+    for (const Input& input : inputs) {
+        outcomes.push_back(Interruption::Requested() ? NotReached(filters, input)
+                                                     : Screen(filters, input).outcome);
+        Tell(outcomes.back(), reporter);
+    }
+    return TellSummary(outcomes, reporter);
+}

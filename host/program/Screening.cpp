@@ -1,0 +1,86 @@
+#include "host/program/Screening.h"
+
+#include "host/program/InputCheck.h"
+#include "host/program/MachineStatus.h"
+#include "host/program/PathText.h"
+#include "plugin/ResultCodes.h"
+
+namespace {
+
+wxString UnclaimedReason(const wxString& extension) {
+    return extension.empty() ? wxString("a name without an ending; no filter takes it")
+                             : "no filter takes files ending in ." + extension;
+}
+
+void Refuse(const FilterSet& filters, const Refusal& refusal, Outcome& outcome) {
+    outcome.state = State::Refused;
+    outcome.code = refusal.code;
+    outcome.text = filters.ErrorText(refusal.code);
+    outcome.reason = refusal.reason;
+    outcome.machineAtFault = IsMachineCode(refusal.code);
+}
+
+wxString ReasonFor(int code, const Input& input) {
+    if (IsMachineCode(code))
+        return MachineReason();
+    return code == Result::InvalidInputFile ? DescribeInvalid(input.full) : wxString();
+}
+
+} // namespace
+
+ScreenedInput Screen(const FilterSet& filters, const Input& input) {
+    ScreenedInput screened;
+    screened.outcome.input = input.given;
+    const wxString extension = ExtensionOf(input);
+    Filter* const filter = filters.Claiming(extension);
+    const std::optional<Refusal> fault =
+        filter || input.named ? CheckInput(input.full) : std::nullopt;
+    if (fault) {
+        Refuse(filters, *fault, screened.outcome);
+    } else if (!filter) {
+        Refuse(filters, {Result::InvalidInputFile, UnclaimedReason(extension)}, screened.outcome);
+        if (!input.named)
+            screened.outcome.state = State::Skipped;
+    } else {
+        Filter::Screened answer = filter->Screen(*ToText(input.full));
+        if (!answer.item) {
+            Refuse(filters, {answer.code, ReasonFor(answer.code, input)}, screened.outcome);
+            return screened;
+        }
+        screened.outcome.text = filter->ErrorText(answer.code);
+        screened.filter = filter;
+        screened.item = std::move(answer.item);
+    }
+    return screened;
+}
+
+Outcome NotReached(const FilterSet& filters, const Input& input) {
+    Outcome outcome;
+    outcome.input = input.given;
+    outcome.state = State::NotConverted;
+    outcome.code = Result::Failure;
+    outcome.text = filters.ErrorText(Result::Failure);
+    outcome.reason = "interrupted before its turn came";
+    return outcome;
+}
+
+wxString MachineReason() {
+    wxString reason;
+    for (const MissingPart& part : LookAtMachine().missing)
+        reason << (reason.empty() ? "" : "; ") << part.what << ". " << part.advice;
+    return reason.empty() ? "its application is missing or too old: see `quillon status`" : reason;
+}
+
+std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
+                                   Reporter& reporter) {
+    if (filters.Filters().empty()) {
+        reporter.Error("no filter could be loaded; `quillon status` shows where they are looked "
+                       "for. Install the program anew");
+        return ExitCode::MachineAtFault;
+    }
+    if (inputs.empty()) {
+        reporter.Line("Nothing to do: there are no files directly in what was named.");
+        return ExitCode::Done;
+    }
+    return std::nullopt;
+}

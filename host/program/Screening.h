@@ -1,0 +1,30 @@
+#pragma once
+
+#include "host/program/FilterSet.h"
+#include "host/program/Inputs.h"
+#include "host/program/Outcome.h"
+
+#include <memory>
+
+/// One file after screening.
+struct ScreenedInput {
+    Outcome outcome;
+    Filter* filter = nullptr;      ///< the one that accepted it
+    std::unique_ptr<JobItem> item; ///< null when no filter did
+};
+
+/// Looks whether the file can be converted, first itself, then by the filter that claims it.
+ScreenedInput Screen(const FilterSet& filters, const Input& input);
+
+/// Says in the outcome that the file's turn did not come.
+Outcome NotReached(const FilterSet& filters, const Input& input);
+
+/// Why something that filters need is missing on this machine, and what to do; for outcomes with
+/// a code of the machine's.
+wxString MachineReason();
+
+/// Ends a run whose filters or arguments leave nothing to do, saying so.
+/// @param inputs what the arguments mean
+/// @return the exit code to end with, or nothing when there is work
+std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
+                                   Reporter& reporter);

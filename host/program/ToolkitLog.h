@@ -1,0 +1,5 @@
+#pragma once
+
+/// Sends what wxWidgets reports, failed assertions included, to the log for the rest of the
+/// process's life.
+void RouteToolkitLog();

@@ -1,0 +1,33 @@
+#pragma once
+
+#include <wx/string.h>
+
+#include <filesystem>
+#include <optional>
+
+/// A hidden folder in the output folder in which one document is converted, so that an output
+/// appears in the output folder whole or not at all. It goes with whatever is left in it.
+class Workplace {
+public:
+    /// @param fault receives why there is none, for people
+    static std::optional<Workplace> Create(const std::filesystem::path& outputFolder,
+                                           wxString& fault);
+
+    Workplace(Workplace&& other) noexcept;
+    Workplace& operator=(Workplace&&) = delete;
+    ~Workplace();
+
+    const std::filesystem::path& Path() const { return m_path; }
+
+    /// Moves a file to the output folder, in place of an older one.
+    /// @param name of the file here
+    /// @param newName of the file there
+    /// @param fault receives why it is not there, for people
+    /// @return whether it is
+    bool Deliver(const wxString& name, const wxString& newName, wxString& fault) const;
+
+private:
+    explicit Workplace(std::filesystem::path path) : m_path(std::move(path)) {}
+
+    std::filesystem::path m_path; ///< empty after a move
+};

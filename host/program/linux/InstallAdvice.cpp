@@ -1,0 +1,25 @@
+#include "host/program/InstallAdvice.h"
+
+namespace {
+
+struct Package {
+    const char* progId;
+    const char* name;
+};
+
+constexpr Package Packages[] = {
+    {"Word.Application", "libreoffice-writer-nogui"},
+    {"Excel.Application", "libreoffice-calc-nogui"},
+    {"PowerPoint.Application", "libreoffice-impress-nogui"},
+    {"Publisher.Application", "libreoffice-draw-nogui"},
+};
+
+} // namespace
+
+wxString InstallAdvice(const wxString& progId) {
+    wxString packages;
+    for (const Package& package : Packages)
+        if (progId.empty() || progId == package.progId)
+            packages << ' ' << package.name;
+    return "Install LibreOffice with: apt-get install" + packages;
+}

@@ -1,0 +1,10 @@
+#include "host/program/LayerLog.h"
+
+#include "common/WQServices.h"
+#include "platform/win32/log/LogSink.h"
+
+void RouteLayerLog() {
+    win32::SetLogSink([](const std::string& record) {
+        SetLevelAndGetLogger(LevelWarning, "win32", "system", 0) << record.c_str();
+    });
+}
