@@ -1,0 +1,16 @@
+#pragma once
+
+#include "standins/office/engine/EngineJob.h"
+#include "standins/office/process/Channel.h"
+
+namespace standins {
+
+/// Does a whole engine run: makes the work folder, copies the document into it, lets LibreOffice
+/// convert it under the two clocks, and clears everything away again; then tells the server, by a
+/// message Done with the PDF attached and the document's SHA-256 as its text, or by a message
+/// Failed with the reason. While it works it sends a message Alive from time to time. When the
+/// server goes, everything ends at once.
+/// @param document open for reading
+void Supervise(const EngineJob& job, int document, const Channel& server);
+
+} // namespace standins

@@ -1,0 +1,50 @@
+// Prints the PDF that it gets as standard input: PostScript on standard output. In a process of
+// its own, since the PDF comes from a document that anybody may have made. What goes wrong is one
+// line on standard error and exit code 1.
+
+#include "standins/office/printer/PostScriptWriter.h"
+
+#include <signal.h>
+#include <sys/prctl.h>
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <CLI/CLI.hpp>
+#include <cstdio>
+
+namespace {
+
+/// Memory for one page at a time is needed, whatever the document asks for.
+void LimitResources() {
+#ifndef __SANITIZE_ADDRESS__ // whose shadow memory takes terabytes of address space
+    constexpr rlim_t MostMemory = rlim_t{4} << 30;
+    const rlimit memory{MostMemory, MostMemory};
+    setrlimit(RLIMIT_AS, &memory);
+#endif
+    const rlimit none{0, 0};
+    setrlimit(RLIMIT_CORE, &none);
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    signal(SIGPIPE, SIG_IGN);               // a failing write says so
+    signal(SIGXFSZ, SIG_IGN);               // likewise
+    prctl(PR_SET_PDEATHSIG, SIGKILL);       // nobody waits for the pages any more
+    close_range(STDERR_FILENO + 1, ~0U, 0); // whatever the host left open
+    LimitResources();
+
+    standins::PrintJob job;
+    CLI::App options("Prints a PDF as PostScript, from standard input to standard output.");
+    options.add_option("--title", job.title, "the document's name");
+    options.add_option("--user", job.user, "for whom it is printed");
+    options.add_option("--copies", job.copies, "how often")->check(CLI::Range(1, 32767));
+    options.add_flag("--collate,!--no-collate", job.collate, "whole copies, one after the other");
+    CLI11_PARSE(options, argc, argv);
+
+    const std::string failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);
+    if (failure.empty())
+        return 0;
+    std::fprintf(stderr, "%s\n", failure.c_str());
+    return 1;
+}

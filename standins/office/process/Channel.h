@@ -1,0 +1,47 @@
+#pragma once
+
+#include "standins/office/process/Descriptor.h"
+
+#include <optional>
+#include <string>
+#include <utility>
+
+namespace standins {
+
+/// What a message tells.
+enum class MessageKind : char {
+    Alive = 'a',  ///< the sender is at work
+    Done = 'd',   ///< the work is done; the text and the attachment are its result
+    Failed = 'f', ///< the work failed; the text says why
+};
+
+struct Message {
+    MessageKind kind = MessageKind::Failed;
+    std::string text; ///< UTF-8
+    Descriptor attachment;
+};
+
+/// One end of a connection between the server and the supervisor of an engine run. Messages arrive
+/// whole. Either side learns at once when the other is gone, however it went.
+class Channel {
+public:
+    explicit Channel(Descriptor socket) : m_socket(std::move(socket)) {}
+
+    /// @return two ends that talk to each other, or nothing when the system has no more descriptors
+    static std::optional<std::pair<Channel, Channel>> MakePair();
+
+    int Socket() const { return m_socket.Get(); }
+
+    /// @param attachment a descriptor that the receiver gets a copy of, or -1
+    /// @return false when the other end is gone
+    bool Send(MessageKind kind, const std::string& text = {}, int attachment = -1) const;
+
+    /// Waits for a message.
+    /// @return nothing when the other end is gone
+    std::optional<Message> Receive() const;
+
+private:
+    Descriptor m_socket;
+};
+
+} // namespace standins

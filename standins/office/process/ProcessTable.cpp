@@ -1,0 +1,128 @@
+#include "standins/office/process/ProcessTable.h"
+
+#include "standins/office/process/FileBytes.h"
+
+#include <signal.h>
+#include <sys/syscall.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cctype>
+#include <cerrno>
+#include <chrono>
+#include <filesystem>
+#include <sstream>
+#include <thread>
+#include <vector>
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+namespace standins {
+
+namespace {
+
+/// A file of the process's folder in /proc; empty when the process has gone.
+std::string ReadProcFile(pid_t process, const char* name) {
+    constexpr std::size_t Longest = 1 << 20;
+    return ReadText("/proc/" + std::to_string(process) + "/" + name, Longest);
+}
+
+std::vector<pid_t> AllProcesses() {
+    std::vector<pid_t> processes;
+    std::error_code error;
+    for (fs::directory_iterator entry("/proc", error), end; !error && entry != end;
+         entry.increment(error)) {
+        const std::string name = entry->path().filename();
+        if (std::isdigit(static_cast<unsigned char>(name[0])))
+            processes.push_back(std::stoi(name));
+    }
+    return processes;
+}
+
+struct ProcessStatus {
+    pid_t parent = 0;
+    pid_t group = 0;
+    std::uint64_t ticks = 0;
+};
+
+ProcessStatus ReadStatus(pid_t process) {
+    const std::string stat = ReadProcFile(process, "stat");
+    const std::size_t afterName = stat.rfind(')'); // the name may hold anything
+    if (afterName == std::string::npos)
+        return {};
+    std::istringstream fields(stat.substr(afterName + 1));
+    ProcessStatus status;
+    std::string skipped;
+    fields >> skipped >> status.parent >> status.group;
+    for (int i = 0; i < 8; ++i) // session … cmajflt
+        fields >> skipped;
+    for (int i = 0; i < 4; ++i) { // utime, stime, cutime, cstime
+        std::uint64_t ticks = 0;
+        fields >> ticks;
+        status.ticks += ticks;
+    }
+    return status;
+}
+
+void KillChildren() {
+    const pid_t self = getpid();
+    for (const pid_t process : AllProcesses()) {
+        if (ReadStatus(process).parent == self)
+            kill(process, SIGKILL);
+    }
+}
+
+std::vector<pid_t> ProcessesAtHome(const std::string& home) {
+    const std::string wanted = '\0' + ("HOME=" + home) + '\0';
+    std::vector<pid_t> found;
+    for (const pid_t process : AllProcesses()) {
+        const std::string environment = '\0' + ReadProcFile(process, "environ");
+        if (environment.find(wanted) != std::string::npos)
+            found.push_back(process);
+    }
+    return found;
+}
+
+} // namespace
+
+Descriptor WatchProcess(pid_t process) {
+    // By its number: this C library's header for it does not suit C++.
+    return Descriptor(static_cast<int>(syscall(SYS_pidfd_open, process, 0)));
+}
+
+std::uint64_t CpuTicksOfGroup(pid_t group) {
+    std::uint64_t sum = 0;
+    for (const pid_t process : AllProcesses()) {
+        const ProcessStatus status = ReadStatus(process);
+        if (status.group == group)
+            sum += status.ticks;
+    }
+    return sum;
+}
+
+void EndChildren() {
+    for (;;) {
+        const pid_t ended = waitpid(-1, nullptr, WNOHANG);
+        if (ended < 0 && errno != EINTR)
+            return;
+        if (ended == 0) {
+            KillChildren();
+            waitpid(-1, nullptr, 0);
+        }
+    }
+}
+
+void EndProcessesAtHome(const std::string& home) {
+    const auto giveUp = std::chrono::steady_clock::now() + 1s;
+    for (;;) {
+        const std::vector<pid_t> processes = ProcessesAtHome(home);
+        for (const pid_t process : processes)
+            kill(process, SIGKILL);
+        if (processes.empty() || std::chrono::steady_clock::now() >= giveUp)
+            return;
+        std::this_thread::sleep_for(5ms);
+    }
+}
+
+} // namespace standins

@@ -1,0 +1,29 @@
+#pragma once
+
+#include "standins/office/process/Descriptor.h"
+
+#include <sys/types.h>
+
+#include <cstdint>
+#include <string>
+
+namespace standins {
+
+/// @return a descriptor that becomes readable when the process ends (a pidfd); closed, with errno
+/// set, when there is none to be had
+Descriptor WatchProcess(pid_t process);
+
+/// The CPU time that the processes of a group, and what they waited for, have used so far.
+/// @return in clock ticks
+std::uint64_t CpuTicksOfGroup(pid_t group);
+
+/// Kills the children of the calling process and waits for them, again and again, until none is
+/// left. Where orphans fall to the caller (PR_SET_CHILD_SUBREAPER) this ends all its descendants,
+/// those that left their process group too.
+void EndChildren();
+
+/// Kills every process of this user whose environment says that `home` is its home folder, and
+/// returns when none is left or after a second (a process that the system itself holds).
+void EndProcessesAtHome(const std::string& home);
+
+} // namespace standins

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <ole2.h>
+
+#include <vector>
+
+namespace standins {
+
+/// An Office application that this module stands in for.
+struct Application {
+    CLSID clsid;           ///< our own, not Office's
+    const wchar_t* progId; ///< without a version: "Word.Application"
+    const wchar_t* title;
+    const char* library;   ///< of LibreOffice's, without which the application cannot be served
+    IDispatch* (*start)(); ///< a new running application
+};
+
+const std::vector<Application>& Applications();
+
+/// The version of Office that the stand-ins say they are, as the last part of a ProgID.
+constexpr const wchar_t* OfficeVersion = L"16";
+
+} // namespace standins

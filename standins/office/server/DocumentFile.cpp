@@ -1,0 +1,43 @@
+#include "standins/office/server/DocumentFile.h"
+
+#include "standins/office/server/Text.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+
+#include <cerrno>
+#include <system_error>
+
+namespace standins {
+
+DocumentFile OpenDocumentFile(const std::wstring& path, std::wstring& failure) {
+    const std::optional<std::string> utf8 = ToUtf8(path);
+    struct stat status {};
+    // Looked at before it is opened: opening alone can start something in a device.
+    if (!utf8 || utf8->find('\0') != std::string::npos) {
+        failure = L"no file can have this name";
+        return {};
+    }
+    if (stat(utf8->c_str(), &status) == 0 && !S_ISREG(status.st_mode)) {
+        failure = L"it is not a regular file";
+        return {};
+    }
+    DocumentFile file;
+    file.descriptor = Descriptor(open(utf8->c_str(), O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC));
+    if (!file.descriptor.IsOpen()) {
+        failure = FromUtf8(std::generic_category().message(errno));
+        return {};
+    }
+    if (fstat(file.descriptor.Get(), &status) != 0 || !S_ISREG(status.st_mode)) {
+        failure = L"it is not a regular file";
+        return {};
+    }
+    if (status.st_size == 0) {
+        failure = L"it is empty";
+        return {};
+    }
+    file.size = static_cast<std::uint64_t>(status.st_size);
+    return file;
+}
+
+} // namespace standins

@@ -1,0 +1,22 @@
+#pragma once
+
+#include "standins/office/server/DocumentFile.h"
+#include "standins/office/server/DocumentFormat.h"
+
+#include <string>
+
+namespace standins {
+
+/// What came of an engine run.
+struct EngineResult {
+    Descriptor pdf; ///< closed when it failed
+    std::string sha256;
+    std::wstring failure; ///< why it failed, as the end of a sentence
+};
+
+/// Lets LibreOffice convert a document, under a supervisor of its own, and returns when nothing of
+/// the run is left: no process, no file. The supervisor sees to it that LibreOffice ends; that the
+/// supervisor itself ends is seen to here.
+EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format);
+
+} // namespace standins

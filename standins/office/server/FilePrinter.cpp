@@ -1,0 +1,110 @@
+#include "standins/office/server/FilePrinter.h"
+
+#include "standins/office/process/ChildProcess.h"
+#include "standins/office/process/Clocks.h"
+#include "standins/office/process/FileBytes.h"
+#include "standins/office/process/ProcessTable.h"
+#include "standins/office/server/Call.h"
+#include "standins/office/server/Module.h"
+#include "standins/office/server/NewFile.h"
+#include "standins/office/server/Settings.h"
+#include "standins/office/server/Text.h"
+
+#include <glib.h>
+#include <poll.h>
+#include <sys/mman.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+
+#include <cerrno>
+#include <system_error>
+
+namespace standins {
+
+namespace {
+
+[[noreturn]] void RaiseCannotWrite(const PrintRequest& request, const std::string& reason) {
+    throw Raised{request.title + L" cannot be printed to " + request.output + L": " +
+                 FromUtf8(reason) + L"."};
+}
+
+[[noreturn]] void RaiseCannotWrite(const PrintRequest& request, int error) {
+    RaiseCannotWrite(request, std::generic_category().message(error));
+}
+
+std::vector<std::string> WriterArguments(const PrintRequest& request) {
+    std::vector<std::string> arguments = {
+        "--title=" + ToUtf8(request.title).value_or("document"),
+        "--copies=" + std::to_string(request.copies),
+        request.collate ? "--collate" : "--no-collate",
+    };
+    const std::string user = g_get_user_name();
+    if (!user.empty())
+        arguments.push_back("--user=" + user);
+    return arguments;
+}
+
+std::uint64_t SizeOf(int file) {
+    struct stat status {};
+    return fstat(file, &status) == 0 ? static_cast<std::uint64_t>(status.st_size) : 0;
+}
+
+/// Waits for the writer, under the two clocks.
+/// @return false when it had to be ended
+bool AwaitWriter(const ChildProcess& writer, int output) {
+    Clocks clocks(ReadTimeLimits());
+    for (;;) {
+        pollfd event{writer.ExitDescriptor(), POLLIN, 0};
+        if (poll(&event, 1, static_cast<int>(clocks.Interval().count())) > 0)
+            return true;
+        const LifeSign sign{CpuTicksOfGroup(writer.Id()), SizeOf(output)};
+        if (clocks.Check(sign) != Clocks::State::Running)
+            return false;
+    }
+}
+
+/// What the writer said last: the reason, after all that its libraries had to say.
+std::string LastLine(int file) {
+    std::string text;
+    ReadWhole(file, [&](const char* bytes, std::size_t size) {
+        text.append(bytes, size);
+        return 0;
+    });
+    text.erase(text.find_last_not_of('\n') + 1);
+    return text.substr(text.rfind('\n') + 1);
+}
+
+/// @return why it failed; empty when all is written
+std::string WritePostScript(const PrintRequest& request, int output) {
+    const Descriptor messages(memfd_create("messages", MFD_CLOEXEC));
+    std::optional<ChildProcess> writer =
+        ChildProcess::Start(HelperPath("pdf-to-ps"), WriterArguments(request),
+                            {request.pages->Get(), output, messages.Get()});
+    if (!writer)
+        return "the PostScript writer cannot be started: " + std::generic_category().message(errno);
+    if (!AwaitWriter(*writer, output))
+        return "the PostScript writer took too long";
+    const int status = writer->Wait();
+    if (WIFEXITED(status) && WEXITSTATUS(status) == 0)
+        return {};
+    const std::string reason = LastLine(messages.Get());
+    return reason.empty() ? "the PostScript writer ended unexpectedly" : reason;
+}
+
+} // namespace
+
+void PrintToFile(const PrintRequest& request) {
+    const std::optional<std::string> path = ToUtf8(request.output);
+    if (!path || path->empty() || path->find('\0') != std::string::npos)
+        RaiseCannotWrite(request, "no file can have this name");
+    NewFile file(*path);
+    if (file.Get() < 0)
+        RaiseCannotWrite(request, file.Error());
+    const std::string failure = WritePostScript(request, file.Get());
+    if (!failure.empty())
+        RaiseCannotWrite(request, failure);
+    if (const int error = file.Appear())
+        RaiseCannotWrite(request, error);
+}
+
+} // namespace standins

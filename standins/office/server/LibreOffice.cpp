@@ -1,0 +1,66 @@
+#include "standins/office/server/LibreOffice.h"
+
+#include "standins/office/process/FileBytes.h"
+
+#include <unistd.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <sstream>
+
+namespace fs = std::filesystem;
+
+namespace standins {
+
+namespace {
+
+std::optional<fs::path> ProgramFolder() {
+    const char* path = std::getenv("PATH"); // NOLINT(concurrency-mt-unsafe): nobody changes it
+    std::istringstream folders(path ? path : "");
+    for (std::string folder; std::getline(folders, folder, ':');) {
+        std::error_code error;
+        const fs::path launcher = fs::canonical(fs::path(folder) / "soffice", error);
+        if (error)
+            continue;
+        const fs::path program = launcher.parent_path();
+        if (access((program / "soffice.bin").c_str(), X_OK) == 0)
+            return program;
+    }
+    return std::nullopt;
+}
+
+/// The value that stands last under a name in one of LibreOffice's settings files: the first may be
+/// the description of the setting, with an empty value.
+std::string LastValue(const std::string& settings, const std::string& name) {
+    constexpr std::string_view Opening = "<value>";
+    const std::size_t found = settings.rfind("oor:name=\"" + name + '"');
+    const std::size_t opening = settings.find(Opening, found);
+    if (found == std::string::npos || opening == std::string::npos)
+        return {};
+    const std::size_t start = opening + Opening.size();
+    return settings.substr(start, settings.find('<', start) - start);
+}
+
+/// Every LibreOffice says its name and version in its main settings file, for its About box.
+std::string NameOf(const fs::path& program) {
+    constexpr std::size_t LongEnough = 16 << 20;
+    const fs::path file = program.parent_path() / "share" / "registry" / "main.xcd";
+    const std::string settings = ReadText(file, LongEnough);
+    const std::string version = LastValue(settings, "ooSetupVersionAboutBox");
+    return version.empty() ? "LibreOffice" : "LibreOffice " + version;
+}
+
+} // namespace
+
+bool LibreOffice::Has(const std::string& library) const {
+    return access((fs::path(program) / library).c_str(), R_OK) == 0;
+}
+
+std::optional<LibreOffice> FindLibreOffice() {
+    const std::optional<fs::path> program = ProgramFolder();
+    if (!program)
+        return std::nullopt;
+    return LibreOffice{*program, NameOf(*program)};
+}
+
+} // namespace standins

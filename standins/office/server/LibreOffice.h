@@ -1,0 +1,21 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+namespace standins {
+
+/// LibreOffice as it is installed on this machine.
+struct LibreOffice {
+    std::string program; ///< its program folder
+    std::string name;    ///< for people, with its version: "LibreOffice 7.4.7.2"
+
+    /// Whether its program folder holds a library, for instance "libswlo.so".
+    bool Has(const std::string& library) const;
+};
+
+/// Looks for LibreOffice as a shell would, by `soffice` and PATH, and learns its version from its
+/// own files: nothing is started.
+std::optional<LibreOffice> FindLibreOffice();
+
+} // namespace standins

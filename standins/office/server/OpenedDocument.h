@@ -1,0 +1,34 @@
+#pragma once
+
+#include "standins/office/server/DocumentFormat.h"
+#include "standins/office/server/PdfCache.h"
+
+#include <string>
+#include <vector>
+
+namespace standins {
+
+/// A document in an application, from its opening to its closing.
+class OpenedDocument {
+public:
+    /// A new document, with nothing in it.
+    OpenedDocument() = default;
+    /// @throws Raised when it cannot be opened
+    OpenedDocument(const std::wstring& path, const std::vector<DocumentFormat>& formats);
+
+    /// The document's name, without its folder.
+    const std::wstring& Name() const { return m_name; }
+
+    /// @throws Raised when the document is closed, or has nothing in it
+    const Pdf& Pages() const;
+
+    /// @throws Raised when the document is closed already
+    void Close();
+
+private:
+    std::wstring m_name = L"The new document";
+    Pdf m_pages;
+    bool m_isOpen = true;
+};
+
+} // namespace standins

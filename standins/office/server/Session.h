@@ -1,0 +1,19 @@
+#pragma once
+
+#include "standins/office/server/Module.h"
+
+#include <string>
+
+namespace standins {
+
+/// What the objects of one running application share.
+struct Session {
+    explicit Session(const wchar_t* applicationName) : name(applicationName) {}
+
+    const wchar_t* name;    ///< "Word"; the source of the errors that it raises
+    bool isRunning = true;  ///< until it is told to quit
+    std::wstring printer{}; ///< the active printer
+    ModuleUse use{};
+};
+
+} // namespace standins
