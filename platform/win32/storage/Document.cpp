@@ -6,6 +6,7 @@
 #include "platform/win32/text/CaseFold.h"
 #include "platform/win32/text/Utf8.h"
 
+#include <gsf/gsf-infile-impl.h>
 #include <gsf/gsf-infile-msole.h>
 
 #include <algorithm>
@@ -26,15 +27,29 @@ HRESULT Document::Load() {
     return m_root ? S_OK : STG_E_DOCFILECORRUPT;
 }
 
-/// @return the stream's name as it is written in the file; null when there is none
-const char* Document::FindStream(const std::wstring& name) const {
+namespace {
+
+/// gsf_infile_child_by_index, but for the warning that it prints when there is no such child.
+GsfInput* ChildByIndex(GsfInfile* parent, int index) {
+    const auto* parentClass = reinterpret_cast<const GsfInfileClass*>(
+        reinterpret_cast<const GTypeInstance*>(parent)->g_class);
+    GError* error = nullptr;
+    GsfInput* child = parentClass->child_by_index(parent, index, &error);
+    g_clear_error(&error);
+    return child;
+}
+
+} // namespace
+
+/// @return the index of the root storage's child of that name; -1 when there is none
+int Document::FindChild(const std::wstring& name) const {
     const int count = gsf_infile_num_children(m_root.get());
     for (int i = 0; i < count; ++i) {
         const char* found = gsf_infile_name_by_index(m_root.get(), i);
         if (found && SameName(FromUtf8(found), name))
-            return found;
+            return i;
     }
-    return nullptr;
+    return -1;
 }
 
 HRESULT Document::OpenStream(const std::wstring& name, GsfInputPointer& stream, std::wstring& key) {
@@ -42,13 +57,13 @@ HRESULT Document::OpenStream(const std::wstring& name, GsfInputPointer& stream, 
     if (m_reverted)
         return STG_E_REVERTED;
     const GsfMessages messages(m_name);
-    const char* found = FindStream(name);
-    if (!found)
+    const int found = FindChild(name);
+    if (found < 0)
         return STG_E_FILENOTFOUND;
     key = CaseFold(name);
     if (m_openStreams.count(key) > 0)
         return STG_E_ACCESSDENIED;
-    GsfInputPointer opened(gsf_infile_child_by_name(m_root.get(), found));
+    GsfInputPointer opened(ChildByIndex(m_root.get(), found));
     if (!opened)
         return STG_E_DOCFILECORRUPT;
     const bool isStorage =

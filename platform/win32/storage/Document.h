@@ -43,7 +43,7 @@ public:
     void Revert();
 
 private:
-    const char* FindStream(const std::wstring& name) const;
+    int FindChild(const std::wstring& name) const;
 
     std::mutex m_mutex;
     std::string m_name;
