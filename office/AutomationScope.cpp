@@ -3,11 +3,11 @@
 #include <afxwin.h>
 #include <objbase.h>
 
-#include <wx/crt.h>
+#include <cstdio>
 
 bool InitializeMfcAndCom() {
     if (!AfxWinInit(GetModuleHandleW(nullptr), nullptr, GetCommandLineW(), 0)) {
-        wxFputs(L"Fatal Error: MFC initialization failed\n", stdout);
+        std::fputs("Fatal Error: MFC initialization failed\n", stdout);
         return false;
     }
     // The answer does not matter: the thread may be initialised already, and each call is owed

@@ -62,7 +62,7 @@ TEST_F(OutputWaitTest, GivesUpOnAFileThatNeverStopsGrowing) {
     GetOutputWaitLimits() = {10s, 200ms};
     const auto path = m_folder.Write("growing.ps", "");
     const GrowingFile growing(path);
-    EXPECT_FALSE(WaitForOutput(path.wstring(), Patient));
+    EXPECT_FALSE(WaitForOutput(path.wstring(), {50ms, false, 0s}));
 }
 
 TEST_F(OutputWaitTest, LetsALargeFileSettle) {

@@ -61,8 +61,17 @@ TEST_F(ConversionTest, PassesTheDriversFailureOn) {
     EXPECT_EQ("a.ps", outputName);
     m_office.RefuseToStart();
     EXPECT_EQ(1016, Convert("a.doc", outputName));
-    Apply("<r><UI><PRINTER> </PRINTER></UI></r>"); // white space alone is no text
-    EXPECT_EQ(-1010, Convert("a.doc", outputName));
+}
+
+TEST_F(ConversionTest, NeedsAPrinterInTheSettingsWhereThereIsNoDistiller) {
+    const PluginUnderTest plugin;
+    plugin->Initialize(wxString());
+    plugin->ApplySettings(nullptr); // no printer there, and the one found is forgotten
+    JobItem item;
+    item.fileName = "a.doc";
+    item.paths.Add("/in/a.doc");
+    wxString outputName;
+    EXPECT_EQ(-1010, plugin->Convert(nullptr, item, "/out", outputName, nullptr));
 }
 
 TEST_F(ConversionTest, MakesPdfUnlessPostScriptIsAskedFor) {

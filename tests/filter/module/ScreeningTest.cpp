@@ -4,6 +4,8 @@
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"
 
+#include <wx/filename.h>
+
 #include <gtest/gtest.h>
 
 #include <optional>
@@ -136,7 +138,7 @@ TEST_F(ScreeningTest, RefusesAPathThatUtf8CannotHold) {
     for (const char* name : whole) {
         WriteCompound(name, u"WordDocument");
         wxArrayString files;
-        files.Add(wxString((m_folder / std::filesystem::u8path(name)).wstring()));
+        files.Add(wxString::FromUTF8((m_folder / name).string()));
         Outcome outcome;
         EXPECT_EQ(0, m_plugin->ScreenFiles(files, outcome.spare, outcome.refused, outcome.items));
         EXPECT_EQ(1U, outcome.items.size());
