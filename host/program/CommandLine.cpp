@@ -4,6 +4,7 @@
 #include "host/program/SettingsKeys.h"
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <iomanip>
 #include <iostream>
 #include <sstream>
@@ -57,10 +58,7 @@ std::string SettingsTable() {
 }
 
 void AddPaths(CLI::App& command, CommandLine& line) {
-    // One value at a time: of a longer list CLI11 would take a name like "[draft]" apart.
-    command.add_option("PATH", line.paths, "Files, or folders of files")
-        ->required()
-        ->allow_extra_args(false);
+    command.add_option("PATH", line.paths, "Files, or folders of files")->required();
 }
 
 void AddConvert(CLI::App& app, CommandLine& line) {
@@ -113,6 +111,26 @@ void AddCommonOptions(CLI::App& app, CommandLine& line) {
         ->type_name("DIR");
 }
 
+bool TakesValue(const CLI::App& app, const std::string& name) {
+    const CLI::Option* const option = app.get_option_no_throw(name);
+    const auto commands = app.get_subcommands([](const CLI::App*) { return true; });
+    return (option && option->get_expected_min() > 0) ||
+           std::any_of(commands.begin(), commands.end(),
+                       [&name](const CLI::App* command) { return TakesValue(*command, name); });
+}
+
+/// The arguments, last one first as CLI11 wants them. It takes a PATH like "[a,b]" for a list, but
+/// not the same one behind "./".
+std::vector<std::string> ArgumentsFor(const CLI::App& app, int argc, const char* const* argv) {
+    std::vector<std::string> arguments;
+    for (int i = argc - 1; i > 0; --i) {
+        const std::string argument = argv[i];
+        const bool list = argument.size() > 1 && argument.front() == '[' && argument.back() == ']';
+        arguments.push_back(list && !TakesValue(app, argv[i - 1]) ? "./" + argument : argument);
+    }
+    return arguments;
+}
+
 /// CLI11 shows the help of the one command that was given; ours is one text, and says it all.
 std::string HelpOf(CLI::App& app) {
     app.clear();
@@ -133,7 +151,7 @@ std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, in
     try {
         if (argc < 2)
             throw CLI::RequiredError("A command");
-        app.parse(argc, argv);
+        app.parse(ArgumentsFor(app, argc, argv));
         return line;
     } catch (const CLI::CallForHelp&) {
         std::cout << HelpOf(app) << std::flush;

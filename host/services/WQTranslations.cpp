@@ -1,4 +1,5 @@
 #include "common/WQServices.h"
+#include "host/services/CatalogueCheck.h"
 
 #include <wx/dir.h>
 #include <wx/file.h>
@@ -31,7 +32,8 @@ wxMsgCatalog* ReadCatalogue(const wxString& path) {
     if (size <= 0 || size > LargestCatalogue)
         return nullptr;
     wxCharBuffer bytes(static_cast<std::size_t>(size));
-    if (file.Read(bytes.data(), bytes.length()) != size)
+    if (file.Read(bytes.data(), bytes.length()) != size ||
+        !IsSoundCatalogue({bytes.data(), bytes.length()}))
         return nullptr;
     return wxMsgCatalog::CreateFromData(bytes, Domain);
 }
@@ -65,9 +67,9 @@ std::unique_ptr<wxTranslations> LoadLanguage(const wxString& path) {
 
 wxArrayString LanguagesIn(const wxString& folder) {
     wxArrayString languages;
-    const wxDir directory(wxDirExists(folder) ? folder : wxString());
+    wxDir directory;
     wxString language;
-    if (directory.IsOpened())
+    if (wxDirExists(folder) && directory.Open(folder))
         for (bool more = directory.GetFirst(&language, wxEmptyString, wxDIR_DIRS); more;
              more = directory.GetNext(&language))
             languages.Add(language);

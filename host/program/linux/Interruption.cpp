@@ -1,5 +1,8 @@
 #include "host/program/Interruption.h"
 
+#include <unistd.h>
+
+#include <cerrno>
 #include <csignal>
 #include <initializer_list>
 
@@ -7,16 +10,27 @@ namespace {
 
 volatile std::sig_atomic_t g_requested = 0;
 
-extern "C" void NoteRequest(int) {
+constexpr char Note[] =
+    "\nquillon: finishing the document under way; a second Ctrl-C ends at once\n";
+
+extern "C" void NoteRequest(int signal) {
+    if (g_requested != 0) {
+        std::signal(signal, SIG_DFL);
+        std::raise(signal);
+        return;
+    }
     g_requested = 1;
+    const int error = errno;
+    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, Note, sizeof Note - 1);
+    errno = error;
 }
 
 extern "C" void IgnoreBrokenPipe(int) {}
 
-void Handle(int signal, void (*handler)(int), int flags) {
+void Handle(int signal, void (*handler)(int)) {
     struct sigaction action = {};
     action.sa_handler = handler;
-    action.sa_flags = SA_RESTART | flags;
+    action.sa_flags = SA_RESTART;
     sigemptyset(&action.sa_mask);
     sigaction(signal, &action, nullptr);
 }
@@ -25,10 +39,10 @@ void Handle(int signal, void (*handler)(int), int flags) {
 
 void Interruption::Install() {
     for (const int signal : {SIGINT, SIGTERM, SIGHUP})
-        Handle(signal, NoteRequest, static_cast<int>(SA_RESETHAND));
+        Handle(signal, NoteRequest);
     // A reader of our output that has gone is no reason to leave documents unconverted. A handler,
     // not SIG_IGN, since programs started from here would inherit that.
-    Handle(SIGPIPE, IgnoreBrokenPipe, 0);
+    Handle(SIGPIPE, IgnoreBrokenPipe);
 }
 
 bool Interruption::Requested() {

@@ -1,0 +1,204 @@
+#include "tests/host/Program.h"
+#include "tests/support/TemporaryFolder.h"
+
+#include <gtest/gtest.h>
+
+#include <csignal>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+using nlohmann::json;
+using Arguments = std::vector<std::string>;
+
+class ConvertTest : public testing::Test {
+protected:
+    RunResult Convert(const Arguments& paths, const Arguments& options = {}) const {
+        return RunQuillon(ArgumentsFor(paths, options));
+    }
+
+    Arguments ArgumentsFor(const Arguments& paths, const Arguments& options = {}) const {
+        Arguments arguments = {"convert", "--json", "--out", Out()};
+        arguments.insert(arguments.end(), options.begin(), options.end());
+        for (const std::string& path : paths)
+            arguments.push_back((m_folder / path).string());
+        return arguments;
+    }
+
+    std::string Out() const { return (m_folder / "out").string(); }
+
+    /// The names in the output folder, hidden ones too.
+    std::vector<std::string> Outputs() const {
+        std::vector<std::string> names;
+        for (const auto& entry : fs::directory_iterator(Out()))
+            names.push_back(entry.path().filename().string());
+        std::sort(names.begin(), names.end());
+        return names;
+    }
+
+    /// What the filter was told when it made the output.
+    std::string Output(const std::string& name) const { return ReadBytes(fs::path(Out()) / name); }
+
+    TemporaryFolder m_folder;
+};
+
+using Names = std::vector<std::string>;
+
+TEST_F(ConvertTest, DrivesTheFilterInItsOrderAndReportsTheOutput) {
+    m_folder.Write("a.doc", "script");
+    m_folder.Write("b.doc", "script");
+    const std::string log = (m_folder / "log").string();
+    const RunResult run = Convert({"a.doc", "b.doc"}, {"--log", log});
+    ASSERT_EQ(run.exitCode, 0) << run.err;
+    const json document = run.Records("document").at(0);
+    EXPECT_EQ(document["state"], "converted");
+    EXPECT_EQ(document["output"], Out() + "/a.ps");
+    EXPECT_EQ(document["code"], 0);
+    EXPECT_TRUE(document["seconds"].is_number());
+    EXPECT_NE(run.err.find("a.doc: 50 %  Printing"), std::string::npos) << run.err;
+    EXPECT_NE(Output("a.ps").find("<ServerVersion>16</ServerVersion>"), std::string::npos);
+
+    const std::string records = ReadBytes(log);
+    std::size_t at = 0;
+    for (const char* call : {"InitializePlugin", "GetPluginInfo", "GetPluginInstance", "Initialize",
+                             "ApplySettings", "Screen a.doc", "Convert a.doc", "Screen b.doc",
+                             "Convert b.doc", "ReleasePluginInstance", "UninitializePlugin"}) {
+        at = records.find(std::string("ScriptedFilter: ") + call + '\n', at);
+        ASSERT_NE(at, std::string::npos) << call << '\n' << records;
+    }
+}
+
+TEST_F(ConvertTest, EveryFailureKeepsItsCodeAndOneFolderStaysClean) {
+    struct Case {
+        std::string script;
+        std::string state;
+        int code;
+        int exitCode;
+    };
+    const Case cases[] = {
+        {"convert=1020", "failed", 1020, 1},
+        {"convert=1021\noutput=none", "failed", 1021, 1},
+        {"convert=1022", "failed", 1022, 1},
+        {"convert=-1007", "failed", -1007, 1},
+        {"convert=1012", "failed", 1012, 2},
+        {"convert=-1006", "failed", -1006, 2},
+        {"screen=-1005", "refused", -1005, 1},
+        {"output=none", "failed", 1021, 1}, // success without an output is none
+    };
+    for (const Case& each : cases) {
+        m_folder.Write("bad.doc", each.script);
+        m_folder.Write("good.doc", "script");
+        const RunResult run = Convert({"bad.doc", "good.doc"});
+        EXPECT_EQ(run.exitCode, each.exitCode) << each.script;
+        const std::vector<json> documents = run.Records("document");
+        ASSERT_EQ(documents.size(), 2U) << run.err;
+        EXPECT_EQ(documents[0]["state"], each.state) << each.script;
+        EXPECT_EQ(documents[0]["code"], each.code) << each.script;
+        EXPECT_TRUE(documents[0]["output"].is_null()) << each.script;
+        EXPECT_EQ(documents[1]["state"], "converted") << each.script;
+        EXPECT_EQ(Outputs(), Names{"good.ps"}) << each.script;
+    }
+}
+
+TEST_F(ConvertTest, AnOlderOutputStaysUntilThereIsAWholeNewOne) {
+    fs::create_directory(Out());
+    m_folder.Write("out/a.ps", "older");
+    m_folder.Write("a.doc", "convert=1020");
+    EXPECT_EQ(Convert({"a.doc"}).exitCode, 1);
+    EXPECT_EQ(Output("a.ps"), "older");
+    m_folder.Write("a.doc", "script");
+    EXPECT_EQ(Convert({"a.doc"}).exitCode, 0);
+    EXPECT_NE(Output("a.ps"), "older");
+    EXPECT_EQ(Outputs(), Names{"a.ps"});
+}
+
+TEST_F(ConvertTest, AnOutputThatCannotBePutInPlaceIsAFailure) {
+    fs::create_directories(m_folder / "out" / "a.ps");
+    m_folder.Write("a.doc", "script");
+    const RunResult run = Convert({"a.doc"});
+    EXPECT_EQ(run.exitCode, 1);
+    EXPECT_EQ(run.Records("document").at(0)["code"], -1003);
+    EXPECT_EQ(Outputs(), Names{"a.ps"}) << "nothing beside the folder in the way";
+}
+
+TEST_F(ConvertTest, DocumentsOfOneNameAllGetAnOutput) {
+    fs::create_directory(m_folder / "sub");
+    for (const char* name : {"budget.doc", "budget.xls", "sub/budget.xls", "Budget.docx"})
+        m_folder.Write(name, "companion=.log");
+    m_folder.Write("budget.txt", "no filter's business, and so no claim to the name");
+    const RunResult run =
+        Convert({"budget.txt", "budget.doc", "budget.xls", "sub/budget.xls", "Budget.docx"});
+    EXPECT_EQ(run.exitCode, 1) << "the text";
+    EXPECT_EQ(run.Records("document").at(3)["output"], Out() + "/budget.xls (2).ps");
+    EXPECT_EQ(Outputs(), (Names{"Budget.docx.log", "Budget.docx.ps", "budget.log", "budget.ps",
+                                "budget.xls (2).log", "budget.xls (2).ps", "budget.xls.log",
+                                "budget.xls.ps"}));
+}
+
+TEST_F(ConvertTest, SettingsComeFromFileCommandLineAndDefaults) {
+    m_folder.Write("a.doc", "script");
+    const auto told = [&](const std::string& file, const Arguments& options) {
+        Arguments all = {"--settings", m_folder.Write("s.xml", file).string()};
+        all.insert(all.end(), options.begin(), options.end());
+        const RunResult run = Convert({"a.doc"}, all);
+        EXPECT_EQ(run.exitCode, 0) << run.err;
+        const std::string output = Output("a.ps");
+        return output.substr(output.find("</ServerInformation>\n\n") + 22);
+    };
+    const std::string printer = "PRINTER=Quillon PostScript File Printer\n";
+    EXPECT_EQ(told("<UI/>", {}), printer + "OUTPUTFILETYPEPS=1\n");
+    EXPECT_EQ(told("<a><b><UI><PRINTER/><OUTPUTFILETYPEPS>0</OUTPUTFILETYPEPS></UI></b></a>", {}),
+              printer + "OUTPUTFILETYPEPS=0\n")
+        << "only what is missing is filled in";
+    EXPECT_EQ(told("<a><b><UI><COLOR>a</COLOR></UI></b><UI><COLOR>near</COLOR></UI></a>", {}),
+              printer + "OUTPUTFILETYPEPS=1\nCOLOR=near\n")
+        << "the element that filters find";
+    EXPECT_EQ(told("<UI><COLOR>one</COLOR><COLOR>two</COLOR><PRINTER>Nobody's</PRINTER></UI>",
+                   {"--set", "COLOR=Grau=\xC3\xA4", "--set", "HIGHQUALITY=1", "--set",
+                    "HIGHQUALITY=", "--printer", "Quillon PostScript File Printer"}),
+              "OUTPUTFILETYPEPS=1\n" + printer + "HIGHQUALITY=\nCOLOR=Grau=\xC3\xA4\n");
+}
+
+TEST_F(ConvertTest, TheOutputFolderIsMadeAndMayBeWrittenAnyWay) {
+    m_folder.Write("a.doc", "script");
+    for (const std::string out :
+         {"new", "slash/", "dots/../dots/.", "n\xC3\xA4h \xF0\x9F\x98\x80"}) {
+        const RunResult run = RunQuillon({"convert", (m_folder / "a.doc").string(), "--out",
+                                          m_folder.Path().string() + '/' + out});
+        EXPECT_EQ(run.exitCode, 0) << run.err;
+        EXPECT_TRUE(fs::is_regular_file(m_folder / out / "a.ps")) << out;
+    }
+}
+
+TEST_F(ConvertTest, AnInterruptionFinishesTheDocumentAndReportsTheRest) {
+    const std::string started = (m_folder / "started").string();
+    m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "go").string());
+    m_folder.Write("b.doc", "script");
+    for (const int signal : {SIGINT, SIGTERM}) {
+        RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc", "b.doc"})));
+        AwaitFile(started);
+        program.Signal(signal);
+        m_folder.Write("go", "");
+        const RunResult run = program.Wait();
+        EXPECT_EQ(run.exitCode, 4) << run.err;
+        EXPECT_EQ(run.Records("document").at(0)["state"], "converted");
+        EXPECT_EQ(run.Records("document").at(1)["state"], "not converted");
+        EXPECT_EQ(Outputs(), Names{"a.ps"});
+        fs::remove(started);
+        fs::remove(m_folder / "go");
+    }
+}
+
+TEST_F(ConvertTest, ASecondInterruptionEndsTheProgram) {
+    const std::string started = (m_folder / "started").string();
+    m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "never").string());
+    RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc"})));
+    AwaitFile(started);
+    program.Signal(SIGINT);
+    program.Signal(SIGTERM); // two of a kind may arrive as one
+    EXPECT_LT(program.Wait().exitCode, 0) << "ended by one of the two";
+    EXPECT_FALSE(fs::exists(fs::path(Out()) / "a.ps"));
+}
+
+} // namespace

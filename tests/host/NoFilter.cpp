@@ -1,0 +1,3 @@
+// A module that is no filter.
+
+extern "C" void InitializePlugin() {}

@@ -1,0 +1,24 @@
+// An Office stand-in for tests of the host: enters a Word and its engine, and tells the engine's
+// clocks by way of the engine's name.
+
+#include <objbase.h>
+#include <windows.h>
+
+#include <wx/msw/registry.h>
+
+STDAPI DllRegisterServer() {
+    wxRegKey(wxRegKey::HKCR, "Word.Application").Create();
+    wxRegKey current(wxRegKey::HKCR, "Word.Application\\CurVer");
+    current.Create();
+    current.SetValue(wxEmptyString, wxString("Word.Application.16"));
+
+    long stall = 0;
+    long total = 0;
+    const wxRegKey clocks(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Office Stand-Ins");
+    clocks.QueryValue("StallSeconds", &stall);
+    clocks.QueryValue("TotalSeconds", &total);
+    wxRegKey self(wxRegKey::HKLM, "SOFTWARE\\Orvanta\\Office Stand-Ins");
+    self.Create();
+    self.SetValue("Engine", wxString::Format("Scripted engine, %ld of %ld s", stall, total));
+    return S_OK;
+}

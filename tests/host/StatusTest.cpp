@@ -1,0 +1,78 @@
+#include "tests/host/Program.h"
+#include "tests/support/TemporaryFolder.h"
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using nlohmann::json;
+
+bool Contains(const std::string& text, const std::string& part) {
+    return text.find(part) != std::string::npos;
+}
+
+TEST(Status, TellsWhatThereIs) {
+    const RunResult run = RunQuillon({"status", "--json"});
+    EXPECT_EQ(run.exitCode, 0) << run.err;
+    ASSERT_EQ(run.Records("filter").size(), 1U) << run.out << run.err;
+    const json filter = run.Records("filter")[0];
+    EXPECT_EQ(filter["identifier"], "Scripted");
+    EXPECT_EQ(filter["version"], "7.0");
+    EXPECT_EQ(filter["extensions"], (json{"doc", "xls"}));
+    EXPECT_EQ(filter["ready"], true);
+
+    const std::vector<json> applications = run.Records("application");
+    ASSERT_EQ(applications.size(), 4U);
+    EXPECT_EQ(applications[0]["name"], "Word");
+    EXPECT_EQ(applications[0]["version"], "16");
+    EXPECT_EQ(applications[1]["installed"], false);
+
+    std::vector<json> preferred;
+    for (const json& printer : run.Records("printer"))
+        if (printer["preferred"] == true)
+            preferred.push_back(printer);
+    ASSERT_EQ(preferred.size(), 1U) << run.out;
+    EXPECT_EQ(preferred[0]["postScript"], true);
+    EXPECT_TRUE(run.Records("missing").empty()) << run.out;
+    EXPECT_TRUE(Contains(run.err, "Ready to convert.")) << run.err;
+}
+
+TEST(Status, HandsTheClocksToTheEngines) {
+    const RunResult run = RunQuillon({"status", "--engine-stall", "5", "--engine-limit", "60"});
+    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s")) << run.out;
+}
+
+TEST(Status, TellsWhatIsMissingAndWhatToDo) {
+    const TemporaryFolder empty;
+    const std::string folder = empty.Path().string();
+    const RunResult noOffice =
+        RunProgram({QUILLON_PROGRAM, "status", "--filters", TEST_FILTERS, "--stand-ins", folder});
+    EXPECT_EQ(noOffice.exitCode, 2);
+    EXPECT_TRUE(Contains(noOffice.out, "No Office application is installed")) << noOffice.out;
+    EXPECT_TRUE(Contains(noOffice.out, "apt-get install libreoffice-writer-nogui")) << noOffice.out;
+    EXPECT_TRUE(Contains(noOffice.out, "not ready")) << noOffice.out;
+
+    const RunResult noFilter =
+        RunProgram({QUILLON_PROGRAM, "status", "--filters", folder, "--stand-ins", TEST_STAND_INS});
+    EXPECT_EQ(noFilter.exitCode, 2);
+    EXPECT_TRUE(Contains(noFilter.out, "There is no filter")) << noFilter.out;
+}
+
+TEST(Status, PassesOverWhatIsNoFilter) {
+    const TemporaryFolder folder;
+    std::filesystem::copy_file(std::filesystem::path(TEST_MODULES) / "NoFilter.so",
+                               folder / "Other.so");
+    folder.Write("Broken.so", "no module");
+    folder.Write("readme.txt", "");
+    const std::string log = (folder / "log").string();
+    const RunResult run =
+        RunProgram({QUILLON_PROGRAM, "status", "--filters", folder.Path().string(), "--stand-ins",
+                    TEST_STAND_INS, "--log", log});
+    EXPECT_EQ(run.exitCode, 2);
+    const std::string records = ReadBytes(log);
+    EXPECT_TRUE(Contains(records, "INFO ") && Contains(records, "Other.so")) << records;
+    EXPECT_TRUE(Contains(records, "WARN ") && Contains(records, "Broken.so")) << records;
+    EXPECT_FALSE(Contains(records, "readme.txt")) << records;
+}
+
+} // namespace

@@ -1,0 +1,107 @@
+#include "tests/host/Program.h"
+#include "tests/support/TemporaryFolder.h"
+
+#include <gtest/gtest.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+using Arguments = std::vector<std::string>;
+
+/// A run that cannot begin: it must end with code 3, say why, and convert nothing.
+class UsageTest : public testing::Test {
+protected:
+    void SetUp() override {
+        m_document = m_folder.Write("letter.doc", "script").string();
+        fs::create_directory(m_folder / "out");
+    }
+
+    void ExpectRefusal(const Arguments& arguments, const std::string& reason) const {
+        const RunResult run = RunQuillon(arguments);
+        EXPECT_EQ(run.exitCode, 3) << testing::PrintToString(arguments);
+        EXPECT_NE(run.err.find(reason), std::string::npos) << run.err;
+        EXPECT_EQ(run.out, "") << testing::PrintToString(arguments);
+        EXPECT_TRUE(fs::is_empty(m_folder / "out"));
+    }
+
+    Arguments Convert(const Arguments& more) const {
+        Arguments arguments = {"convert", m_document, "--out", (m_folder / "out").string()};
+        arguments.insert(arguments.end(), more.begin(), more.end());
+        return arguments;
+    }
+
+    TemporaryFolder m_folder;
+    std::string m_document;
+};
+
+TEST_F(UsageTest, OfTheCommandLine) {
+    ExpectRefusal({"prnit"}, "A subcommand is required");
+    ExpectRefusal({"status", "--jsno"}, "--jsno");
+    ExpectRefusal({"screen"}, "PATH");
+    ExpectRefusal({"convert", m_document}, "--out");
+    ExpectRefusal({"status", "--engine-stall", "0"}, "--engine-stall");
+    ExpectRefusal({"status", "--engine-limit", "soon"}, "--engine-limit");
+    ExpectRefusal({"status", "--log", "/nowhere/log"}, "/nowhere/log");
+    ExpectRefusal(Convert({"--set", "PRINTER"}), "KEY=VALUE");
+    ExpectRefusal(Convert({"--set", "=x"}), "KEY=VALUE");
+    ExpectRefusal(Convert({"--printer", "Nobody's"}), "Quillon PostScript File Printer");
+    ExpectRefusal(Convert({"--set", "PRINTER=Nobody's"}), "no printer \"Nobody's\"");
+}
+
+TEST_F(UsageTest, OfTheOutputFolder) {
+    ExpectRefusal({"convert", m_document, "--out", m_document}, "a file, not a folder");
+    ExpectRefusal({"convert", m_document, "--out", (m_folder / "a" / "b").string()},
+                  "the folder above it does not exist");
+    ExpectRefusal({"convert", m_document, "--out", (m_folder / "\xE4").string()}, "UTF-8");
+}
+
+TEST_F(UsageTest, OfTheSettingsFile) {
+    std::string deep;
+    for (int level = 0; level < 100000; ++level)
+        deep += "<a>";
+    std::string million;
+    for (int level = 0; level < 1000000; ++level)
+        million += "<a>";
+    const std::pair<std::string, std::string> files[] = {
+        {"", "no element found"},
+        {"<Settings>\n<UI>\n<PRINTER>x</UI></Settings>", "line 3"},
+        {"<Settings><PRINTER>x</PRINTER></Settings>", "no element \"UI\""},
+        {"<ui><PRINTER>x</PRINTER></ui>", "no element \"UI\""},
+        {"<!DOCTYPE UI [<!ENTITY a \"aaaa\">]><UI><COLOR>&a;</COLOR></UI>", "document type"},
+        {"<?xml version=\"1.0\" encoding=\"klingon\"?><UI/>", "encoding"},
+        {"\xFF\xFE\xFF", "line 1"},
+        {deep, "nested deeper"},
+        {million, "larger than"},
+    };
+    const std::string file = (m_folder / "settings.xml").string();
+    for (const auto& [bytes, reason] : files) {
+        m_folder.Write("settings.xml", bytes);
+        ExpectRefusal(Convert({"--settings", file}), reason);
+    }
+    ExpectRefusal(Convert({"--settings", (m_folder / "none.xml").string()}), "no such file");
+    ExpectRefusal(Convert({"--settings", "/dev/zero"}), "no such file");
+}
+
+TEST_F(UsageTest, OfARecordReader) {
+    const RunResult run = RunQuillon(Convert({"--json", "--printer", "Nobody's"}));
+    EXPECT_EQ(run.exitCode, 3);
+    ASSERT_EQ(run.Records("error").size(), 1U);
+    EXPECT_NE(run.Records("error")[0]["text"].get<std::string>().find("Nobody's"),
+              std::string::npos);
+}
+
+TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
+    const RunResult bare = RunProgram({QUILLON_PROGRAM});
+    EXPECT_EQ(bare.exitCode, 3);
+    const std::string help = RunQuillon({"--help"}).out;
+    EXPECT_EQ(bare.err, help);
+    for (const char* word : {"status", "screen", "convert", "--settings", "--engine-stall",
+                             "SLIDESPERPAGE", "Exit codes", "budget.xls.ps"})
+        EXPECT_NE(help.find(word), std::string::npos) << word;
+    const RunResult ofCommand = RunQuillon({"convert", "--help"});
+    EXPECT_EQ(ofCommand.exitCode, 0);
+    EXPECT_EQ(ofCommand.out, help);
+}
+
+} // namespace
