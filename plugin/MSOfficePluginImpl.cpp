@@ -5,12 +5,18 @@
 #include "plugin/Boundary.h"
 #include "plugin/PluginIdentity.h"
 #include "pstools/PrinterDiscovery.h"
+#include "ui/MSOfficePanel.h"
+#include "ui/MSOfficePanelBuilder.h"
 
 namespace {
 
 constexpr std::int32_t CurrentServerVersion = 16;
+constexpr char InputTypes[] = ".doc, .docx, .xls, .xlsx, .ppt, .pptx, .pps, .ppsx, .pub";
 
 } // namespace
+
+MSOfficePluginImpl::MSOfficePluginImpl() = default;
+MSOfficePluginImpl::~MSOfficePluginImpl() = default;
 
 int MSOfficePluginImpl::Initialize(const wxString& serverInfo) {
     return AtBoundary(Result::Failure, [&] {
@@ -71,6 +77,14 @@ bool MSOfficePluginImpl::GetErrorText(int code, wxString& text) {
     return true;
 }
 
-wxWindow* MSOfficePluginImpl::CreateSettingsPanel(wxWindow* /*parent*/) {
-    return nullptr; // the filter has no panel yet
+wxWindow* MSOfficePluginImpl::CreateSettingsPanel(wxWindow* parent) {
+    return AtBoundary<wxWindow*>(nullptr, [&] {
+        const bool officeInstalled = IsOfficeInstalled();
+        const bool enabled = officeInstalled && (m_currentServer || m_printerAvailable);
+        m_panel = BuildMSOfficePanel(parent, PluginIdentity::Vendor, InputTypes, enabled,
+                                     officeInstalled);
+        if (m_panel)
+            m_panel->ReadSettings(m_settings);
+        return m_panel.get();
+    });
 }

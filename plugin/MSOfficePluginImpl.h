@@ -5,6 +5,9 @@
 #include "plugin/SettingsMap.h"
 #include "plugin/WQPlugin.h"
 
+#include <wx/weakref.h>
+
+class MSOfficePanel;
 class wxFileName;
 
 /// The filter as the host drives it. One object holds the settings and the findings of one use;
@@ -14,7 +17,8 @@ class wxFileName;
 /// MSOfficePluginSettings, MSOfficePluginScreening and MSOfficePluginConversion.
 class MSOfficePluginImpl : public WQPlugin {
 public:
-    MSOfficePluginImpl() = default;
+    MSOfficePluginImpl();
+    ~MSOfficePluginImpl() override;
     MSOfficePluginImpl(const MSOfficePluginImpl&) = delete;
     MSOfficePluginImpl& operator=(const MSOfficePluginImpl&) = delete;
 
@@ -61,4 +65,6 @@ private:
     wxString m_distillerProfile;
     SettingsMap m_settings{100};
     PowerPointOptions m_powerPointOptions;
+    /// The panel made last. The host's window owns it, and may have destroyed it.
+    wxWeakRef<MSOfficePanel> m_panel;
 };

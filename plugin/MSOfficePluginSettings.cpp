@@ -1,6 +1,7 @@
 #include "plugin/Boundary.h"
 #include "plugin/MSOfficePluginImpl.h"
 #include "plugin/SettingsXml.h"
+#include "ui/MSOfficePanel.h"
 
 int MSOfficePluginImpl::ApplySettings(const wxXmlNode* settings) {
     return AtBoundary(Result::Success, [&] {
@@ -42,6 +43,8 @@ int MSOfficePluginImpl::LoadSettings(const wxXmlNode* settings) {
 
 int MSOfficePluginImpl::SaveSettings(wxXmlNode* parent) {
     return AtBoundary(Result::Success, [&] {
+        if (m_panel)
+            m_panel->WriteSettings(m_settings);
         AppendSettingsXml(parent, m_settings);
         return m_lastResult = Result::Success;
     });
