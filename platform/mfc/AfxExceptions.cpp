@@ -33,11 +33,11 @@ BOOL COleDispatchException::GetErrorMessage(LPTSTR buffer, UINT size) const {
 }
 
 void AfxThrowMemoryException() {
-    throw new CMemoryException;
+    throw new CMemoryException; // NOLINT(misc-throw-by-value-catch-by-reference): as MFC does
 }
 
 void AfxThrowOleException(SCODE sc) {
     auto* exception = new COleException;
     exception->m_sc = sc;
-    throw exception;
+    throw exception; // NOLINT(misc-throw-by-value-catch-by-reference): as MFC does
 }

@@ -27,6 +27,7 @@ COleVariant::COleVariant(LPCTSTR text, VARTYPE type) : VARIANT() {
     }
 }
 
+// NOLINTNEXTLINE(bugprone-copy-constructor-init): the contents are copied below, with ownership
 COleVariant::COleVariant(const COleVariant& other) : VARIANT() {
     *this = other;
 }

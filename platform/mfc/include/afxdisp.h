@@ -33,9 +33,11 @@ public:
 class COleVariant : public VARIANT {
 public:
     COleVariant() noexcept;
+    // NOLINTBEGIN(google-explicit-constructor): implicit in MFC
     COleVariant(SHORT value, VARTYPE type = VT_I2); ///< VT_I2 or VT_BOOL
     COleVariant(LONG value, VARTYPE type = VT_I4);  ///< VT_I4, VT_ERROR or VT_BOOL
     COleVariant(LPCTSTR text, VARTYPE type = VT_BSTR);
+    // NOLINTEND(google-explicit-constructor)
     COleVariant(const COleVariant& other);
     COleVariant& operator=(const COleVariant& other);
     ~COleVariant();

@@ -77,6 +77,8 @@ HRESULT WINAPI CoRegisterClassObject(REFCLSID clsid, LPUNKNOWN object, DWORD con
         win32::Log("CoRegisterClassObject: such flags or contexts are not supported");
         return E_INVALIDARG;
     }
+    if (flags == REGCLS_SINGLEUSE && context == CLSCTX_INPROC_SERVER)
+        return E_INVALIDARG; // its own process can always come back
     // A server for many uses serves its own process as well.
     if (flags == REGCLS_MULTIPLEUSE)
         context |= CLSCTX_INPROC_SERVER;

@@ -4,6 +4,8 @@
 
 #include <glib.h>
 
+#include <cstring>
+
 namespace win32 {
 
 namespace {
@@ -36,8 +38,8 @@ GsfMessages::GsfMessages(const std::string& fileName) : m_fileName(fileName), m_
 }
 
 void GsfMessages::Add(const char* message) {
-    if (m_count++ == 0)
-        m_first = message ? message : "";
+    if (m_count++ == 0 && message)
+        m_first.assign(message, std::strcspn(message, "\n"));
 }
 
 GsfMessages::~GsfMessages() {
