@@ -24,8 +24,8 @@ Files and folders
   An output has the name of its document: letter.docx becomes letter.ps, in place of an older
   letter.ps. When two documents of one run have the same name, budget.doc and budget.xls, the
   second keeps its ending: budget.ps and budget.xls.ps; a third becomes budget.xls (2).ps.
-  An output appears in DIR whole or not at all; a hidden folder .quillon-… that a killed run has
-  left there can be deleted.
+  An output appears in DIR whole or not at all. What a killed run leaves there, a hidden folder
+  .quillon-…, goes with the next run.
   Put -- in front of names that begin with a dash.
 
 Settings

@@ -7,8 +7,6 @@
 
 #include <wx/filename.h>
 
-#include <chrono>
-
 namespace fs = std::filesystem;
 
 namespace {
@@ -56,7 +54,7 @@ bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wx
 /// Runs the filter in the workplace and takes over what it made.
 void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const wxString& baseName,
                Reporter& reporter, Outcome& outcome) {
-    Progress progress(reporter, Shown(outcome.input.filename()));
+    Progress progress(reporter, screened.item->fileName);
     wxString outputName;
     const int code = screened.filter->Convert(
         *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
@@ -79,7 +77,6 @@ void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const 
 Outcome Convert(const ScreenedInput& screened, const OutputFolder& outputFolder,
                 const wxString& baseName, Reporter& reporter) {
     Outcome outcome = screened.outcome;
-    const auto start = std::chrono::steady_clock::now();
     wxString fault;
     const std::optional<Workplace> workplace = Workplace::Create(outputFolder.Path(), fault);
     if (workplace)
@@ -88,7 +85,5 @@ Outcome Convert(const ScreenedInput& screened, const OutputFolder& outputFolder,
         Fail(ConversionFailed, fault, *screened.filter, outcome);
     if (outcome.state == State::Failed && outcome.reason.empty())
         Explain(outputFolder, outcome);
-    outcome.seconds =
-        std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
     return outcome;
 }

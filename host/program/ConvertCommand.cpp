@@ -5,6 +5,9 @@
 #include "host/program/PathText.h"
 #include "host/program/RunSettings.h"
 #include "host/program/Summary.h"
+#include "host/program/Workplace.h"
+
+#include <chrono>
 
 namespace {
 
@@ -26,8 +29,13 @@ Outcome ConvertOne(const Input& input, const wxString& baseName, const FilterSet
                    const OutputFolder& outputFolder, Reporter& reporter) {
     if (Interruption::Requested())
         return NotReached(filters, input);
+    const auto start = std::chrono::steady_clock::now();
     const ScreenedInput screened = Screen(filters, input);
-    return screened.item ? Convert(screened, outputFolder, baseName, reporter) : screened.outcome;
+    Outcome outcome =
+        screened.item ? Convert(screened, outputFolder, baseName, reporter) : screened.outcome;
+    outcome.seconds =
+        std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+    return outcome;
 }
 
 } // namespace
@@ -51,6 +59,7 @@ ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filter
                        " cannot be used: " + fault);
         return ExitCode::WrongUsage;
     }
+    Workplace::RemoveAbandoned(outputFolder->Path());
     filters.ApplySettings(settings->Node());
     const std::vector<wxString> names = AllotNames(inputs, filters, *outputFolder);
     std::vector<Outcome> outcomes;

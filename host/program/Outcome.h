@@ -28,7 +28,7 @@ struct Outcome {
     wxString text;                 ///< the code's message
     wxString reason;               ///< what the host can add for a person; may be empty
     bool machineAtFault = false;   ///< and not the document
-    std::optional<double> seconds; ///< of the conversion
+    std::optional<double> seconds; ///< of screening and conversion
 };
 
 /// The state's name, as people and records have it.

@@ -25,16 +25,22 @@ wxString Bar(int percent) {
 
 bool Progress::Report(const wxString& text, int percent) {
     const int bounded = std::clamp(percent, 0, 100);
-    const wxString step = OneLine(text);
-    if (m_reporter.ForTerminal()) {
+    // A step that only repeats which document it is says nothing new.
+    const wxString step = text.Contains(m_document) ? wxString() : OneLine(text);
+    if (m_reporter.ForTerminal())
         m_reporter.Passing(wxString::Format("%s %3d %%  %s  %s", Bar(bounded), bounded,
-                                            Shortened(m_document, LongestName),
+                                            Shortened(OneLine(m_document), LongestName),
                                             Shortened(step, LongestStep)));
-    } else {
-        const wxString line = wxString::Format("%s: %d %%  %s", m_document, bounded, step);
-        if (line != m_last)
-            m_reporter.Line(line);
-        m_last = line;
-    }
+    else
+        ReportLine(step, bounded);
     return !Interruption::Requested();
+}
+
+void Progress::ReportLine(const wxString& step, int percent) {
+    const int quarter = percent / 25;
+    if (quarter == m_lastQuarter && step == m_lastStep)
+        return;
+    m_lastQuarter = quarter;
+    m_lastStep = step;
+    m_reporter.Line(wxString::Format("%s: %d %%  %s", OneLine(m_document), percent, step).Trim());
 }

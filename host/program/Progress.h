@@ -3,17 +3,21 @@
 #include "host/program/Reporter.h"
 #include "plugin/ProgressSink.h"
 
-/// Shows how far one document has come: a bar at a terminal, a line for each step elsewhere.
+/// Shows how far one document has come: a bar at a terminal, elsewhere a line for each
+/// step and each quarter.
 class Progress : public ProgressSink {
 public:
-    /// @param document the document's name, for people
+    /// @param document the document's file name
     Progress(Reporter& reporter, const wxString& document)
         : m_reporter(reporter), m_document(document) {}
 
     bool Report(const wxString& text, int percent) override;
 
 private:
+    void ReportLine(const wxString& step, int percent);
+
     Reporter& m_reporter;
     wxString m_document;
-    wxString m_last;
+    int m_lastQuarter = -1;
+    wxString m_lastStep;
 };

@@ -1,9 +1,13 @@
 #include "host/program/Summary.h"
 
+#include "common/WQServices.h"
+
 #include <map>
 
 void Tell(const Outcome& outcome, Reporter& reporter) {
-    reporter.Line(LineOf(outcome));
+    const wxString line = LineOf(outcome);
+    SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__) << line;
+    reporter.Line(line);
     reporter.Record(RecordOf(outcome));
 }
 

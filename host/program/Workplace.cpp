@@ -2,11 +2,25 @@
 
 #include "host/program/PathText.h"
 
+#include <windows.h>
+
 #include <wx/utils.h>
 
 namespace fs = std::filesystem;
 
 namespace {
+
+constexpr const char* NamePrefix = ".quillon-";
+
+/// Opens the file that marks a workplace as in use; nobody else can while this one has it.
+/// @param disposition CREATE_NEW for one's own, OPEN_EXISTING to see whether another is abandoned
+/// @return null when it cannot be opened; the file is closed with the last copy
+std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
+    const wxString path = ToText(workplace / "in use").value_or(wxString());
+    const HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr,
+                                    disposition, FILE_ATTRIBUTE_NORMAL, nullptr);
+    return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
+}
 
 wxString Because(const std::error_code& error) {
     return wxString::FromUTF8(error.message());
@@ -15,7 +29,7 @@ wxString Because(const std::error_code& error) {
 } // namespace
 
 std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxString& fault) {
-    const std::string prefix = ".quillon-" + std::to_string(wxGetProcessId()) + '-';
+    const std::string prefix = NamePrefix + std::to_string(wxGetProcessId()) + '-';
     std::error_code error;
     for (int number = 0; number < 1000; ++number) { // taken: by a process that was ended
         const fs::path path = outputFolder / (prefix + std::to_string(number));
@@ -28,11 +42,27 @@ std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxStrin
     return std::nullopt;
 }
 
-Workplace::Workplace(Workplace&& other) noexcept : m_path(std::move(other.m_path)) {
+void Workplace::RemoveAbandoned(const fs::path& outputFolder) {
+    std::error_code error;
+    for (fs::directory_iterator entry(outputFolder, error), end; !error && entry != end;
+         entry.increment(error)) {
+        const bool isWorkplace = entry->path().filename().u8string().rfind(NamePrefix, 0) == 0;
+        std::error_code ignored;
+        if (isWorkplace && OpenMark(entry->path(), OPEN_EXISTING))
+            fs::remove_all(entry->path(), ignored);
+    }
+}
+
+Workplace::Workplace(fs::path path)
+    : m_path(std::move(path)), m_mark(OpenMark(m_path, CREATE_NEW)) {}
+
+Workplace::Workplace(Workplace&& other) noexcept
+    : m_path(std::move(other.m_path)), m_mark(std::move(other.m_mark)) {
     other.m_path.clear();
 }
 
 Workplace::~Workplace() {
+    m_mark.reset(); // an open file could not be removed everywhere
     std::error_code ignored;
     if (!m_path.empty())
         fs::remove_all(m_path, ignored);

@@ -3,6 +3,7 @@
 #include <wx/string.h>
 
 #include <filesystem>
+#include <memory>
 #include <optional>
 
 /// A hidden folder in the output folder in which one document is converted, so that an output
@@ -12,6 +13,9 @@ public:
     /// @param fault receives why there is none, for people
     static std::optional<Workplace> Create(const std::filesystem::path& outputFolder,
                                            wxString& fault);
+
+    /// Removes the workplaces of programs that were ended before they could do it.
+    static void RemoveAbandoned(const std::filesystem::path& outputFolder);
 
     Workplace(Workplace&& other) noexcept;
     Workplace& operator=(Workplace&&) = delete;
@@ -27,7 +31,8 @@ public:
     bool Deliver(const wxString& name, const wxString& newName, wxString& fault) const;
 
 private:
-    explicit Workplace(std::filesystem::path path) : m_path(std::move(path)) {}
+    explicit Workplace(std::filesystem::path path);
 
     std::filesystem::path m_path; ///< empty after a move
+    std::shared_ptr<void> m_mark; ///< a file that is open as long as the workplace is in use
 };

@@ -190,7 +190,7 @@ TEST_F(ConvertTest, AnInterruptionFinishesTheDocumentAndReportsTheRest) {
     }
 }
 
-TEST_F(ConvertTest, ASecondInterruptionEndsTheProgram) {
+TEST_F(ConvertTest, ASecondInterruptionEndsTheProgramAndTheNextRunCleansUp) {
     const std::string started = (m_folder / "started").string();
     m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "never").string());
     RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc"})));
@@ -198,7 +198,22 @@ TEST_F(ConvertTest, ASecondInterruptionEndsTheProgram) {
     program.Signal(SIGINT);
     program.Signal(SIGTERM); // two of a kind may arrive as one
     EXPECT_LT(program.Wait().exitCode, 0) << "ended by one of the two";
-    EXPECT_FALSE(fs::exists(fs::path(Out()) / "a.ps"));
+    EXPECT_EQ(Outputs().size(), 1U) << "the hidden folder only";
+    m_folder.Write("b.doc", "script");
+    EXPECT_EQ(Convert({"b.doc"}).exitCode, 0);
+    EXPECT_EQ(Outputs(), Names{"b.ps"});
+}
+
+TEST_F(ConvertTest, RunsIntoOneFolderLeaveEachOthersWorkAlone) {
+    const std::string started = (m_folder / "started").string();
+    m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "go").string());
+    m_folder.Write("b.doc", "script");
+    RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc"})));
+    AwaitFile(started);
+    EXPECT_EQ(Convert({"b.doc"}).exitCode, 0);
+    m_folder.Write("go", "");
+    EXPECT_EQ(program.Wait().exitCode, 0);
+    EXPECT_EQ(Outputs(), (Names{"a.ps", "b.ps"}));
 }
 
 } // namespace
