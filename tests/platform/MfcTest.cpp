@@ -126,6 +126,7 @@ TEST(DispatchDriver, NamesTheValueOfAPropertyPut) {
 }
 
 TEST(DispatchDriver, HandsResultsOverInTheTypeAskedFor) {
+    Callee other; // outlives the one that answers it
     Callee callee;
     COleDispatchDriver driver(&callee, FALSE);
     callee.answer = COleVariant(SHORT{12});
@@ -140,14 +141,13 @@ TEST(DispatchDriver, HandsResultsOverInTheTypeAskedFor) {
     EXPECT_STREQ(L"12", text);
     SysFreeString(text);
 
-    Callee other;
     callee.answer.vt = VT_DISPATCH;
-    callee.answer.pdispVal = &other; // the answer's copy adds the caller's reference
+    callee.answer.pdispVal = &other; // takes the first reference; its copy is the caller's
     LPDISPATCH object = nullptr;
     driver.InvokeHelper(1, DISPATCH_PROPERTYGET, VT_DISPATCH, &object, nullptr);
     EXPECT_EQ(&other, object);
     EXPECT_EQ(2U, other.references);
-    other.references = 1; // taken with the clean-up of the answer
+    object->Release();
     const auto failure = Thrown<COleException>(
         [&] { driver.InvokeHelper(1, DISPATCH_PROPERTYGET, VT_I4, &number, nullptr); });
     ASSERT_TRUE(failure);
