@@ -1,5 +1,7 @@
 #pragma once
 
+#include "standins/office/engine/Heartbeat.h"
+
 #include <string>
 
 namespace standins {
@@ -13,6 +15,7 @@ struct DocumentCopy {
 /// Copies a document into a new file and sums it up on the way, so that the sum tells of the very
 /// bytes that are in the copy even if somebody writes to the document meanwhile.
 /// @param document open for reading; read from its start
-DocumentCopy CopyDocument(int document, const std::string& path);
+/// @param heartbeat beats while the copy goes on
+DocumentCopy CopyDocument(int document, const std::string& path, Heartbeat& heartbeat);
 
 } // namespace standins

@@ -1,6 +1,7 @@
 // The supervisor of one engine run. The server of the Office applications starts it with the
 // channel as descriptor 3 and the document as descriptor 4.
 
+#include "standins/office/engine/Sandbox.h"
 #include "standins/office/engine/Supervision.h"
 
 #include <signal.h>
@@ -27,6 +28,8 @@ int main(int argc, char** argv) {
     IgnoreSignals();
     close_range(DocumentDescriptor + 1, ~0U, 0); // whatever the host left open
     prctl(PR_SET_CHILD_SUBREAPER, 1);            // what the engine starts ends with it
+
+    standins::LimitMemory();
 
     standins::EngineJob job;
     long stall = 0;

@@ -31,9 +31,14 @@ void DenyNetwork() {
         seccomp_load(filter.get());
 }
 
+void LimitMemory() {
+#ifndef __SANITIZE_ADDRESS__ // whose shadow memory takes terabytes of address space
+    Limit(RLIMIT_AS, MostMemory, MostMemory);
+#endif
+}
+
 void LimitResources(TimeLimits limits) {
     Limit(RLIMIT_CORE, 0, 0);
-    Limit(RLIMIT_AS, MostMemory, MostMemory);
     Limit(RLIMIT_FSIZE, LargestFile, LargestFile);
     // Every core busy for the whole time: this clock is for an engine that nobody watches.
     const rlim_t cpuSeconds = static_cast<rlim_t>(limits.total.count()) *

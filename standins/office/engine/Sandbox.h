@@ -9,7 +9,10 @@ namespace standins {
 /// setting against links stands alone.
 void DenyNetwork();
 
-/// Limits what the calling process may use: memory, CPU time, size of a file, no core files.
+/// Limits the memory of the calling process and of what it starts.
+void LimitMemory();
+
+/// Limits what else the calling process may use: CPU time, size of a file, no core files.
 void LimitResources(TimeLimits limits);
 
 } // namespace standins

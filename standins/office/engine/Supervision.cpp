@@ -3,6 +3,7 @@
 #include "standins/office/engine/DocumentCopy.h"
 #include "standins/office/engine/EngineProcess.h"
 #include "standins/office/engine/Failure.h"
+#include "standins/office/engine/PackageKind.h"
 #include "standins/office/engine/Profile.h"
 #include "standins/office/process/ProcessTable.h"
 #include "standins/office/process/WorkFolder.h"
@@ -28,7 +29,7 @@ Message Failure(std::string reason) {
 /// @return the end of the watch: an empty text when the engine has ended by itself, else why it
 /// must be ended
 std::string Watch(const EngineProcess& engine, const WorkFolder& folder, Clocks& clocks,
-                  const TimeLimits& limits, const Channel& server) {
+                  const TimeLimits& limits, const Channel& server, Heartbeat& heartbeat) {
     for (;;) {
         std::array<pollfd, 2> events{
             {{engine.ExitDescriptor(), POLLIN, 0}, {server.Socket(), POLLIN, 0}}};
@@ -42,7 +43,7 @@ std::string Watch(const EngineProcess& engine, const WorkFolder& folder, Clocks&
             return {};
         switch (clocks.Check({CpuTicksOfGroup(engine.Group()), folder.Size()})) {
         case Clocks::State::Running:
-            server.Send(MessageKind::Alive);
+            heartbeat.Beat();
             break;
         case Clocks::State::Stalled:
             return DescribeStall(limits);
@@ -54,14 +55,15 @@ std::string Watch(const EngineProcess& engine, const WorkFolder& folder, Clocks&
 
 /// Runs LibreOffice until it has ended, once more if it asks for it.
 /// @return why it failed; empty when it ended well
-std::string RunEngine(const EngineJob& job, const WorkFolder& folder, const Channel& server) {
+std::string RunEngine(const EngineJob& job, const WorkFolder& folder, const Channel& server,
+                      Heartbeat& heartbeat) {
     Clocks clocks(job.limits);
     int status = 0;
     for (int start = 0; start < 2; ++start) {
         EngineProcess engine(folder, job);
         if (!engine.IsStarted())
             return DescribeError("LibreOffice cannot be started", errno);
-        const std::string ended = Watch(engine, folder, clocks, job.limits, server);
+        const std::string ended = Watch(engine, folder, clocks, job.limits, server, heartbeat);
         status = engine.End();
         if (!ended.empty())
             return ended;
@@ -76,12 +78,15 @@ Message ConvertInFolder(const EngineJob& job, int document, const Channel& serve
     const WorkFolder folder(job.folder);
     if (!folder.IsMade())
         return Failure(DescribeError("the folder " + job.folder + " cannot be made", errno));
-    const DocumentCopy copy = CopyDocument(document, DocumentPath(folder, job));
+    Heartbeat heartbeat(server);
+    const DocumentCopy copy = CopyDocument(document, DocumentPath(folder, job), heartbeat);
     if (copy.error != 0)
         return Failure(DescribeError("it cannot be copied to " + job.folder, copy.error));
+    if (IsPackageOfAnotherKind(DocumentPath(folder, job), job.extension))
+        return Failure("it is a document of another application");
     if (!MakeProfile(folder.Path(), job.program))
         return Failure(DescribeError("LibreOffice's profile cannot be written", errno));
-    std::string failure = RunEngine(job, folder, server);
+    std::string failure = RunEngine(job, folder, server, heartbeat);
     if (!failure.empty())
         return Failure(std::move(failure));
     Descriptor pdf = OpenPdf(PdfPath(folder));

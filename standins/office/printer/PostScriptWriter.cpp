@@ -8,6 +8,7 @@
 #include <poppler.h>
 #include <unistd.h>
 
+#include <cmath>
 #include <memory>
 #include <system_error>
 #include <vector>
@@ -81,7 +82,8 @@ void PrintPage(PopplerPage* page, cairo_surface_t* surface) {
     double width = 0;
     double height = 0;
     poppler_page_get_size(page, &width, &height);
-    cairo_ps_surface_set_size(surface, width, height);
+    // Paper sizes are whole points; cairo would round them up, and A4 would not be A4 any more.
+    cairo_ps_surface_set_size(surface, std::round(width), std::round(height));
     const Context context(cairo_create(surface), cairo_destroy);
     poppler_page_render_for_printing(page, context.get());
     cairo_show_page(context.get());

@@ -30,10 +30,11 @@ EngineResult Failure(const std::string& reason) {
     return {Descriptor(), {}, FromUtf8(reason)};
 }
 
-std::vector<std::string> SupervisorArguments(const DocumentFormat& format,
+std::vector<std::string> SupervisorArguments(const std::string& program,
+                                             const DocumentFormat& format,
                                              const std::string& folder, const TimeLimits& limits) {
     return {
-        "--program=" + ReadEnginePath(),
+        "--program=" + program,
         "--folder=" + folder,
         std::string("--extension=") + format.extension,
         std::string("--import=") + format.importFilter,
@@ -79,14 +80,12 @@ bool WaitForMessage(const Channel& channel, Time::time_point deadline) {
 std::optional<Message> AwaitResult(const Channel& channel, const TimeLimits& limits,
                                    std::string& lost) {
     const Time::time_point end = Time::now() + limits.total + Grace;
-    Time::time_point deadline = end;
-    while (WaitForMessage(channel, deadline)) {
+    while (WaitForMessage(channel, std::min(end, Time::now() + limits.stall + Grace))) {
         std::optional<Message> message = channel.Receive();
         if (!message)
             lost = "LibreOffice's supervisor ended unexpectedly";
         if (!message || message->kind != MessageKind::Alive)
             return message;
-        deadline = std::min(end, Time::now() + limits.stall + Grace);
     }
     lost = "LibreOffice's supervisor stopped responding";
     return std::nullopt;
@@ -103,13 +102,16 @@ void ClearAfter(ChildProcess& supervisor, const std::string& folder) {
 } // namespace
 
 EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format) {
+    const std::string program = ReadEnginePath();
+    if (program.empty())
+        return Failure("LibreOffice is not installed");
     const TimeLimits limits = ReadTimeLimits();
     const std::string folder = WorkFolder::NewPath();
     auto ends = Channel::MakePair();
     if (!ends)
         return CannotStart(errno);
-    std::optional<ChildProcess> supervisor =
-        StartSupervisor(SupervisorArguments(format, folder, limits), ends->second, document);
+    std::optional<ChildProcess> supervisor = StartSupervisor(
+        SupervisorArguments(program, format, folder, limits), ends->second, document);
     if (!supervisor)
         return CannotStart(errno);
     const Channel channel = std::move(ends->first);

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <string>
+#include <utility>
+#include <vector>
+
+/// The bytes of a ZIP archive with the given files.
+std::string ZipArchive(const std::vector<std::pair<std::string, std::string>>& files);
+
+/// A Word document (docx).
+/// @param body the paragraphs, in WordprocessingML
+/// @param relationships further ones of the document, in XML
+std::string WordPackage(const std::string& body, const std::string& relationships = "");
+
+/// A paragraph of a Word document.
+std::string Paragraph(const std::string& text);
+
+/// A workbook (xlsx) with one filled cell.
+std::string WorkbookPackage(const std::string& text);
+
+/// A presentation (pptx) with one slide.
+/// @param contentType "presentation" or, for a ppsx, "slideshow"
+std::string PresentationPackage(const std::string& text, const std::string& contentType);

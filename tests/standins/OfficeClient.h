@@ -1,0 +1,44 @@
+#pragma once
+
+#include <afxdisp.h>
+
+#include <functional>
+#include <string>
+
+/// Word as a client of Office drives it: by DISPID, through MFC's dispatch driver.
+class WordClient {
+public:
+    /// Starts Word; the test fails when it does not start.
+    WordClient();
+
+    COleDispatchDriver Documents();
+    COleDispatchDriver AddDocument();
+    COleDispatchDriver Open(const std::wstring& path);
+    COleDispatchDriver Dialog(LONG index);
+    void PutActivePrinter(const std::wstring& printer);
+    std::wstring ActivePrinter();
+    void Quit();
+
+    COleDispatchDriver application;
+};
+
+/// The arguments of Word's PrintOut, as a print of the whole document into a file has them; a test
+/// changes what it is about.
+struct PrintArguments {
+    explicit PrintArguments(const std::wstring& outputFileName);
+
+    COleVariant background, append, range, outputFileName, from, to, item, copies, pages, pageType,
+        printToFile, collate, activePrinterMacGX, manualDuplexPrint, zoomColumn, zoomRow,
+        zoomPaperWidth, zoomPaperHeight;
+};
+
+void PrintDocument(COleDispatchDriver& document, PrintArguments arguments);
+void CloseDocument(COleDispatchDriver& document);
+
+/// The argument marker of an optional argument that is left out.
+COleVariant LeftOut();
+
+/// What an application raises while `work` runs.
+/// @return the error's description; "0x…" when the call failed without one, and empty when all
+/// went well
+std::wstring RaisedBy(const std::function<void()>& work);
