@@ -1,0 +1,77 @@
+#include "tests/ui/ControlTree.h"
+
+#include <wx/checkbox.h>
+#include <wx/choice.h>
+#include <wx/radiobut.h>
+#include <wx/sizer.h>
+#include <wx/stattext.h>
+
+namespace {
+
+bool IsTicked(const wxWindow* window) {
+    if (const auto* box = dynamic_cast<const wxCheckBox*>(window))
+        return box->GetValue();
+    if (const auto* button = dynamic_cast<const wxRadioButton*>(window))
+        return button->GetValue();
+    return false;
+}
+
+wxString Described(const wxWindow* window) {
+    wxString line(window->GetClassInfo()->GetClassName());
+    if (window->GetId() > 0)
+        line << ' ' << window->GetId();
+    if (const auto* choice = dynamic_cast<const wxChoice*>(window))
+        line << " [" << wxJoin(choice->GetStrings(), '|', '\0') << ']';
+    else if (!window->GetLabel().empty())
+        line << " \"" << window->GetLabel() << '"';
+    if (!window->IsThisEnabled())
+        line << " disabled";
+    if (!window->IsShown())
+        line << " hidden";
+    if (IsTicked(window))
+        line << " ticked";
+    return line;
+}
+
+void Append(const wxWindow* window, int depth, std::vector<std::string>& lines) {
+    for (const wxWindow* child : window->GetChildren()) {
+        lines.push_back(std::string(2 * depth, ' ') + Described(child).utf8_string());
+        Append(child, depth + 1, lines);
+    }
+}
+
+struct FlagName {
+    int flag;
+    const char* name;
+};
+
+const FlagName FlagNames[] = {
+    {wxEXPAND, "EXPAND"},
+    {wxALIGN_CENTER_VERTICAL, "MIDDLE"},
+    {wxALIGN_CENTER_HORIZONTAL, "CENTRE"},
+    {wxALIGN_BOTTOM, "BOTTOM"},
+    {wxLEFT, "left"},
+    {wxRIGHT, "right"},
+    {wxTOP, "top"},
+    {wxBOTTOM, "bottom"},
+};
+
+} // namespace
+
+std::vector<std::string> WindowTree(const wxWindow* window) {
+    std::vector<std::string> lines;
+    Append(window, 0, lines);
+    return lines;
+}
+
+std::vector<std::string> SizerItems(const wxSizer* sizer) {
+    std::vector<std::string> lines;
+    for (const wxSizerItem* item : sizer->GetChildren()) {
+        std::string line = std::to_string(item->GetProportion());
+        for (const FlagName& flag : FlagNames)
+            if ((item->GetFlag() & flag.flag) == flag.flag)
+                line += std::string(" ") + flag.name;
+        lines.push_back(line + " " + std::to_string(item->GetBorder()));
+    }
+    return lines;
+}

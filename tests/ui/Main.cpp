@@ -1,0 +1,23 @@
+#include <wx/app.h>
+#include <wx/init.h>
+#include <wx/log.h>
+
+#include <gtest/gtest.h>
+
+#include <iostream>
+#include <locale>
+
+int main(int argc, char** argv) {
+    std::locale::global(std::locale("C.UTF-8"));
+    testing::InitGoogleTest(&argc, argv);
+    wxApp::SetInstance(new wxApp); // belongs to wxWidgets
+    if (!wxEntryStart(argc, argv) || !wxTheApp->CallOnInit()) {
+        std::cerr << "These tests need a display: run them by ctest, or under xvfb-run.\n";
+        return 2;
+    }
+    wxLog::SetActiveTarget(new wxLogStderr);
+    const int result = RUN_ALL_TESTS();
+    wxTheApp->OnExit();
+    wxEntryCleanup();
+    return result;
+}

@@ -1,0 +1,131 @@
+#include "common/Themer.h"
+#include "tests/ui/ControlTree.h"
+#include "tests/ui/PanelFixture.h"
+#include "ui/ControlIds.h"
+#include "ui/OutputFileType.h"
+
+#include <wx/dcmemory.h>
+#include <wx/sizer.h>
+#include <wx/stattext.h>
+
+#include <gmock/gmock.h>
+
+namespace {
+
+using testing::ElementsAre;
+using testing::ElementsAreArray;
+
+class PanelLayoutTest : public PanelFixture {};
+
+const char* const WholeTree[] = {
+    "wxPanel",
+    "wxStaticText 17000 \"Input file type:\"",
+    "wxStaticText 17001 \".doc, .docx, .xls, .xlsx, .ppt, .pptx, .pps, .ppsx, .pub\"",
+    "wxStaticText 19000 \"Printer name:\"",
+    "wxChoice 19001 [Adobe PDF|Proofer]",
+    "wxStaticText \"PowerPoint settings\"",
+    "wxPanel",
+    "  wxPanel",
+    "    wxStaticText 19002 \"Print:\"",
+    "    wxChoice 19003 [Slides|Handouts|Notes Pages|Outline View]",
+    "    wxStaticText 19004 \"Color/grayscale:\"",
+    "    wxChoice 19005 [Color|Grayscale|Pure Black and White]",
+    "    wxStaticText 19006 \"Handouts\" disabled",
+    "    wxPanel 19007",
+    "    wxStaticText 19008 \"Slides per page:\" disabled",
+    "    wxChoice 19009 [1|2|3|4|6|9] disabled",
+    "    wxStaticText 19010 \"No image\" disabled",
+    "    wxStaticText 19011 \"Order:\" disabled",
+    "    wxRadioButton 19012 \"Horizontal\" disabled ticked",
+    "    wxRadioButton 19013 \"Vertical\" disabled",
+    "    wxStaticText 19014 \"Advanced print options\"",
+    "    wxPanel 19007",
+    "    wxCheckBox 19015 \"Scale to fit paper\"",
+    "    wxCheckBox 19016 \"Print hidden slides\" ticked",
+    "    wxCheckBox 19017 \"Frame slides\"",
+    "    wxCheckBox 19018 \"High quality\"",
+    "    wxCheckBox 19019 \"Print comments and ink markup\" ticked",
+    "wxStaticText \"Output file type\"",
+    "wxPanel",
+    "  wxPanel",
+    "    wxRadioButton 13000 \"PS\" ticked",
+    "    wxRadioButton 13001 \"PDF\"",
+    "    wxStaticText 13004 \"Distiller profile:\" disabled",
+    "    wxChoice 13005 [Press.joboptions|Print.joboptions] disabled",
+    "wxPanel 19020",
+    "  wxStaticText \"Note:\"",
+    "  wxStaticText \"Uncheck 'Rely on system fonts only' in the Adobe PDF Settings for successful "
+    "printing.\"",
+};
+
+TEST_F(PanelLayoutTest, HoldsItsControlsInTheirOrder) {
+    BuildPanel();
+    std::vector<std::string> tree = WindowTree(m_panel);
+    for (std::string& line : tree) // the note wraps where the font makes it
+        std::replace(line.begin(), line.end(), '\n', ' ');
+    EXPECT_THAT(tree, ElementsAreArray(WholeTree));
+}
+
+TEST_F(PanelLayoutTest, PlacesItsBoxesOneBelowTheOther) {
+    BuildPanel();
+    EXPECT_THAT(SizerItems(m_panel->GetSizer()),
+                ElementsAre("0 EXPAND MIDDLE CENTRE 0", "0 EXPAND left right top bottom 5",
+                            "0 EXPAND left right top bottom 5", "0 EXPAND left right top bottom 5",
+                            "0 0", "0 EXPAND BOTTOM left right top bottom 0"));
+    EXPECT_THAT(SizerItems(Find(ControlId::Print)->GetParent()->GetSizer()),
+                testing::Each("0 EXPAND MIDDLE left right top bottom 5"));
+    EXPECT_THAT(SizerItems(Find(ControlId::Print)->GetGrandParent()->GetSizer()),
+                ElementsAre("1 EXPAND left right top bottom 1"));
+    EXPECT_EQ(212, Find(ControlId::Printer)->GetMinWidth());
+    EXPECT_EQ(250, Find(ControlId::DistillerProfile)->GetMinWidth());
+}
+
+TEST_F(PanelLayoutTest, WearsTheThemesColours) {
+    BuildPanel();
+    const Theme& theme = Themer::GetThemeService()->GetTheme("Default");
+    EXPECT_EQ(theme.backgroundColour, m_panel->GetBackgroundColour());
+    int separators = 0;
+    for (const wxWindow* child : Find(ControlId::Print)->GetParent()->GetChildren()) {
+        if (child->GetId() != ControlId::Separator)
+            continue;
+        ++separators;
+        EXPECT_EQ(theme.borderColour, child->GetBackgroundColour());
+    }
+    EXPECT_EQ(2, separators);
+    EXPECT_EQ(theme.borderColour, Find(ControlId::Print)->GetGrandParent()->GetBackgroundColour());
+    EXPECT_EQ(Themer::GetThemeService()->GetTheme("Note").backgroundColour,
+              Find(ControlId::NotePanel)->GetBackgroundColour());
+    EXPECT_EQ(22, m_panel->GetChildren()[0]->GetMinHeight());
+}
+
+TEST_F(PanelLayoutTest, GivesABuildersParentItsSizerWhereAsked) {
+    auto* parent = new wxFrame(nullptr, wxID_ANY, "Parent");
+    const wxSizer* free = OutputFileTypeFunc(parent, true, false);
+    EXPECT_EQ(nullptr, parent->GetSizer());
+    delete free;
+    parent->DestroyChildren();
+    const wxSizer* given = OutputFileTypeFunc(parent, true, true);
+    EXPECT_EQ(given, parent->GetSizer());
+    EXPECT_GE(parent->GetMinWidth(), 250); // fitted to the profile choice
+    parent->Destroy();
+}
+
+void ExpectWholeLabels(const wxWindow* window) {
+    for (wxWindow* child : window->GetChildren()) {
+        if (wxDynamicCast(child, wxStaticText)) {
+            const wxSize needed = child->GetBestSize();
+            const wxSize has = child->GetSize();
+            EXPECT_TRUE(needed.x <= has.x && needed.y <= has.y) << child->GetLabel();
+        }
+        ExpectWholeLabels(child);
+    }
+}
+
+TEST_F(PanelLayoutTest, CutsNoLabelOff) {
+    BuildPanel();
+    m_host->Show();
+    m_host->Layout();
+    ExpectWholeLabels(m_panel);
+}
+
+} // namespace
