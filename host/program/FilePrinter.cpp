@@ -36,7 +36,7 @@ bool AddPrinter() {
     record.pDatatype = Writable(L"RAW");
     record.pComment = Writable(L"Prints into PostScript files");
     record.Attributes = PRINTER_ATTRIBUTE_LOCAL;
-    const HANDLE printer = AddPrinterW(nullptr, 2, reinterpret_cast<LPBYTE>(&record));
+    HANDLE printer = AddPrinterW(nullptr, 2, reinterpret_cast<LPBYTE>(&record));
     if (!printer)
         return GetLastError() == ERROR_PRINTER_ALREADY_EXISTS;
     ClosePrinter(printer);

@@ -8,7 +8,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr std::uintmax_t NextToNothing = 256 * 1024; // bytes
+constexpr std::uintmax_t NextToNothing = 256 << 10; // bytes
 
 wxString Because(const std::error_code& error) {
     return wxString::FromUTF8(error.message());

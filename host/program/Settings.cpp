@@ -12,7 +12,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-constexpr std::uintmax_t LargestFile = 1024 * 1024;
+constexpr std::uintmax_t LargestFile = 1 << 20;
 constexpr int DeepestNesting = 64;
 
 /// The element "UI" that filters find: among a node's children before anything deeper.

@@ -17,8 +17,8 @@ constexpr const char* NamePrefix = ".quillon-";
 /// @return null when it cannot be opened; the file is closed with the last copy
 std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
     const wxString path = ToText(workplace / "in use").value_or(wxString());
-    const HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr,
-                                    disposition, FILE_ATTRIBUTE_NORMAL, nullptr);
+    HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, disposition,
+                              FILE_ATTRIBUTE_NORMAL, nullptr);
     return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
 }
 

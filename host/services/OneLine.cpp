@@ -35,7 +35,7 @@ wxString Escape(wchar_t c) {
     case L'\t':
         return "\\t";
     default:
-        const auto code = static_cast<unsigned>(c);
+        const wxUint32 code = wxUniChar(c).GetValue();
         return wxString::Format(code < 0x100 ? "\\x%02x" : "\\u%04x", code);
     }
 }
@@ -43,7 +43,7 @@ wxString Escape(wchar_t c) {
 } // namespace
 
 wxString OneLine(const wxString& text) {
-    const std::wstring characters = text.ToStdWstring();
+    const std::wstring& characters = text.ToStdWstring();
     wxString line;
     line.reserve(characters.size());
     for (std::size_t i = 0; i < characters.size(); ++i) {

@@ -18,7 +18,7 @@ struct WQTranslations::Catalogues {
 namespace {
 
 constexpr const char* Domain = "quillon";
-constexpr wxFileOffset LargestCatalogue = 16 * 1024 * 1024;
+constexpr wxFileOffset LargestCatalogue = 16 << 20;
 
 wxString DefaultFolder() {
     return wxFileName(wxStandardPaths::Get().GetExecutablePath()).GetPathWithSep() + "locale";
@@ -41,7 +41,7 @@ wxMsgCatalog* ReadCatalogue(const wxString& path) {
 /// Gives a wxTranslations one file, whatever language it asks for.
 class OneFile : public wxTranslationsLoader {
 public:
-    explicit OneFile(wxString path) : m_path(std::move(path)) {}
+    explicit OneFile(const wxString& path) : m_path(path) {}
 
     wxMsgCatalog* LoadCatalog(const wxString& /*domain*/, const wxString& /*language*/) override {
         return ReadCatalogue(m_path);

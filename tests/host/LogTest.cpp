@@ -22,12 +22,13 @@ std::vector<std::string> LinesOf(const std::filesystem::path& file) {
 }
 
 TEST(Log, RecordsOfManyThreadsAndProcessesStayWhole) {
-    constexpr int Processes = 4;
-    constexpr int Threads = 3;
-    constexpr int Records = 400;
+    constexpr std::size_t Processes = 4;
+    constexpr std::size_t Threads = 3;
+    constexpr std::size_t Records = 400;
     const TemporaryFolder folder;
     std::vector<std::unique_ptr<RunningProgram>> writers;
-    for (int process = 0; process < Processes; ++process)
+    writers.reserve(Processes);
+    for (std::size_t process = 0; process < Processes; ++process)
         writers.push_back(std::make_unique<RunningProgram>(std::vector<std::string>{
             LOG_WRITER, (folder / "log").string(), "p" + std::to_string(process),
             std::to_string(Threads), std::to_string(Records)}));
@@ -42,7 +43,7 @@ TEST(Log, RecordsOfManyThreadsAndProcessesStayWhole) {
         ASSERT_TRUE(std::regex_match(line, match, form)) << line;
         EXPECT_TRUE(marks.insert(match[1]).second) << "twice: " << line;
     }
-    EXPECT_EQ(marks.size(), std::size_t{Processes * Threads * Records});
+    EXPECT_EQ(marks.size(), Processes * Threads * Records);
 }
 
 TEST(Log, APieceOfAnyKindMakesOneLineWithItsPlace) {

@@ -4,12 +4,12 @@
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
-#include <signal.h>
 #include <spawn.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <chrono>
+#include <csignal>
 #include <sstream>
 #include <thread>
 
@@ -19,6 +19,7 @@ namespace {
 
 pid_t Spawn(const std::vector<std::string>& command, const fs::path& folder) {
     std::vector<char*> arguments;
+    arguments.reserve(command.size() + 1);
     for (const std::string& argument : command)
         arguments.push_back(const_cast<char*>(argument.c_str()));
     arguments.push_back(nullptr);
