@@ -28,7 +28,12 @@ std::string ContentTypes(const std::vector<std::pair<std::string, std::string>>&
                       "<Default Extension=\"rels\" ContentType=\""
                       "application/vnd.openxmlformats-package.relationships+xml\"/>";
     for (const auto& [name, type] : parts)
-        xml += "<Override PartName=\"" + name + "\" ContentType=\"" + Types + type + "+xml\"/>";
+        xml.append("<Override PartName=\"")
+            .append(name)
+            .append("\" ContentType=\"")
+            .append(Types)
+            .append(type)
+            .append("+xml\"/>");
     return xml + "</Types>";
 }
 

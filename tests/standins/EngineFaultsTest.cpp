@@ -5,14 +5,13 @@
 #include "tests/standins/Processes.h"
 
 #include <gmock/gmock.h>
-#include <signal.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <thread>
 
 using testing::HasSubstr;
-using testing::StartsWith;
 using namespace std::chrono_literals;
 
 namespace {
@@ -50,7 +49,7 @@ protected:
                 kill(found, number);
         });
         WordClient word;
-        const std::wstring raised = RaisedBy([&] { word.Open(path); });
+        std::wstring raised = RaisedBy([&] { word.Open(path); });
         other.join();
         EXPECT_GT(found, 0);
         return raised;
@@ -167,6 +166,29 @@ TEST_F(EngineFaultsTest, NothingOutlivesAClientThatIsKilled) {
     kill(client, SIGKILL);
     waitpid(client, nullptr, 0);
     EXPECT_TRUE(Await([&] { return Leftovers().empty(); })) << Leftovers();
+}
+
+TEST_F(EngineFaultsTest, ApplicationsOnSeveralThreadsDoNotMeet) {
+    const FakeEngine engine("case $(cat \"$DOCUMENT\") in *bad*) exit 3;; esac\n" +
+                            FakeEngine::MakePdf());
+    std::vector<std::thread> threads;
+    for (int i = 0; i < 8; ++i)
+        threads.emplace_back([this, i] {
+            CoInitialize(nullptr);
+            {
+                const std::string name = (i % 2 == 0 ? "good" : "bad") + std::to_string(i);
+                const auto path = m_files.Write(name + ".docx", name + std::to_string(getpid()));
+                WordClient word;
+                const std::wstring raised = RaisedBy([&] {
+                    COleDispatchDriver document = word.Open(WidePath(path));
+                    PrintDocument(document, PrintArguments(PathOf(name + ".ps")));
+                });
+                EXPECT_EQ(i % 2 == 0, raised.empty()) << name;
+            }
+            CoUninitialize();
+        });
+    for (std::thread& thread : threads)
+        thread.join();
 }
 
 TEST_F(EngineFaultsTest, ManyDocumentsInARowLeaveNoDescriptorsBehind) {

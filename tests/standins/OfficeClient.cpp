@@ -118,10 +118,10 @@ std::wstring RaisedBy(const std::function<void()>& work) {
     std::wstring description;
     try {
         work();
-    } catch (COleDispatchException* raised) {
+    } catch (COleDispatchException* raised) { // NOLINT(misc-throw-by-value-catch-by-reference)
         description = raised->m_strDescription.GetString();
         raised->Delete();
-    } catch (COleException* failed) {
+    } catch (COleException* failed) { // NOLINT(misc-throw-by-value-catch-by-reference)
         wchar_t code[20];
         std::swprintf(code, std::size(code), L"0x%08X", static_cast<unsigned>(failed->m_sc));
         description = code;

@@ -63,10 +63,11 @@ TEST_F(OutputFaultsTest, WhatIsNoFileIsNotReplaced) {
 }
 
 TEST_F(OutputFaultsTest, AFullFolderKeepsWhatItHas) {
-    const SmallFileSystem fileSystem(m_files / "small", 16 * 1024);
+    const SmallFileSystem fileSystem(m_files / "small", std::size_t{16} << 10);
     NEEDS_MOUNT(fileSystem);
     const fs::path output = m_files.Write("small/out.ps", "An earlier file");
-    m_files.Write("small/other", std::string(12 * 1024, 'x')); // room for one page of memory less
+    m_files.Write("small/other",
+                  std::string(std::size_t{12} << 10, 'x')); // room for one page of memory less
     EXPECT_THAT(Print(output), HasSubstr(L"No space left on device"));
     EXPECT_EQ("An earlier file", ReadBytes(output));
     EXPECT_THAT(NamesIn(m_files / "small"), testing::UnorderedElementsAre("out.ps", "other"));
@@ -83,7 +84,7 @@ TEST_F(OutputFaultsTest, AReadOnlyFolderIsTold) {
 
 TEST_F(OutputFaultsTest, NoRoomForTheEngineIsTold) {
     NEEDS_LIBREOFFICE();
-    const SmallFileSystem fileSystem(m_files / "small", 256 * 1024);
+    const SmallFileSystem fileSystem(m_files / "small", std::size_t{256} << 10);
     NEEDS_MOUNT(fileSystem);
     setenv("TMPDIR", (m_files / "small").c_str(), 1);
     const std::string letter = ReadBytes(SamplePath("letter.docx"));
@@ -100,6 +101,18 @@ TEST_F(OutputFaultsTest, NoRoomForTheEngineIsTold) {
         EXPECT_TRUE(fs::is_empty(m_files / "small"));
     }
     setenv("TMPDIR", m_temporary.Path().c_str(), 1);
+}
+
+TEST_F(OutputFaultsTest, APrintThatTakesTooLongIsEnded) {
+    NEEDS_LIBREOFFICE();
+    WordClient word;
+    COleDispatchDriver document = word.Open(SamplePath("report.docx"));
+    SetLimit(L"TotalSeconds", 1);
+    PrintArguments arguments(PathOf("endless.ps"));
+    arguments.copies = COleVariant(static_cast<SHORT>(32767));
+    EXPECT_THAT(RaisedBy([&] { PrintDocument(document, arguments); }),
+                HasSubstr(L"the PostScript writer took too long"));
+    EXPECT_FALSE(fs::exists(m_files / "endless.ps"));
 }
 
 TEST_F(OutputFaultsTest, PagesThatAreNoPdfCannotBePrinted) {

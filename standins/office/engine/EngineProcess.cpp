@@ -1,16 +1,17 @@
 #include "standins/office/engine/EngineProcess.h"
 
 #include "standins/office/engine/Sandbox.h"
+#include "standins/office/process/ChildProcess.h"
 #include "standins/office/process/ProcessTable.h"
 
 #include <fcntl.h>
-#include <signal.h>
 #include <sys/prctl.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
 #include <cerrno>
+#include <csignal>
 #include <cstdlib>
 #include <vector>
 
@@ -52,14 +53,6 @@ std::vector<std::string> Environment(const WorkFolder& folder) {
     return environment;
 }
 
-std::vector<char*> Pointers(std::vector<std::string>& texts) {
-    std::vector<char*> pointers;
-    for (std::string& text : texts)
-        pointers.push_back(text.data());
-    pointers.push_back(nullptr);
-    return pointers;
-}
-
 void DefaultSignals() {
     for (int number = 1; number < SIGRTMAX; ++number)
         signal(number, SIG_DFL);
@@ -87,8 +80,8 @@ void RedirectOutput(const WorkFolder& folder) {
     RedirectOutput(folder);
     std::vector<std::string> arguments = Arguments(folder, job);
     std::vector<std::string> environment = Environment(folder);
-    const std::vector<char*> argumentPointers = Pointers(arguments);
-    const std::vector<char*> environmentPointers = Pointers(environment);
+    const std::vector<char*> argumentPointers = ExecWords(arguments);
+    const std::vector<char*> environmentPointers = ExecWords(environment);
     if (chdir(folder.Path().c_str()) == 0) {
         DenyNetwork();
         LimitResources(job.limits);

@@ -4,12 +4,12 @@
 #include "standins/office/process/FileBytes.h"
 
 #include <fcntl.h>
-#include <signal.h>
 #include <sys/stat.h>
 #include <sys/statvfs.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <csignal>
 #include <cstring>
 #include <string_view>
 #include <system_error>
@@ -71,7 +71,7 @@ std::string DescribeStatus(int status, const std::string& folder) {
 std::string DescribeMissingPdf(const std::string& log, const std::string& folder) {
     if (IsFull(folder))
         return DescribeFull(folder);
-    constexpr std::size_t LongEnough = 64 * 1024;
+    constexpr std::size_t LongEnough = std::size_t{64} << 10;
     const std::string words = ReadText(log, LongEnough);
     if (words.find("could not be loaded") != std::string::npos)
         return "LibreOffice cannot load it; the file is damaged or not of its type";

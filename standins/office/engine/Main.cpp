@@ -4,11 +4,13 @@
 #include "standins/office/engine/Sandbox.h"
 #include "standins/office/engine/Supervision.h"
 
-#include <signal.h>
 #include <sys/prctl.h>
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <csignal>
+#include <cstdlib>
+#include <exception>
 
 namespace {
 
@@ -22,9 +24,7 @@ void IgnoreSignals() {
         signal(number, SIG_IGN);
 }
 
-} // namespace
-
-int main(int argc, char** argv) {
+int Run(int argc, char** argv) {
     IgnoreSignals();
     close_range(DocumentDescriptor + 1, ~0U, 0); // whatever the host left open
     prctl(PR_SET_CHILD_SUBREAPER, 1);            // what the engine starts ends with it
@@ -47,5 +47,15 @@ int main(int argc, char** argv) {
 
     const standins::Channel server{standins::Descriptor(ChannelDescriptor)};
     standins::Supervise(job, DocumentDescriptor, server);
-    return 0;
+    return EXIT_SUCCESS;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return Run(argc, argv);
+    } catch (const std::exception&) { // the server sees the channel close
+        return EXIT_FAILURE;
+    }
 }

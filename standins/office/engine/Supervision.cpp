@@ -63,7 +63,7 @@ std::string RunEngine(const EngineJob& job, const WorkFolder& folder, const Chan
         EngineProcess engine(folder, job);
         if (!engine.IsStarted())
             return DescribeError("LibreOffice cannot be started", errno);
-        const std::string ended = Watch(engine, folder, clocks, job.limits, server, heartbeat);
+        std::string ended = Watch(engine, folder, clocks, job.limits, server, heartbeat);
         status = engine.End();
         if (!ended.empty())
             return ended;

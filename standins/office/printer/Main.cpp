@@ -4,13 +4,15 @@
 
 #include "standins/office/printer/PostScriptWriter.h"
 
-#include <signal.h>
 #include <sys/prctl.h>
 #include <sys/resource.h>
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
+#include <csignal>
 #include <cstdio>
+#include <cstdlib>
+#include <exception>
 
 namespace {
 
@@ -25,9 +27,7 @@ void LimitResources() {
     setrlimit(RLIMIT_CORE, &none);
 }
 
-} // namespace
-
-int main(int argc, char** argv) {
+int Run(int argc, char** argv) {
     signal(SIGPIPE, SIG_IGN);               // a failing write says so
     signal(SIGXFSZ, SIG_IGN);               // likewise
     prctl(PR_SET_PDEATHSIG, SIGKILL);       // nobody waits for the pages any more
@@ -44,7 +44,18 @@ int main(int argc, char** argv) {
 
     const std::string failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);
     if (failure.empty())
-        return 0;
+        return EXIT_SUCCESS;
     std::fprintf(stderr, "%s\n", failure.c_str());
-    return 1;
+    return EXIT_FAILURE;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return Run(argc, argv);
+    } catch (const std::exception& error) {
+        std::fprintf(stderr, "%s\n", error.what());
+        return EXIT_FAILURE;
+    }
 }

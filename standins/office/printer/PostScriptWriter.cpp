@@ -42,7 +42,7 @@ public:
     int Error() const { return m_error; }
 
 private:
-    static constexpr std::size_t Gathered = 256 * 1024;
+    static constexpr std::size_t Gathered = std::size_t{256} << 10;
 
     cairo_status_t Add(const unsigned char* bytes, unsigned size) {
         m_bytes.insert(m_bytes.end(), bytes, bytes + size);

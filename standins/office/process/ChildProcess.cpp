@@ -3,11 +3,11 @@
 #include "standins/office/process/ProcessTable.h"
 
 #include <fcntl.h>
-#include <signal.h>
 #include <spawn.h>
 #include <sys/wait.h>
 
 #include <cerrno>
+#include <csignal>
 
 namespace standins {
 
@@ -66,15 +66,16 @@ private:
     std::vector<Descriptor> m_copies;
 };
 
-std::vector<char*> Pointers(std::vector<std::string>& texts) {
+} // namespace
+
+std::vector<char*> ExecWords(std::vector<std::string>& words) {
     std::vector<char*> pointers;
-    for (std::string& text : texts)
-        pointers.push_back(text.data());
+    pointers.reserve(words.size() + 1);
+    for (std::string& word : words)
+        pointers.push_back(word.data());
     pointers.push_back(nullptr);
     return pointers;
 }
-
-} // namespace
 
 std::optional<ChildProcess> ChildProcess::Start(const std::string& program,
                                                 const std::vector<std::string>& arguments,
@@ -86,7 +87,7 @@ std::optional<ChildProcess> ChildProcess::Start(const std::string& program,
     words.insert(words.end(), arguments.begin(), arguments.end());
     pid_t id = 0;
     errno = posix_spawn(&id, program.c_str(), given.Get(), SpawnAttributes().Get(),
-                        Pointers(words).data(), environ);
+                        ExecWords(words).data(), environ);
     if (errno != 0)
         return std::nullopt;
     ChildProcess child(id, WatchProcess(id));

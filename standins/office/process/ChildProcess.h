@@ -10,6 +10,10 @@
 
 namespace standins {
 
+/// Words as exec and its like want them: pointers to each, and a null.
+/// @param words must outlive the answer
+std::vector<char*> ExecWords(std::vector<std::string>& words);
+
 /// A helper program started by this process, in a session of its own: it has no terminal, and its
 /// process group has its number. Killed and waited for when the object goes.
 class ChildProcess {

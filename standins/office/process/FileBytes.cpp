@@ -13,7 +13,7 @@
 namespace standins {
 
 int ReadWhole(int file, const TakeBytes& take) {
-    std::vector<char> buffer(64 * 1024);
+    std::vector<char> buffer(std::size_t{64} << 10);
     for (off_t position = 0;;) {
         const ssize_t size = pread(file, buffer.data(), buffer.size(), position);
         if (size < 0 && errno == EINTR)

@@ -11,7 +11,7 @@ namespace {
 
 std::chrono::seconds ReadSeconds(const wchar_t* name, DWORD standard) {
     constexpr DWORD Most = 7 * 24 * 60 * 60; // a week; longer would overflow the clocks some day
-    for (const HKEY root : {HKEY_CURRENT_USER, HKEY_LOCAL_MACHINE}) {
+    for (HKEY root : {HKEY_CURRENT_USER, HKEY_LOCAL_MACHINE}) {
         if (const auto number = RegistryKey::Open(root, SettingsKey).Number(name))
             return std::chrono::seconds(std::clamp<DWORD>(*number, 1, Most));
     }

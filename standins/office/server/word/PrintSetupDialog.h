@@ -8,7 +8,7 @@ namespace standins {
 /// type library; they are reached by their positions.
 class PrintSetupDialog : public AutomationObject {
 public:
-    explicit PrintSetupDialog(SharedSession session)
+    explicit PrintSetupDialog(const SharedSession& session)
         : AutomationObject(session), m_printer(session->printer) {}
 
 protected:
