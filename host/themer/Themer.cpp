@@ -12,7 +12,8 @@ namespace {
 constexpr int ConsolePointSize = 10;
 
 bool HasDesktop() {
-    return wxTheApp && wxTheApp->IsGUI();
+    const wxAppConsole* const app = wxAppConsole::GetInstance(); // wxTheApp believes it is a wxApp
+    return app && app->IsGUI();
 }
 
 bool DesktopIsDark() {
