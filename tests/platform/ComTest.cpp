@@ -118,6 +118,13 @@ TEST_F(Com, AClassObjectServesUntilItIsRevoked) {
     EXPECT_EQ(0U, factory.references);
     EXPECT_EQ(REGDB_E_CLASSNOTREG, Create(RegisteredClass));
     EXPECT_EQ(E_INVALIDARG, CoRevokeClassObject(cookie));
+
+    ASSERT_EQ(S_OK, CoRegisterClassObject(RegisteredClass, &factory, CLSCTX_INPROC_SERVER,
+                                          REGCLS_MULTIPLEUSE, &cookie));
+    void* object = nullptr;
+    EXPECT_EQ(REGDB_E_CLASSNOTREG, CoGetClassObject(RegisteredClass, CLSCTX_LOCAL_SERVER, nullptr,
+                                                    IID_IUnknown, &object));
+    EXPECT_EQ(S_OK, CoRevokeClassObject(cookie));
 }
 
 TEST_F(Com, AClassObjectForSingleUseServesOnce) {

@@ -37,8 +37,9 @@ TEST(Modules, AreLoadedAndUnloaded) {
 }
 
 TEST(Modules, ExportWhatIsTheirOwn) {
-    const HMODULE module = LoadLibraryW(TEST_MODULE);
+    const HMODULE module = LoadLibraryW(TEST_SERVER);
     ASSERT_NE(nullptr, module);
+    EXPECT_NE(nullptr, GetProcAddress(module, "DllCanUnloadNow"));
     for (const char* name : {"NoSuchExport", "memcpy"}) { // the other one is of a library below
         EXPECT_EQ(nullptr, GetProcAddress(module, name)) << name;
         EXPECT_EQ(DWORD{ERROR_PROC_NOT_FOUND}, GetLastError()) << name;

@@ -216,17 +216,6 @@ TEST_F(Storages, WithstandFilesMadeToDoHarm) {
     cyclicChains.MakeChainsCyclic();
     Withstand(m_folder.Write("chains.doc", cyclicChains.Bytes()));
 
-    // Fifty thousand siblings in one line: a reader that goes down step by step runs out of stack.
-    CompoundFile deep;
-    for (int i = 0; i < 50000; ++i) {
-        std::u16string name = u"S";
-        for (int number = i; number > 0; number /= 10)
-            name += static_cast<char16_t>(u'0' + number % 10);
-        deep.AddStream(name, "");
-    }
-    deep.MakeDirectoryDegenerate();
-    Withstand(m_folder.Write("deep.doc", deep.Bytes()));
-
     const std::string bytes = Document().Bytes();
     for (std::size_t size = 0; size < bytes.size(); size += 293)
         Withstand(m_folder.Write("cut.doc", bytes.substr(0, size)));
@@ -238,6 +227,18 @@ TEST_F(Storages, WithstandFilesMadeToDoHarm) {
             claiming.replace(offset, 4, claim, 4);
             Withstand(m_folder.Write("claim.doc", claiming));
         }
+}
+
+TEST_F(Storages, DoNotBelieveInAnAllocationTableLargerThanTheFile) {
+    CompoundFile file;
+    file.AddStream(u"WordDocument", std::string(5000, '\0'));
+    std::string bytes = file.Bytes();
+    bytes.replace(44, 4, std::string("\x00\x00\x20\x00", 4)); // sectors of the table: two million
+    bytes.replace(68, 4,
+                  std::string(4, '\0')); // listed in a sector of zeros, which leads to itself
+    const auto path = m_folder.Write("claim.doc", bytes);
+    std::filesystem::resize_file(path, std::uintmax_t{2} << 30);
+    EXPECT_EQ(STG_E_DOCFILECORRUPT, OpenError(path));
 }
 
 } // namespace
