@@ -228,7 +228,8 @@ std::size_t CompoundFile::FindOrAdd(std::size_t storage, std::u16string_view nam
 
 void CompoundFile::AddStream(std::u16string_view path, std::string_view bytes) {
     std::size_t storage = 0;
-    for (std::size_t slash = path.find(u'/'); slash != std::u16string_view::npos; slash = path.find(u'/')) {
+    for (std::size_t slash = path.find(u'/'); slash != std::u16string_view::npos;
+         slash = path.find(u'/')) {
         storage = FindOrAdd(storage, path.substr(0, slash));
         path.remove_prefix(slash + 1);
     }
