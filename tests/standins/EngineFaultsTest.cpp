@@ -41,7 +41,8 @@ protected:
 
     /// Opens a document, and meanwhile sends a signal to the process that `find` waits for.
     std::wstring OpenAndSignal(const std::wstring& path,
-                               pid_t (*find)(const std::filesystem::path&), int number) {
+                               const std::function<pid_t(const std::filesystem::path&)>& find,
+                               int number) {
         pid_t found = 0;
         std::thread other([&] {
             found = find(m_temporary.Path());
@@ -132,12 +133,18 @@ TEST_F(EngineFaultsTest, TheEngineMayBeKilledOrStoppedAtAnyTime) {
 }
 
 TEST_F(EngineFaultsTest, TheSupervisorMayBeKilledOrStopped) {
-    const FakeEngine engine("setsid sleep 600 &\nwhile :; do :; done");
-    EXPECT_THAT(OpenAndSignal(NewDocument(), AwaitSupervisor, SIGKILL),
+    const auto ready = m_files / "ready";
+    const FakeEngine engine("setsid sleep 600 &\n: > '" + ready.string() +
+                            "'\nwhile :; do :; done");
+    const auto find = [&](const std::filesystem::path& temporary) {
+        Await([&] { return std::filesystem::remove(ready); });
+        return AwaitSupervisor(temporary);
+    };
+    EXPECT_THAT(OpenAndSignal(NewDocument(), find, SIGKILL),
                 HasSubstr(L"supervisor ended unexpectedly"));
     EXPECT_EQ("", Leftovers());
     SetLimit(L"StallSeconds", 1);
-    EXPECT_THAT(OpenAndSignal(NewDocument(), AwaitSupervisor, SIGSTOP),
+    EXPECT_THAT(OpenAndSignal(NewDocument(), find, SIGSTOP),
                 HasSubstr(L"supervisor stopped responding"));
 }
 

@@ -59,11 +59,7 @@ std::string OfficeTest::Leftovers() const {
     }
     for (const pid_t process : ProcessesOf(m_temporary.Path()))
         found += "process " + std::to_string(process) + "\n";
-    for (const std::string& socket : SocketsOfKilledEngines()) {
-        if (m_socketsBefore.count(socket) == 0)
-            found += "socket " + socket + "\n";
-    }
-    return found;
+    return found + NewSockets();
 }
 
 bool IsLibreOfficeInstalled() {
@@ -73,6 +69,23 @@ bool IsLibreOfficeInstalled() {
     if (isRegistered)
         RegCloseKey(key);
     return isRegistered;
+}
+
+/// The sockets have names that do not tell whose they are: one that goes at once may be that of a
+/// test which runs at the same time.
+std::string OfficeTest::NewSockets() const {
+    std::string found;
+    Await(
+        [&] {
+            found.clear();
+            for (const std::string& socket : SocketsOfKilledEngines()) {
+                if (m_socketsBefore.count(socket) == 0)
+                    found += "socket " + socket + "\n";
+            }
+            return found.empty();
+        },
+        std::chrono::seconds(1));
+    return found;
 }
 
 std::wstring WidePath(const fs::path& path) {

@@ -35,6 +35,8 @@ protected:
     std::optional<TestPrinter> m_printer;
 
 private:
+    std::string NewSockets() const;
+
     std::set<std::string> m_socketsBefore;
 };
 

@@ -5,8 +5,9 @@
 #include <ole2.h>
 #include <windows.h>
 
+#include <gmock/gmock.h>
+
 #include <cstdlib>
-#include <regex>
 
 namespace fs = std::filesystem;
 
@@ -81,8 +82,8 @@ TEST_F(RegistrationTest, EntersEveryApplicationThatLibreOfficeServes) {
 
 TEST_F(RegistrationTest, TellsWhichEngineThereIs) {
     NEEDS_LIBREOFFICE();
-    const std::string engine = Text(HKEY_LOCAL_MACHINE, StandIns, L"Engine");
-    EXPECT_TRUE(std::regex_match(engine, std::regex("LibreOffice [0-9]+\\.[0-9.]+"))) << engine;
+    EXPECT_THAT(Text(HKEY_LOCAL_MACHINE, StandIns, L"Engine"),
+                testing::MatchesRegex("LibreOffice [0-9]+[.][0-9.]+"));
     EXPECT_TRUE(fs::exists(Text(HKEY_LOCAL_MACHINE, StandIns, L"EnginePath") + "/soffice.bin"));
 }
 

@@ -27,7 +27,9 @@ void IgnoreSignals() {
 int Run(int argc, char** argv) {
     IgnoreSignals();
     close_range(DocumentDescriptor + 1, ~0U, 0); // whatever the host left open
-    prctl(PR_SET_CHILD_SUBREAPER, 1);            // what the engine starts ends with it
+    // The engine must not hold the channel: its end would not be seen when the supervisor goes.
+    close_range(ChannelDescriptor, DocumentDescriptor, CLOSE_RANGE_CLOEXEC);
+    prctl(PR_SET_CHILD_SUBREAPER, 1); // what the engine starts ends with it
 
     standins::LimitMemory();
 
