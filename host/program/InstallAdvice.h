@@ -4,5 +4,5 @@
 
 /// What a user of this system installs to have an Office application's documents converted.
 /// @param progId the application's, for instance "Word.Application"; empty for all of them
-/// @return a sentence
+/// @return a sentence; empty when nothing that could be installed serves the application
 wxString InstallAdvice(const wxString& progId);

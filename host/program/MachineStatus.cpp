@@ -25,6 +25,8 @@ OfficeApplication LookFor(const wxString& name) {
     const wxString current =
         RegisteredText(wxRegKey::HKCR, application.progId + "\\CurVer", wxEmptyString);
     application.version = current.AfterLast('.'); // Word.Application.16
+    if (!application.installed)
+        application.advice = InstallAdvice(application.progId);
     return application;
 }
 

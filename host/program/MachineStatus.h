@@ -12,6 +12,7 @@ struct OfficeApplication {
     wxString progId;
     bool installed = false;
     wxString version; ///< the registered one, "16"; may be empty even when installed
+    wxString advice;  ///< what to do to have it; empty when it is installed
 };
 
 /// Something without which documents cannot be converted.

@@ -46,12 +46,13 @@ void TellApplications(const MachineStatus& status, Reporter& reporter) {
     for (const OfficeApplication& application : status.applications) {
         const wxString version =
             application.version.empty() ? wxString("installed") : "version " + application.version;
-        reporter.Line(
-            Entry(application.name, application.installed ? version : wxString("not installed")));
+        const wxString absence = ("not installed. " + application.advice).Trim();
+        reporter.Line(Entry(application.name, application.installed ? version : absence));
         reporter.Record({{"type", "application"},
                          {"name", JsonText(application.name)},
                          {"installed", application.installed},
-                         {"version", JsonText(application.version)}});
+                         {"version", JsonText(application.version)},
+                         {"advice", JsonText(application.advice)}});
     }
     reporter.Line("Engine");
     reporter.Line("  " + (status.engine.empty() ? wxString("none") : OneLine(status.engine)));

@@ -26,6 +26,7 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(applications[0]["name"], "Word");
     EXPECT_EQ(applications[0]["version"], "16");
     EXPECT_EQ(applications[1]["installed"], false);
+    EXPECT_TRUE(Contains(applications[1]["advice"], "libreoffice-calc-nogui"));
 
     std::vector<json> preferred;
     for (const json& printer : run.Records("printer"))

@@ -11,7 +11,6 @@ constexpr Package Packages[] = {
     {"Word.Application", "libreoffice-writer-nogui"},
     {"Excel.Application", "libreoffice-calc-nogui"},
     {"PowerPoint.Application", "libreoffice-impress-nogui"},
-    {"Publisher.Application", "libreoffice-draw-nogui"},
 };
 
 } // namespace
@@ -21,5 +20,5 @@ wxString InstallAdvice(const wxString& progId) {
     for (const Package& package : Packages)
         if (progId.empty() || progId == package.progId)
             packages << ' ' << package.name;
-    return "Install LibreOffice with: apt-get install" + packages;
+    return packages.empty() ? wxString() : "Install LibreOffice with: apt-get install" + packages;
 }
