@@ -31,7 +31,8 @@ void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
         outcome.machineAtFault = true;
     } else if (outcome.code == Result::PrintFailed) {
         outcome.reason = "its application could not open or print it: it may be damaged or "
-                         "protected; --log FILE notes more";
+                         "protected, or need more time than --engine-limit gives";
+        --log FILE notes more ";
     }
 }
 

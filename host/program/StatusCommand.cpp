@@ -46,7 +46,9 @@ void TellApplications(const MachineStatus& status, Reporter& reporter) {
     for (const OfficeApplication& application : status.applications) {
         const wxString version =
             application.version.empty() ? wxString("installed") : "version " + application.version;
-        const wxString absence = ("not installed. " + application.advice).Trim();
+        const wxString absence = application.advice.empty()
+                                     ? wxString("not installed")
+                                     : "not installed. " + application.advice;
         reporter.Line(Entry(application.name, application.installed ? version : absence));
         reporter.Record({{"type", "application"},
                          {"name", JsonText(application.name)},
