@@ -32,7 +32,6 @@ void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
     } else if (outcome.code == Result::PrintFailed) {
         outcome.reason = "its application could not open or print it: it may be damaged or "
                          "protected, or need more time than --engine-limit gives";
-        --log FILE notes more ";
     }
 }
 
