@@ -1,5 +1,6 @@
 #include "host/program/InputCheck.h"
 
+#include "host/program/Because.h"
 #include "host/program/PathText.h"
 #include "plugin/ResultCodes.h"
 
@@ -15,10 +16,6 @@ namespace fs = std::filesystem;
 namespace {
 
 using namespace std::string_view_literals;
-
-wxString Because(const std::error_code& error) {
-    return wxString::FromUTF8(error.message());
-}
 
 wxString KindOf(fs::file_type type) {
     switch (type) {

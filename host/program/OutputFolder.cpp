@@ -1,5 +1,6 @@
 #include "host/program/OutputFolder.h"
 
+#include "host/program/Because.h"
 #include "host/program/PathText.h"
 
 #include <wx/filename.h>
@@ -9,10 +10,6 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr std::uintmax_t NextToNothing = 256 << 10; // bytes
-
-wxString Because(const std::error_code& error) {
-    return wxString::FromUTF8(error.message());
-}
 
 /// A file system that cannot be asked counts as having room.
 bool HasRoom(const fs::path& folder) {

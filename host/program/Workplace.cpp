@@ -1,5 +1,6 @@
 #include "host/program/Workplace.h"
 
+#include "host/program/Because.h"
 #include "host/program/PathText.h"
 
 #include <windows.h>
@@ -20,10 +21,6 @@ std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
     HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, disposition,
                               FILE_ATTRIBUTE_NORMAL, nullptr);
     return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
-}
-
-wxString Because(const std::error_code& error) {
-    return wxString::FromUTF8(error.message());
 }
 
 } // namespace
