@@ -178,8 +178,10 @@ TEST_F(EngineFaultsTest, NothingOutlivesAClientThatIsKilled) {
 TEST_F(EngineFaultsTest, ApplicationsOnSeveralThreadsDoNotMeet) {
     const FakeEngine engine("case $(cat \"$DOCUMENT\") in *bad*) exit 3;; esac\n" +
                             FakeEngine::MakePdf());
+    constexpr int Threads = 8;
     std::vector<std::thread> threads;
-    for (int i = 0; i < 8; ++i)
+    threads.reserve(Threads);
+    for (int i = 0; i < Threads; ++i)
         threads.emplace_back([this, i] {
             CoInitialize(nullptr);
             {

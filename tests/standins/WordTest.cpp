@@ -132,7 +132,14 @@ TEST_F(WordTest, RefusesAPrinterThatIsNotThere) {
                        reinterpret_cast<const BYTE*>(VTS_BSTR), L"Nowhere");
     EXPECT_THAT(RaisedBy(execute), HasSubstr(L"Nowhere"));
     EXPECT_EQ(before, word.ActivePrinter());
-    EXPECT_NE(L"", RaisedBy([&] { word.Dialog(96); }));
+    try {
+        word.Dialog(96);
+        ADD_FAILURE() << "there is such a dialog";
+    } catch (COleDispatchException* raised) { // NOLINT(misc-throw-by-value-catch-by-reference)
+        EXPECT_STREQ(L"Word", raised->m_strSource.GetString());
+        EXPECT_STREQ(L"There is no dialog number 96.", raised->m_strDescription.GetString());
+        raised->Delete();
+    }
 }
 
 TEST_F(WordTest, ADocumentIsOpenUntilItIsClosed) {

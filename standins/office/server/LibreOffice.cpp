@@ -1,12 +1,13 @@
 #include "standins/office/server/LibreOffice.h"
 
-#include "standins/office/process/FileBytes.h"
-
+#include <glib.h>
 #include <unistd.h>
 
 #include <cstdlib>
 #include <filesystem>
+#include <memory>
 #include <sstream>
+#include <string_view>
 
 namespace fs = std::filesystem;
 
@@ -31,21 +32,26 @@ std::optional<fs::path> ProgramFolder() {
 
 /// The value that stands last under a name in one of LibreOffice's settings files: the first may be
 /// the description of the setting, with an empty value.
-std::string LastValue(const std::string& settings, const std::string& name) {
+std::string LastValue(std::string_view settings, const std::string& name) {
     constexpr std::string_view Opening = "<value>";
     const std::size_t found = settings.rfind("oor:name=\"" + name + '"');
     const std::size_t opening = settings.find(Opening, found);
     if (found == std::string::npos || opening == std::string::npos)
         return {};
     const std::size_t start = opening + Opening.size();
-    return settings.substr(start, settings.find('<', start) - start);
+    return std::string(settings.substr(start, settings.find('<', start) - start));
 }
 
-/// Every LibreOffice says its name and version in its main settings file, for its About box.
+/// Every LibreOffice says its version in its main settings file, for its About box. The file has
+/// megabytes and is looked into at each start of a client, so it is mapped and not read.
 std::string NameOf(const fs::path& program) {
-    constexpr std::size_t LongEnough = 16 << 20;
-    const fs::path file = program.parent_path() / "share" / "registry" / "main.xcd";
-    const std::string settings = ReadText(file, LongEnough);
+    const fs::path path = program.parent_path() / "share" / "registry" / "main.xcd";
+    const std::unique_ptr<GMappedFile, decltype(&g_mapped_file_unref)> file(
+        g_mapped_file_new(path.c_str(), FALSE, nullptr), g_mapped_file_unref);
+    if (!file || g_mapped_file_get_length(file.get()) == 0)
+        return "LibreOffice";
+    const std::string_view settings(g_mapped_file_get_contents(file.get()),
+                                    g_mapped_file_get_length(file.get()));
     const std::string version = LastValue(settings, "ooSetupVersionAboutBox");
     return version.empty() ? "LibreOffice" : "LibreOffice " + version;
 }
