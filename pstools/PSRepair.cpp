@@ -5,7 +5,6 @@
 #include <cstring>
 #include <limits>
 #include <memory>
-#include <new>
 
 namespace {
 
@@ -45,6 +44,16 @@ private:
     FileHandle m_file;
 };
 
+struct HeapBlockDeleter {
+    void operator()(char* block) const { HeapFree(GetProcessHeap(), 0, block); }
+};
+using HeapBlock = std::unique_ptr<char, HeapBlockDeleter>;
+
+/// A block as large as a printed file, its bytes not set; null when there is no memory for it.
+HeapBlock AllocateBlock(DWORD size) {
+    return HeapBlock(static_cast<char*>(HeapAlloc(GetProcessHeap(), 0, size)));
+}
+
 bool ReplaceContent(PSRepair::File& file, const void* content, DWORD size) {
     return file.Seek(0) && file.Write(content, size) && file.SetEnd();
 }
@@ -77,7 +86,7 @@ std::int32_t PSRepair::CutToHeader(File& file) {
     if (!file.GetSize(size) || size > std::numeric_limits<DWORD>::max())
         return NoHeader; // what cannot be moved in one piece stays as it is
     const auto restSize = static_cast<DWORD>(size - frontSize);
-    const std::unique_ptr<char[]> rest(new (std::nothrow) char[restSize]);
+    const HeapBlock rest = AllocateBlock(restSize);
     DWORD readSize = 0;
     if (!rest || !file.Seek(frontSize) || !file.Read(rest.get(), restSize, readSize) ||
         readSize != restSize)

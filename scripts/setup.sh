@@ -6,7 +6,7 @@
 build_packages=(
     g++ cmake ninja-build ccache pkg-config
     libwxgtk3.2-dev libgsf-1-dev libcups2-dev libexpat1-dev
-    libpoppler-glib-dev libcairo2-dev
+    libpoppler-glib-dev libcairo2-dev libglib2.0-dev libseccomp-dev
     libcli11-dev nlohmann-json3-dev
     libgtest-dev libgmock-dev libbenchmark-dev
 )
@@ -18,8 +18,9 @@ run_packages=(
     ghostscript
     fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
 )
-test_packages=(poppler-utils)
+test_packages=(poppler-utils xvfb xauth)
 lint_packages=(clang-format clang-tidy)
+bench_packages=(hyperfine python3)
 
 fail() {
     printf '%s\n' "$*" >&2

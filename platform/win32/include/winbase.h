@@ -37,6 +37,11 @@ HMODULE WINAPI LoadLibraryW(LPCWSTR fileName);
 FARPROC WINAPI GetProcAddress(HMODULE module, LPCSTR procName);
 BOOL WINAPI FreeLibrary(HMODULE module);
 
+// The process's heap. It gives null, and no error code, when there is no memory left.
+HANDLE WINAPI GetProcessHeap();
+LPVOID WINAPI HeapAlloc(HANDLE heap, DWORD flags, SIZE_T bytes);
+BOOL WINAPI HeapFree(HANDLE heap, DWORD flags, LPVOID block);
+
 // The process.
 LPWSTR WINAPI GetCommandLineW();
 DWORD WINAPI GetCurrentProcessId();

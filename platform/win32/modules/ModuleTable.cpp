@@ -88,9 +88,12 @@ bool ModuleTable::Release(HMODULE module) {
     return true;
 }
 
-std::string ProgramPath() {
-    std::error_code error;
-    return std::filesystem::read_symlink("/proc/self/exe", error).string();
+const std::string& ProgramPath() {
+    static const std::string path = [] {
+        std::error_code error;
+        return std::filesystem::read_symlink("/proc/self/exe", error).string();
+    }();
+    return path;
 }
 
 } // namespace win32

@@ -49,6 +49,6 @@ private:
 };
 
 /// The full path of the program, in UTF-8.
-std::string ProgramPath();
+const std::string& ProgramPath();
 
 } // namespace win32

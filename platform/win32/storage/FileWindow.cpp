@@ -35,12 +35,20 @@ std::size_t FileWindow::ReadSome(BYTE* target, std::uint64_t offset, std::size_t
 }
 
 const BYTE* FileWindow::At(std::uint64_t offset, std::size_t size) {
-    if (offset < m_start || offset + size > m_start + m_length) {
-        m_buffer.resize(std::max(size, UsualLength));
-        m_start = offset;
-        m_length = ReadSome(m_buffer.data(), offset, m_buffer.size());
+    if (offset > m_size || size > m_size - offset)
+        return nullptr;
+    const auto holds = [=](const Window& window) {
+        return offset >= window.start && offset + size <= window.start + window.length;
+    };
+    auto window = std::find_if(m_windows.begin(), m_windows.end(), holds);
+    if (window == m_windows.end()) {
+        window = m_windows.begin() + static_cast<std::ptrdiff_t>(m_oldest);
+        m_oldest = (m_oldest + 1) % m_windows.size();
+        window->start = offset;
+        window->bytes.resize(std::min<std::uint64_t>(std::max(size, UsualLength), m_size - offset));
+        window->length = ReadSome(window->bytes.data(), offset, window->bytes.size());
     }
-    return size <= m_length ? m_buffer.data() + (offset - m_start) : nullptr;
+    return holds(*window) ? window->bytes.data() + (offset - window->start) : nullptr;
 }
 
 bool FileWindow::ReadInto(BYTE* target, std::uint64_t offset, std::size_t size) const {

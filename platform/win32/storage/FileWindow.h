@@ -2,13 +2,14 @@
 
 #include "platform/win32/files/OpenFile.h"
 
+#include <array>
 #include <memory>
 #include <vector>
 
 namespace win32 {
 
-/// Reads a file through a buffer: the tables of a compound file are many small pieces close
-/// together. Not for two threads at once.
+/// Reads a file through a few buffers: the tables of a compound file are many small pieces close
+/// together, in a few places that take turns. Not for two threads at once.
 class FileWindow {
 public:
     explicit FileWindow(std::shared_ptr<OpenFile> file);
@@ -26,13 +27,18 @@ public:
     void Close() { m_file.reset(); }
 
 private:
+    struct Window {
+        std::uint64_t start = 0;
+        std::size_t length = 0;
+        std::vector<BYTE> bytes;
+    };
+
     std::size_t ReadSome(BYTE* target, std::uint64_t offset, std::size_t size) const;
 
     std::shared_ptr<OpenFile> m_file;
     std::uint64_t m_size;
-    std::uint64_t m_start = 0;
-    std::size_t m_length = 0;
-    std::vector<BYTE> m_buffer;
+    std::array<Window, 4> m_windows;
+    std::size_t m_oldest = 0;
 };
 
 } // namespace win32
