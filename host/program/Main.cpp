@@ -1,3 +1,4 @@
+#include "host/program/Arguments.h"
 #include "host/program/CommandLine.h"
 #include "host/program/ConvertCommand.h"
 #include "host/program/Interruption.h"
@@ -59,7 +60,7 @@ int main(int argc, char** argv) {
         UseUtf8();
         Interruption::Install();
         int exitCode = 0;
-        const std::optional<CommandLine> line = ReadCommandLine(argc, argv, exitCode);
+        const std::optional<CommandLine> line = ReadCommandLine(Arguments(argc, argv), exitCode);
         if (!line)
             return exitCode;
         const wxInitializer toolkit;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <atomic>
+#include <cstdint>
 #include <filesystem>
 #include <string_view>
 
@@ -17,7 +18,7 @@ public:
     /// @return whether it is open; if not, the one before stays
     bool Open(const std::filesystem::path& path);
 
-    bool IsOpen() const { return m_descriptor >= 0; }
+    bool IsOpen() const { return m_file != None; }
 
     /// Does nothing when no file is open. A line that cannot be written is lost: there is nowhere
     /// left to say so.
@@ -28,5 +29,7 @@ public:
     static void AppendToStandardError(std::string_view line);
 
 private:
-    std::atomic<int> m_descriptor{-1};
+    static constexpr std::intptr_t None = -1;
+
+    std::atomic<std::intptr_t> m_file{None}; ///< the system's descriptor or handle
 };

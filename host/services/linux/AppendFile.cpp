@@ -20,7 +20,7 @@ void WriteOnce(int descriptor, std::string_view line) {
 
 AppendFile::~AppendFile() {
     if (IsOpen())
-        close(m_descriptor);
+        close(static_cast<int>(m_file));
 }
 
 bool AppendFile::Open(const std::filesystem::path& path) {
@@ -29,15 +29,15 @@ bool AppendFile::Open(const std::filesystem::path& path) {
         open(path.c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC | O_NONBLOCK, 0666);
     if (descriptor < 0)
         return false;
-    const int before = m_descriptor.exchange(descriptor);
-    if (before >= 0)
-        close(before);
+    const std::intptr_t before = m_file.exchange(descriptor);
+    if (before != None)
+        close(static_cast<int>(before));
     return true;
 }
 
 void AppendFile::Append(std::string_view line) const {
     if (IsOpen())
-        WriteOnce(m_descriptor, line);
+        WriteOnce(static_cast<int>(m_file), line);
 }
 
 void AppendFile::AppendToStandardError(std::string_view line) {

@@ -26,6 +26,8 @@ struct CommandLine {
 };
 
 /// Reads the command line; answers a question for help, or a mistake, itself.
+/// @param arguments without the program's name
 /// @param exitCode receives the code to end with when there is no result
 /// @return nothing when there is no command to run
-std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, int& exitCode);
+std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& arguments,
+                                           int& exitCode);

@@ -121,12 +121,14 @@ bool TakesValue(const CLI::App& app, const std::string& name) {
 
 /// The arguments, last one first as CLI11 wants them. It takes a PATH like "[a,b]" for a list, but
 /// not the same one behind "./".
-std::vector<std::string> ArgumentsFor(const CLI::App& app, int argc, const char* const* argv) {
+std::vector<std::string> ArgumentsFor(const CLI::App& app,
+                                      const std::vector<std::string>& given) {
     std::vector<std::string> arguments;
-    for (int i = argc - 1; i > 0; --i) {
-        const std::string argument = argv[i];
+    for (std::size_t i = given.size(); i-- > 0;) {
+        const std::string& argument = given[i];
         const bool list = argument.size() > 1 && argument.front() == '[' && argument.back() == ']';
-        arguments.push_back(list && !TakesValue(app, argv[i - 1]) ? "./" + argument : argument);
+        const bool value = i > 0 && TakesValue(app, given[i - 1]);
+        arguments.push_back(list && !value ? "./" + argument : argument);
     }
     return arguments;
 }
@@ -139,7 +141,8 @@ std::string HelpOf(CLI::App& app) {
 
 } // namespace
 
-std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, int& exitCode) {
+std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& arguments,
+                                           int& exitCode) {
     CommandLine line;
     CLI::App app(Description, "quillon");
     app.set_help_flag("-h,--help", "Print this help");
@@ -149,16 +152,16 @@ std::optional<CommandLine> ReadCommandLine(int argc, const char* const* argv, in
     for (CLI::App* const command : app.get_subcommands({}))
         command->set_help_flag();
     try {
-        if (argc < 2)
+        if (arguments.empty())
             throw CLI::RequiredError("A command");
-        app.parse(ArgumentsFor(app, argc, argv));
+        app.parse(ArgumentsFor(app, arguments));
         return line;
     } catch (const CLI::CallForHelp&) {
         std::cout << HelpOf(app) << std::flush;
         exitCode = static_cast<int>(ExitCode::Done);
     } catch (const CLI::ParseError& error) {
         exitCode = static_cast<int>(ExitCode::WrongUsage);
-        if (argc < 2)
+        if (arguments.empty())
             std::cerr << HelpOf(app) << std::flush;
         else
             std::cerr << "quillon: " << error.what() << "\nSee quillon --help.\n" << std::flush;

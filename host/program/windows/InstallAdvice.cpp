@@ -1,0 +1,6 @@
+#include "host/program/InstallAdvice.h"
+
+wxString InstallAdvice(const wxString& progId) {
+    return progId.empty() ? wxString("Install Microsoft Office")
+                          : "Install Microsoft " + progId.BeforeFirst('.');
+}

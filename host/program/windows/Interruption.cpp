@@ -1,0 +1,42 @@
+#include "host/program/Interruption.h"
+
+#include <windows.h>
+
+#include <atomic>
+
+namespace {
+
+std::atomic<bool> g_requested{false};
+
+constexpr char Note[] =
+    "\nquillon: finishing the document under way; a second Ctrl-C ends at once\n";
+
+void WriteNote() {
+    DWORD written = 0;
+    WriteFile(GetStdHandle(STD_ERROR_HANDLE), Note, sizeof Note - 1, &written, nullptr);
+}
+
+/// Runs on a thread of the system's.
+BOOL WINAPI OnRequest(DWORD kind) {
+    const bool again = g_requested.exchange(true);
+    if (kind == CTRL_C_EVENT || kind == CTRL_BREAK_EVENT) {
+        if (again)
+            return FALSE; // the system's own answer: the process ends
+        WriteNote();
+        return TRUE;
+    }
+    // The window closes or the user logs off: the process ends when this returns, and by force a
+    // few seconds later. Until then the document under way may be finished.
+    Sleep(INFINITE);
+    return TRUE;
+}
+
+} // namespace
+
+void Interruption::Install() {
+    SetConsoleCtrlHandler(OnRequest, TRUE);
+}
+
+bool Interruption::Requested() {
+    return g_requested;
+}
