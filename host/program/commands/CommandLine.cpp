@@ -1,7 +1,7 @@
-#include "host/program/CommandLine.h"
+#include "host/program/commands/CommandLine.h"
 
 #include "host/program/ExitCode.h"
-#include "host/program/SettingsKeys.h"
+#include "host/program/settings/RunSettings.h"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
@@ -121,8 +121,7 @@ bool TakesValue(const CLI::App& app, const std::string& name) {
 
 /// The arguments, last one first as CLI11 wants them. It takes a PATH like "[a,b]" for a list, but
 /// not the same one behind "./".
-std::vector<std::string> ArgumentsFor(const CLI::App& app,
-                                      const std::vector<std::string>& given) {
+std::vector<std::string> ArgumentsFor(const CLI::App& app, const std::vector<std::string>& given) {
     std::vector<std::string> arguments;
     for (std::size_t i = given.size(); i-- > 0;) {
         const std::string& argument = given[i];

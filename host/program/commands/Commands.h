@@ -1,12 +1,20 @@
 #pragma once
 
-#include "host/program/CommandLine.h"
 #include "host/program/ExitCode.h"
-#include "host/program/Reporter.h"
+#include "host/program/commands/CommandLine.h"
+#include "host/program/report/Reporter.h"
 
 #include <filesystem>
 
-/// `quillon convert`: converts document by document, each screened right before, so that what
-/// screening has loaded is still at hand.
+// The program's commands. Each answers with the code to end with.
+
+/// `quillon status`: says what there is to convert with, and what is missing.
+ExitCode RunStatus(const std::filesystem::path& filtersFolder, Reporter& reporter);
+
+/// `quillon screen`: says of each file whether it can be converted.
+ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                   Reporter& reporter);
+
+/// `quillon convert`: converts documents into a folder.
 ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filtersFolder,
                     Reporter& reporter);

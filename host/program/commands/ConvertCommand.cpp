@@ -1,11 +1,10 @@
-#include "host/program/ConvertCommand.h"
-
-#include "host/program/Conversion.h"
-#include "host/program/Interruption.h"
 #include "host/program/PathText.h"
-#include "host/program/RunSettings.h"
-#include "host/program/Summary.h"
-#include "host/program/Workplace.h"
+#include "host/program/commands/Commands.h"
+#include "host/program/documents/Conversion.h"
+#include "host/program/documents/Workplace.h"
+#include "host/program/report/OutcomeReport.h"
+#include "host/program/settings/RunSettings.h"
+#include "host/program/system/Interruption.h"
 
 #include <chrono>
 

@@ -1,9 +1,8 @@
-#include "host/program/ScreenCommand.h"
-
-#include "host/program/Interruption.h"
-#include "host/program/Screening.h"
-#include "host/program/Settings.h"
-#include "host/program/Summary.h"
+#include "host/program/commands/Commands.h"
+#include "host/program/documents/Screening.h"
+#include "host/program/report/OutcomeReport.h"
+#include "host/program/settings/Settings.h"
+#include "host/program/system/Interruption.h"
 
 ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,
                    Reporter& reporter) {

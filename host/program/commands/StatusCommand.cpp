@@ -1,8 +1,7 @@
-#include "host/program/StatusCommand.h"
-
-#include "host/program/FilterSet.h"
-#include "host/program/MachineStatus.h"
 #include "host/program/PathText.h"
+#include "host/program/commands/Commands.h"
+#include "host/program/filters/FilterSet.h"
+#include "host/program/machine/MachineStatus.h"
 #include "host/services/OneLine.h"
 
 namespace {

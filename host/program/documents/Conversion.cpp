@@ -1,8 +1,8 @@
-#include "host/program/Conversion.h"
+#include "host/program/documents/Conversion.h"
 
 #include "host/program/PathText.h"
-#include "host/program/Progress.h"
-#include "host/program/Workplace.h"
+#include "host/program/documents/Workplace.h"
+#include "host/program/report/Progress.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>

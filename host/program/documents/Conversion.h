@@ -1,8 +1,8 @@
 #pragma once
 
-#include "host/program/OutputFolder.h"
-#include "host/program/Reporter.h"
-#include "host/program/Screening.h"
+#include "host/program/documents/OutputFolder.h"
+#include "host/program/documents/Screening.h"
+#include "host/program/report/Reporter.h"
 
 /// Converts a screened document into the output folder.
 /// @param screened accepted by a filter

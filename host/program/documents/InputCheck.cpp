@@ -1,6 +1,5 @@
-#include "host/program/InputCheck.h"
+#include "host/program/documents/InputCheck.h"
 
-#include "host/program/Because.h"
 #include "host/program/PathText.h"
 #include "plugin/ResultCodes.h"
 

@@ -1,4 +1,4 @@
-#include "host/program/Inputs.h"
+#include "host/program/documents/Inputs.h"
 
 #include "host/program/PathText.h"
 

@@ -1,13 +1,9 @@
 #pragma once
 
-#include "host/program/ExitCode.h"
-#include "host/program/Reporter.h"
-
 #include <wx/string.h>
 
 #include <filesystem>
 #include <optional>
-#include <vector>
 
 /// How far a file has come.
 enum class State {
@@ -36,13 +32,3 @@ const char* NameOf(State state);
 
 /// Whether a result code says that something is missing on the machine.
 bool IsMachineCode(int code);
-
-/// The outcome as a line for people.
-wxString LineOf(const Outcome& outcome);
-
-/// The outcome as a record of type "document".
-Json RecordOf(const Outcome& outcome);
-
-/// The exit code of a command that came to these outcomes: an interruption outweighs a fault of
-/// the machine, and that a document's.
-ExitCode Verdict(const std::vector<Outcome>& outcomes);

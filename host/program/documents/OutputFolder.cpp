@@ -1,6 +1,5 @@
-#include "host/program/OutputFolder.h"
+#include "host/program/documents/OutputFolder.h"
 
-#include "host/program/Because.h"
 #include "host/program/PathText.h"
 
 #include <wx/filename.h>

@@ -1,8 +1,8 @@
-#include "host/program/Screening.h"
+#include "host/program/documents/Screening.h"
 
-#include "host/program/InputCheck.h"
-#include "host/program/MachineStatus.h"
 #include "host/program/PathText.h"
+#include "host/program/documents/InputCheck.h"
+#include "host/program/machine/MachineStatus.h"
 #include "plugin/ResultCodes.h"
 
 namespace {
@@ -69,18 +69,4 @@ wxString MachineReason() {
     for (const MissingPart& part : LookAtMachine().missing)
         reason << (reason.empty() ? "" : "; ") << part.what << ". " << part.advice;
     return reason.empty() ? "its application is missing or too old: see `quillon status`" : reason;
-}
-
-std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
-                                   Reporter& reporter) {
-    if (filters.Filters().empty()) {
-        reporter.Error("no filter could be loaded; `quillon status` shows where they are looked "
-                       "for. Install the program anew");
-        return ExitCode::MachineAtFault;
-    }
-    if (inputs.empty()) {
-        reporter.Line("Nothing to do: there are no files directly in what was named.");
-        return ExitCode::Done;
-    }
-    return std::nullopt;
 }

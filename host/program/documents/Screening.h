@@ -1,8 +1,8 @@
 #pragma once
 
-#include "host/program/FilterSet.h"
-#include "host/program/Inputs.h"
-#include "host/program/Outcome.h"
+#include "host/program/documents/Inputs.h"
+#include "host/program/documents/Outcome.h"
+#include "host/program/filters/FilterSet.h"
 
 #include <memory>
 
@@ -22,9 +22,3 @@ Outcome NotReached(const FilterSet& filters, const Input& input);
 /// Why something that filters need is missing on this machine, and what to do; for outcomes with
 /// a code of the machine's.
 wxString MachineReason();
-
-/// Ends a run whose filters or arguments leave nothing to do, saying so.
-/// @param inputs what the arguments mean
-/// @return the exit code to end with, or nothing when there is work
-std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
-                                   Reporter& reporter);

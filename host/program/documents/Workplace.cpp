@@ -1,6 +1,5 @@
-#include "host/program/Workplace.h"
+#include "host/program/documents/Workplace.h"
 
-#include "host/program/Because.h"
 #include "host/program/PathText.h"
 
 #include <windows.h>

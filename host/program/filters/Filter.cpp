@@ -1,10 +1,26 @@
-#include "host/program/Filter.h"
+#include "host/program/filters/Filter.h"
 
 #include "common/WQServices.h"
-#include "host/program/ServerInformation.h"
 #include "plugin/ResultCodes.h"
 
 #include <algorithm>
+
+namespace {
+
+constexpr int ServerVersion = 16;
+
+/// The XML text in which the host describes the print server that it submits to, as filters expect
+/// it at their initialisation.
+wxString ServerInformation() {
+    return wxString::Format("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+                            "<ServerInformation>\n"
+                            "  <ServerName>Marlo</ServerName>\n"
+                            "  <ServerVersion>%d</ServerVersion>\n"
+                            "</ServerInformation>\n",
+                            ServerVersion);
+}
+
+} // namespace
 
 std::unique_ptr<Filter> Filter::Start(std::unique_ptr<FilterModule> module) {
     PluginInfo info = module->Describe();

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/FilterModule.h"
+#include "host/program/filters/FilterModule.h"
 
 #include <memory>
 

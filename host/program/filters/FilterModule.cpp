@@ -1,4 +1,4 @@
-#include "host/program/FilterModule.h"
+#include "host/program/filters/FilterModule.h"
 
 #include "common/WQServices.h"
 #include "host/program/PathText.h"

@@ -1,6 +1,6 @@
-#include "host/program/FilterSet.h"
+#include "host/program/filters/FilterSet.h"
 
-#include "host/program/ModuleFiles.h"
+#include "host/program/machine/ProgramFiles.h"
 
 FilterSet::FilterSet(const std::filesystem::path& folder) {
     for (const std::filesystem::path& file : ModuleFiles(folder)) {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/Filter.h"
+#include "host/program/filters/Filter.h"
 
 #include <filesystem>
 #include <memory>

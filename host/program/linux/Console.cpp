@@ -1,4 +1,4 @@
-#include "host/program/Terminal.h"
+#include "host/program/system/Console.h"
 
 #include <langinfo.h>
 #include <unistd.h>
@@ -14,4 +14,8 @@ void UseUtf8() {
     std::setlocale(LC_MESSAGES, "");
     if (!std::setlocale(LC_CTYPE, "") || std::strcmp(nl_langinfo(CODESET), "UTF-8") != 0)
         std::setlocale(LC_CTYPE, "C.UTF-8"); // a bare machine has only "C", which is ASCII
+}
+
+std::vector<std::string> Arguments(int argc, const char* const* argv) {
+    return {argv + (argc > 0 ? 1 : 0), argv + argc};
 }

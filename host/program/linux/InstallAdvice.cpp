@@ -1,4 +1,4 @@
-#include "host/program/InstallAdvice.h"
+#include "host/program/system/InstallAdvice.h"
 
 namespace {
 

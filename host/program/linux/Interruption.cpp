@@ -1,4 +1,4 @@
-#include "host/program/Interruption.h"
+#include "host/program/system/Interruption.h"
 
 #include <unistd.h>
 

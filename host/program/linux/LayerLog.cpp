@@ -1,6 +1,5 @@
-#include "host/program/LayerLog.h"
-
 #include "common/WQServices.h"
+#include "host/program/report/LogRoutes.h"
 #include "platform/win32/log/LogSink.h"
 
 void RouteLayerLog() {

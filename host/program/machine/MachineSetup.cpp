@@ -1,11 +1,13 @@
-#include "host/program/MachineSetup.h"
+#include "host/program/machine/MachineSetup.h"
 
 #include "common/WQServices.h"
-#include "host/program/FilePrinter.h"
 #include "host/program/PathText.h"
-#include "host/program/ProgramFolder.h"
-#include "host/program/RegistryNames.h"
-#include "host/program/StandIns.h"
+#include "host/program/machine/Printers.h"
+#include "host/program/machine/ProgramFiles.h"
+#include "host/program/machine/RegistryNames.h"
+
+#include <objbase.h>
+#include <windows.h>
 
 #include <wx/msw/registry.h>
 
@@ -17,6 +19,28 @@ void Enter(wxRegKey::StdKey root, const char* keyName, const char* valueName, co
     if (!key.Create() || !key.SetValue(valueName, value))
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "Cannot enter into the registry: " << keyName << ", " << valueName;
+}
+
+using RegisterServer = HRESULT(STDMETHODCALLTYPE*)();
+
+void Register(const std::filesystem::path& file) {
+    const HMODULE module = LoadLibraryW(ToText(file).value_or(wxString()).wc_str());
+    const auto registerServer = reinterpret_cast<RegisterServer>(reinterpret_cast<void (*)()>(
+        module ? GetProcAddress(module, "DllRegisterServer") : nullptr));
+    const HRESULT result = registerServer ? registerServer() : E_FAIL;
+    if (FAILED(result))
+        SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+            << "The stand-in could not be registered: " << Shown(file)
+            << wxString::Format(", result 0x%08x", static_cast<unsigned>(result));
+    if (module)
+        FreeLibrary(module); // COM loads it again when an application is asked for
+}
+
+/// Lets the Office stand-ins of a folder enter themselves as COM servers, where the system has no
+/// Office of its own. They enter the applications that their engine is there for.
+void RegisterStandIns(const std::filesystem::path& folder) {
+    for (const std::filesystem::path& file : ModuleFiles(folder))
+        Register(file);
 }
 
 } // namespace

@@ -1,7 +1,7 @@
-#include "host/program/MachineStatus.h"
+#include "host/program/machine/MachineStatus.h"
 
-#include "host/program/InstallAdvice.h"
-#include "host/program/RegistryNames.h"
+#include "host/program/machine/RegistryNames.h"
+#include "host/program/system/InstallAdvice.h"
 
 #include <wx/msw/registry.h>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/Printers.h"
+#include "host/program/machine/Printers.h"
 
 #include <wx/string.h>
 

@@ -2,6 +2,7 @@
 
 #include <wx/string.h>
 
+#include <filesystem>
 #include <vector>
 
 /// A printer as the spooler lists it.
@@ -19,3 +20,10 @@ std::vector<Printer> ListPrinters();
 /// @return the Distiller printer, else the file printer of the host, else the first PostScript
 /// printer, else null
 const Printer* PreferredPrinter(const std::vector<Printer>& printers);
+
+/// The PostScript printer of the host's own, which prints to files: a machine needs no other.
+constexpr const wchar_t* FilePrinterName = L"Quillon PostScript File Printer";
+
+/// Puts the file printer into the spooler, if it is not there yet. The log says when that fails.
+/// @param ppd the file that describes it
+void AddFilePrinter(const std::filesystem::path& ppd);

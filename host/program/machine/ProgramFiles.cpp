@@ -1,10 +1,16 @@
-#include "host/program/ModuleFiles.h"
+#include "host/program/machine/ProgramFiles.h"
 
 #include "host/program/PathText.h"
+
+#include <wx/stdpaths.h>
 
 #include <algorithm>
 
 namespace fs = std::filesystem;
+
+fs::path ProgramFolder() {
+    return FromText(wxStandardPaths::Get().GetExecutablePath()).parent_path();
+}
 
 std::vector<fs::path> ModuleFiles(const fs::path& folder) {
     std::vector<fs::path> files;

@@ -1,4 +1,4 @@
-#include "host/program/ToolkitLog.h"
+#include "host/program/report/LogRoutes.h"
 
 #include "common/WQServices.h"
 

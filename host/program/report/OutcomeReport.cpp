@@ -1,8 +1,68 @@
-#include "host/program/Summary.h"
+#include "host/program/report/OutcomeReport.h"
 
 #include "common/WQServices.h"
+#include "host/program/PathText.h"
+#include "host/services/OneLine.h"
 
+#include <algorithm>
+#include <cmath>
 #include <map>
+
+namespace {
+
+std::string HexOf(const std::string& bytes) {
+    std::string hex;
+    for (const char byte : bytes)
+        hex += wxString::Format("%02x", static_cast<unsigned char>(byte)).utf8_string();
+    return hex;
+}
+
+/// The outcome as a line for people.
+wxString LineOf(const Outcome& outcome) {
+    wxString line = Shown(outcome.input);
+    if (!outcome.output.empty())
+        line << " -> " << Shown(outcome.output);
+    line << ": " << NameOf(outcome.state) << ", " << outcome.code << ' ' << OneLine(outcome.text);
+    if (!outcome.reason.empty())
+        line << " (" << OneLine(outcome.reason) << ')';
+    if (outcome.seconds)
+        line << wxString::Format(", %.2f s", *outcome.seconds);
+    return line;
+}
+
+/// The outcome as a record of type "document".
+Json RecordOf(const Outcome& outcome) {
+    Json record = {{"type", "document"}, {"input", outcome.input.u8string()}};
+    if (!ToText(outcome.input)) // JSON is text; this name is not, and must not be lost
+        record["inputBytes"] = HexOf(outcome.input.u8string());
+    record["output"] = outcome.output.empty() ? Json() : Json(outcome.output.u8string());
+    record["state"] = NameOf(outcome.state);
+    record["code"] = outcome.code;
+    record["text"] = JsonText(outcome.text);
+    record["reason"] = JsonText(outcome.reason);
+    record["seconds"] =
+        outcome.seconds ? Json(std::round(*outcome.seconds * 1000.0) / 1000.0) : Json();
+    return record;
+}
+
+/// The exit code of a command that came to these outcomes: an interruption outweighs a fault of
+/// the machine, and that a document's.
+ExitCode Verdict(const std::vector<Outcome>& outcomes) {
+    const auto any = [&outcomes](auto condition) {
+        return std::any_of(outcomes.begin(), outcomes.end(), condition);
+    };
+    if (any([](const Outcome& outcome) { return outcome.state == State::NotConverted; }))
+        return ExitCode::Interrupted;
+    if (any([](const Outcome& outcome) { return outcome.machineAtFault; }))
+        return ExitCode::MachineAtFault;
+    if (any([](const Outcome& outcome) {
+            return outcome.state == State::Refused || outcome.state == State::Failed;
+        }))
+        return ExitCode::DocumentsAtFault;
+    return ExitCode::Done;
+}
+
+} // namespace
 
 void Tell(const Outcome& outcome, Reporter& reporter) {
     const wxString line = LineOf(outcome);
@@ -26,4 +86,18 @@ ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
     reporter.Line(line + '.');
     reporter.Record(record);
     return exitCode;
+}
+
+std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
+                                   Reporter& reporter) {
+    if (filters.Filters().empty()) {
+        reporter.Error("no filter could be loaded; `quillon status` shows where they are looked "
+                       "for. Install the program anew");
+        return ExitCode::MachineAtFault;
+    }
+    if (inputs.empty()) {
+        reporter.Line("Nothing to do: there are no files directly in what was named.");
+        return ExitCode::Done;
+    }
+    return std::nullopt;
 }

@@ -1,6 +1,13 @@
 #pragma once
 
-#include "host/program/Outcome.h"
+#include "host/program/ExitCode.h"
+#include "host/program/documents/Inputs.h"
+#include "host/program/documents/Outcome.h"
+#include "host/program/filters/FilterSet.h"
+#include "host/program/report/Reporter.h"
+
+#include <optional>
+#include <vector>
 
 /// Says one outcome, as a line and as a record.
 void Tell(const Outcome& outcome, Reporter& reporter);
@@ -8,3 +15,9 @@ void Tell(const Outcome& outcome, Reporter& reporter);
 /// Says how many files came to what, as a line and as a record of type "summary".
 /// @return the command's exit code
 ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter);
+
+/// Ends a run whose filters or arguments leave nothing to do, saying so.
+/// @param inputs what the arguments mean
+/// @return the exit code to end with, or nothing when there is work
+std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
+                                   Reporter& reporter);

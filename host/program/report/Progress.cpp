@@ -1,6 +1,6 @@
-#include "host/program/Progress.h"
+#include "host/program/report/Progress.h"
 
-#include "host/program/Interruption.h"
+#include "host/program/system/Interruption.h"
 #include "host/services/OneLine.h"
 
 #include <algorithm>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/Reporter.h"
+#include "host/program/report/Reporter.h"
 #include "plugin/ProgressSink.h"
 
 /// Shows how far one document has come: a bar at a terminal, elsewhere a line for each

@@ -1,6 +1,6 @@
-#include "host/program/Reporter.h"
+#include "host/program/report/Reporter.h"
 
-#include "host/program/Terminal.h"
+#include "host/program/system/Console.h"
 #include "host/services/OneLine.h"
 
 namespace {

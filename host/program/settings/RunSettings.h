@@ -1,12 +1,22 @@
 #pragma once
 
-#include "host/program/CommandLine.h"
 #include "host/program/ExitCode.h"
-#include "host/program/Settings.h"
+#include "host/program/commands/CommandLine.h"
+#include "host/program/settings/Settings.h"
 
 #include <wx/string.h>
 
 #include <optional>
+#include <vector>
+
+/// A setting that filters know.
+struct SettingsKey {
+    const char* name;
+    const char* values;
+    const char* meaning;
+};
+
+const std::vector<SettingsKey>& KnownSettings();
 
 /// Why a run cannot begin.
 struct Obstacle {

@@ -1,7 +1,7 @@
-#include "host/program/Settings.h"
+#include "host/program/settings/Settings.h"
 
 #include "host/program/PathText.h"
-#include "host/program/XmlCheck.h"
+#include "host/program/settings/XmlCheck.h"
 
 #include <wx/log.h>
 #include <wx/mstream.h>

@@ -1,4 +1,4 @@
-#include "host/program/XmlCheck.h"
+#include "host/program/settings/XmlCheck.h"
 
 #include <expat.h>
 

@@ -1,4 +1,4 @@
-#include "host/program/InstallAdvice.h"
+#include "host/program/system/InstallAdvice.h"
 
 wxString InstallAdvice(const wxString& progId) {
     return progId.empty() ? wxString("Install Microsoft Office")

@@ -1,3 +1,3 @@
-#include "host/program/LayerLog.h"
+#include "host/program/report/LogRoutes.h"
 
 void RouteLayerLog() {} // the system keeps its log elsewhere
