@@ -1,7 +1,7 @@
 #include "standins/office/engine/DocumentCopy.h"
 
-#include "standins/office/process/Descriptor.h"
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/Descriptor.h"
+#include "standins/process/FileBytes.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

@@ -1,8 +1,8 @@
 #include "standins/office/engine/EngineProcess.h"
 
 #include "standins/office/engine/Sandbox.h"
-#include "standins/office/process/ChildProcess.h"
-#include "standins/office/process/ProcessTable.h"
+#include "standins/process/ChildProcess.h"
+#include "standins/process/ProcessTable.h"
 
 #include <fcntl.h>
 #include <sys/prctl.h>

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "standins/office/engine/EngineJob.h"
-#include "standins/office/process/Descriptor.h"
-#include "standins/office/process/WorkFolder.h"
+#include "standins/process/Descriptor.h"
+#include "standins/process/WorkFolder.h"
 
 #include <sys/types.h>
 

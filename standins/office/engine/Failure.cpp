@@ -1,7 +1,7 @@
 #include "standins/office/engine/Failure.h"
 
 #include "standins/office/engine/EngineProcess.h"
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/FileBytes.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "standins/office/process/Clocks.h"
-#include "standins/office/process/Descriptor.h"
+#include "standins/process/Clocks.h"
+#include "standins/process/Descriptor.h"
 
 #include <string>
 

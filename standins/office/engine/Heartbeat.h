@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/process/Channel.h"
+#include "standins/process/Channel.h"
 
 #include <chrono>
 

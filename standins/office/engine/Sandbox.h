@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/process/Clocks.h"
+#include "standins/process/Clocks.h"
 
 namespace standins {
 

@@ -5,8 +5,8 @@
 #include "standins/office/engine/Failure.h"
 #include "standins/office/engine/PackageKind.h"
 #include "standins/office/engine/Profile.h"
-#include "standins/office/process/ProcessTable.h"
-#include "standins/office/process/WorkFolder.h"
+#include "standins/process/ProcessTable.h"
+#include "standins/process/WorkFolder.h"
 
 #include <poll.h>
 #include <sys/wait.h>

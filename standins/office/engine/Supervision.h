@@ -1,7 +1,7 @@
 #pragma once
 
 #include "standins/office/engine/EngineJob.h"
-#include "standins/office/process/Channel.h"
+#include "standins/process/Channel.h"
 
 namespace standins {
 

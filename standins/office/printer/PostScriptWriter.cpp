@@ -1,7 +1,7 @@
 #include "standins/office/printer/PostScriptWriter.h"
 
 #include "standins/office/printer/DscText.h"
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/FileBytes.h"
 
 #include <cairo-ps.h>
 #include <fcntl.h>

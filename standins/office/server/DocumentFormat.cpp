@@ -1,6 +1,6 @@
 #include "standins/office/server/DocumentFormat.h"
 
-#include "standins/office/server/Text.h"
+#include "standins/module/Text.h"
 
 #include <glib.h>
 

@@ -1,9 +1,9 @@
 #include "standins/office/server/DocumentLoader.h"
 
+#include "standins/module/Text.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/EngineRun.h"
 #include "standins/office/server/Protection.h"
-#include "standins/office/server/Text.h"
 
 #include <windows.h>
 

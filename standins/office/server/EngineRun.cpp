@@ -1,12 +1,12 @@
 #include "standins/office/server/EngineRun.h"
 
-#include "standins/office/process/Channel.h"
-#include "standins/office/process/ChildProcess.h"
-#include "standins/office/process/ProcessTable.h"
-#include "standins/office/process/WorkFolder.h"
+#include "standins/module/Text.h"
 #include "standins/office/server/Module.h"
 #include "standins/office/server/Settings.h"
-#include "standins/office/server/Text.h"
+#include "standins/process/Channel.h"
+#include "standins/process/ChildProcess.h"
+#include "standins/process/ProcessTable.h"
+#include "standins/process/WorkFolder.h"
 
 #include <fcntl.h>
 #include <poll.h>

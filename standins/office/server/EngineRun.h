@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/server/DocumentFile.h"
+#include "standins/module/DocumentFile.h"
 #include "standins/office/server/DocumentFormat.h"
 
 #include <string>

@@ -1,14 +1,14 @@
 #include "standins/office/server/FilePrinter.h"
 
-#include "standins/office/process/ChildProcess.h"
-#include "standins/office/process/Clocks.h"
-#include "standins/office/process/FileBytes.h"
-#include "standins/office/process/ProcessTable.h"
+#include "standins/module/Text.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/Module.h"
-#include "standins/office/server/NewFile.h"
 #include "standins/office/server/Settings.h"
-#include "standins/office/server/Text.h"
+#include "standins/process/ChildProcess.h"
+#include "standins/process/Clocks.h"
+#include "standins/process/FileBytes.h"
+#include "standins/process/NewFile.h"
+#include "standins/process/ProcessTable.h"
 
 #include <glib.h>
 #include <poll.h>

@@ -1,6 +1,6 @@
 #include "standins/office/server/Module.h"
 
-#include "standins/office/server/Text.h"
+#include "standins/module/Text.h"
 
 #include <windows.h>
 

@@ -1,8 +1,8 @@
 #include "standins/office/server/OpenedDocument.h"
 
+#include "standins/module/Text.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/DocumentLoader.h"
-#include "standins/office/server/Text.h"
 
 namespace standins {
 

@@ -1,6 +1,6 @@
 #include "standins/office/server/PdfCache.h"
 
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/FileBytes.h"
 
 #include <sys/stat.h>
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "standins/office/process/Descriptor.h"
-#include "standins/office/server/DocumentFile.h"
+#include "standins/module/DocumentFile.h"
 #include "standins/office/server/DocumentFormat.h"
+#include "standins/process/Descriptor.h"
 
 #include <list>
 #include <memory>

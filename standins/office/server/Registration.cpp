@@ -1,11 +1,11 @@
 #include "standins/office/server/Registration.h"
 
+#include "standins/module/RegistryKey.h"
+#include "standins/module/Text.h"
 #include "standins/office/server/Applications.h"
 #include "standins/office/server/LibreOffice.h"
 #include "standins/office/server/Module.h"
-#include "standins/office/server/RegistryKey.h"
 #include "standins/office/server/Settings.h"
-#include "standins/office/server/Text.h"
 
 namespace standins {
 

@@ -1,7 +1,7 @@
 #include "standins/office/server/Settings.h"
 
-#include "standins/office/server/RegistryKey.h"
-#include "standins/office/server/Text.h"
+#include "standins/module/RegistryKey.h"
+#include "standins/module/Text.h"
 
 #include <algorithm>
 

@@ -1,6 +1,6 @@
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/FileBytes.h"
 
-#include "standins/office/process/Descriptor.h"
+#include "standins/process/Descriptor.h"
 
 #include <fcntl.h>
 #include <glib.h>

@@ -1,6 +1,6 @@
-#include "standins/office/process/ProcessTable.h"
+#include "standins/process/ProcessTable.h"
 
-#include "standins/office/process/FileBytes.h"
+#include "standins/process/FileBytes.h"
 
 #include <sys/syscall.h>
 #include <sys/wait.h>

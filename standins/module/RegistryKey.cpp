@@ -1,6 +1,6 @@
-#include "standins/office/server/RegistryKey.h"
+#include "standins/module/RegistryKey.h"
 
-#include "standins/office/server/Text.h"
+#include "standins/module/Text.h"
 
 #include <glib.h>
 

@@ -1,4 +1,4 @@
-#include "standins/office/process/Clocks.h"
+#include "standins/process/Clocks.h"
 
 #include <algorithm>
 

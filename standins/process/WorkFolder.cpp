@@ -1,4 +1,4 @@
-#include "standins/office/process/WorkFolder.h"
+#include "standins/process/WorkFolder.h"
 
 #include <glib.h>
 #include <sys/stat.h>

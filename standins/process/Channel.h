@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/process/Descriptor.h"
+#include "standins/process/Descriptor.h"
 
 #include <optional>
 #include <string>

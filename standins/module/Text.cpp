@@ -1,4 +1,4 @@
-#include "standins/office/server/Text.h"
+#include "standins/module/Text.h"
 
 #include <glib.h>
 

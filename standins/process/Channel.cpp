@@ -1,4 +1,4 @@
-#include "standins/office/process/Channel.h"
+#include "standins/process/Channel.h"
 
 #include <sys/socket.h>
 #include <sys/uio.h>

@@ -1,6 +1,6 @@
-#include "standins/office/process/ChildProcess.h"
+#include "standins/process/ChildProcess.h"
 
-#include "standins/office/process/ProcessTable.h"
+#include "standins/process/ProcessTable.h"
 
 #include <fcntl.h>
 #include <spawn.h>

@@ -1,4 +1,4 @@
-#include "standins/office/server/NewFile.h"
+#include "standins/process/NewFile.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>

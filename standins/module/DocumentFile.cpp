@@ -1,6 +1,6 @@
-#include "standins/office/server/DocumentFile.h"
+#include "standins/module/DocumentFile.h"
 
-#include "standins/office/server/Text.h"
+#include "standins/module/Text.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
