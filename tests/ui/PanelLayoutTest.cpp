@@ -112,7 +112,7 @@ TEST_F(PanelLayoutTest, GivesABuildersParentItsSizerWhereAsked) {
 
 void ExpectWholeLabels(const wxWindow* window) {
     for (wxWindow* child : window->GetChildren()) {
-        if (wxDynamicCast(child, wxStaticText)) {
+        if (dynamic_cast<const wxStaticText*>(child) != nullptr) {
             const wxSize needed = child->GetBestSize();
             const wxSize has = child->GetSize();
             EXPECT_TRUE(needed.x <= has.x && needed.y <= has.y) << child->GetLabel();
