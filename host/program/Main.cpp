@@ -3,11 +3,13 @@
 #include "host/program/commands/Commands.h"
 #include "host/program/machine/MachineSetup.h"
 #include "host/program/machine/ProgramFiles.h"
+#include "host/program/report/Language.h"
 #include "host/program/report/LogRoutes.h"
 #include "host/program/system/Console.h"
 #include "host/program/system/Interruption.h"
 #include "host/services/Log.h"
 
+#include <wx/app.h>
 #include <wx/init.h>
 
 #include <exception>
@@ -28,13 +30,25 @@ bool StartLog(const CommandLine& line, Reporter& reporter) {
     return true;
 }
 
+/// @return whether the language asked for is in use
+bool StartLanguage(const CommandLine& line, Reporter& reporter) {
+    wxString fault;
+    const auto wanted =
+        line.language ? std::optional(wxString::FromUTF8(*line.language)) : std::nullopt;
+    if (UseLanguage(wanted, fault))
+        return true;
+    reporter.Error("there are no texts in the language " + *wanted +
+                   "; the languages are: " + fault);
+    return false;
+}
+
 std::filesystem::path FolderOr(const std::optional<std::string>& given, const char* standard) {
     return given ? std::filesystem::absolute(FromArgument(*given)) : ProgramFolder() / standard;
 }
 
 ExitCode Run(const CommandLine& line) {
     Reporter reporter(line.json);
-    if (!StartLog(line, reporter))
+    if (!StartLog(line, reporter) || !StartLanguage(line, reporter))
         return ExitCode::WrongUsage;
     SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds});
     const std::filesystem::path filtersFolder = FolderOr(line.filtersFolder, "Filters");
@@ -45,8 +59,33 @@ ExitCode Run(const CommandLine& line) {
         return RunScreen(line, filtersFolder, reporter);
     case Command::Convert:
         return RunConvert(line, filtersFolder, reporter);
+    case Command::Settings:
+        return RunSettings(line, filtersFolder, reporter);
+    case Command::Worker:
+        return RunWorker(filtersFolder);
     }
     return ExitCode::WrongUsage;
+}
+
+ExitCode RunOnConsole(const CommandLine& line) {
+    if (line.command != Command::Worker)
+        Interruption::Install();
+    const wxInitializer toolkit;
+    return toolkit.IsOk() ? Run(line) : ExitCode::MachineAtFault;
+}
+
+ExitCode RunOnDesktop(const CommandLine& line, int argc, char** argv) {
+    wxApp::SetInstance(new wxApp); // belongs to wxWidgets
+    if (!wxEntryStart(argc, argv) || !wxTheApp->CallOnInit()) {
+        Reporter(line.json).Error("there is no display to show the settings on; run it on a "
+                                  "desktop, or set them with convert --set");
+        return ExitCode::MachineAtFault;
+    }
+    UseUtf8(); // the desktop's toolkit has taken over the environment's word
+    const ExitCode exitCode = Run(line);
+    wxTheApp->OnExit();
+    wxEntryCleanup();
+    return exitCode;
 }
 
 } // namespace
@@ -54,13 +93,12 @@ ExitCode Run(const CommandLine& line) {
 int main(int argc, char** argv) {
     try {
         UseUtf8();
-        Interruption::Install();
         int exitCode = 0;
         const std::optional<CommandLine> line = ReadCommandLine(Arguments(argc, argv), exitCode);
         if (!line)
             return exitCode;
-        const wxInitializer toolkit;
-        return static_cast<int>(toolkit.IsOk() ? Run(*line) : ExitCode::MachineAtFault);
+        return static_cast<int>(line->command == Command::Settings ? RunOnDesktop(*line, argc, argv)
+                                                                   : RunOnConsole(*line));
     } catch (const std::exception& error) { // out of memory, above all
         std::fprintf(stderr, "quillon: %s\n", error.what());
         return static_cast<int>(ExitCode::MachineAtFault);

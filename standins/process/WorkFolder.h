@@ -9,8 +9,9 @@ namespace standins {
 /// output. Its path is also the engine's home folder, so that the engine's processes can be told.
 class WorkFolder {
 public:
+    /// @param kind of engine, part of the name: "office"
     /// @return a path for a work folder that no other run has, in the folder for temporary files
-    static std::string NewPath();
+    static std::string NewPath(const std::string& kind);
 
     /// Makes the folder, for this user alone. IsMade() tells whether it could.
     explicit WorkFolder(std::string path);
@@ -21,13 +22,11 @@ public:
 
     bool IsMade() const { return m_isMade; }
     const std::string& Path() const { return m_path; }
-    std::string ProfileUrl() const;
 
     /// The size of all files in it, in bytes.
     std::uint64_t Size() const;
 
-    /// Removes a work folder, and the socket that LibreOffice makes outside of it and leaves
-    /// behind when it is killed. No process may be at work in it any more.
+    /// Removes a work folder. No process may be at work in it any more.
     static void Remove(const std::string& path);
 
 private:

@@ -1,6 +1,7 @@
 #pragma once
 
-#include <sys/types.h>
+#include "tests/host/Process.h"
+#include "tests/support/TemporaryFolder.h"
 
 #include <filesystem>
 #include <nlohmann/json.hpp>
@@ -9,7 +10,7 @@
 
 /// What a program's run came to.
 struct RunResult {
-    int exitCode = 0; ///< minus the signal that ended it
+    int exitCode = 0; ///< where a signal ended it, minus that
     std::string out;
     std::string err;
 
@@ -24,16 +25,16 @@ class RunningProgram {
 public:
     /// @param command the program's path and its arguments
     explicit RunningProgram(const std::vector<std::string>& command);
-    ~RunningProgram();
-    RunningProgram(const RunningProgram&) = delete;
-    RunningProgram& operator=(const RunningProgram&) = delete;
 
-    void Signal(int signal) const;
+    /// Asks it to end, as Ctrl-C does.
+    void Interrupt() const { m_process.Interrupt(); }
+    /// Asks it to end in the other way that the system has, if it has one.
+    void Terminate() const { m_process.Terminate(); }
     RunResult Wait();
 
 private:
-    pid_t m_process = -1;
-    std::filesystem::path m_folder; ///< holds its output
+    TemporaryFolder m_folder; ///< holds its output
+    Process m_process;
 };
 
 RunResult RunProgram(const std::vector<std::string>& command);

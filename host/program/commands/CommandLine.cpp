@@ -12,6 +12,7 @@
 namespace {
 
 constexpr unsigned LongestSeconds = 24 * 60 * 60;
+constexpr unsigned MostJobs = 64;
 
 constexpr const char* Description =
     "quillon converts Office documents (doc docx xls xlsx ppt pptx pps ppsx pub) into files\n"
@@ -21,32 +22,38 @@ constexpr const char* Notes = R"(
 Files and folders
   A PATH may be a file or a folder, which means the files directly in it; in a folder, files that
   no filter takes are skipped. DIR is created if only itself is missing.
-  An output has the name of its document: letter.docx becomes letter.ps, in place of an older
-  letter.ps. When two documents of one run have the same name, budget.doc and budget.xls, the
-  second keeps its ending: budget.ps and budget.xls.ps; a third becomes budget.xls (2).ps.
+  An output has the name of its document: letter.docx becomes letter.ps and, made of it,
+  letter.pdf, in place of older ones. When two documents of one run have the same name, budget.doc
+  and budget.xls, the second keeps its ending: budget.pdf and budget.xls.pdf; a third becomes
+  budget.xls (2).pdf.
   An output appears in DIR whole or not at all. What a killed run leaves there, a hidden folder
   .quillon-…, goes with the next run.
   Put -- in front of names that begin with a dash.
 
 Settings
-  A settings file is XML with an element UI that has one element for each setting. A --set goes
-  before the file, --printer before both. Without OUTPUTFILETYPEPS the output is PostScript;
-  without PRINTER, the Distiller printer is used or else the program's own file printer.
+  A settings file is XML with an element UI that has one element for each setting; `quillon
+  settings` shows and writes it. A --set goes before the file, and --printer, --ps, --pdf and
+  --profile go before both. Without OUTPUTFILETYPEPS there are PDF files too; without PRINTER, the
+  Distiller printer is used or else the program's own file printer.
 )";
 
 constexpr const char* ExitCodes = R"(
 Exit codes
-  0  done; for status: ready to convert
+  0  done; for status: ready to convert; for settings: saved, or left as they were
   1  some documents were refused or could not be converted
-  2  the machine is at fault: no Office application, no printer, no filter, a full disk
+  2  the machine is at fault: no Office application, no printer, no filter, a full disk; for
+     settings: no display to show them on
   3  wrong usage: the command line, the settings file or the output folder
-  4  interrupted: Ctrl-C, or a request to end, came before all was done. The document under way
-     is finished first; a second Ctrl-C ends the program at once
+  4  interrupted: Ctrl-C, or a request to end, came before all was done. What is under way is
+     finished first; a second Ctrl-C ends the program at once
 
 Output
-  One line for each file when it is done: input, output, state, result code, its text, seconds.
-  With --json, JSON Lines on stdout: records of "type" filter, application, engine, printer,
-  missing, document, summary and error; lines for people then go to stderr.
+  One line for each file when it is done, in the order of the files: input, output, state, result
+  code, its text, seconds. The text is in the language of --lang, or else of LC_ALL, LC_MESSAGES
+  or LANG.
+  With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
+  printer, distiller, panel, missing, document, summary and error; lines for people then go to
+  stderr. The "code" of a document is the same in every language.
 )";
 
 std::string SettingsTable() {
@@ -71,10 +78,32 @@ void AddConvert(CLI::App& app, CommandLine& line) {
     convert->add_option("--printer", line.printer, "The printer to print on")->type_name("NAME");
     convert->add_option("--settings", line.settingsFile, "A file with settings")
         ->type_name("FILE.xml");
+    CLI::Option* const ps = convert->add_flag_callback(
+        "--ps", [&line] { line.pdf = false; }, "Make PostScript files only");
+    convert
+        ->add_flag_callback(
+            "--pdf", [&line] { line.pdf = true; }, "Make PDF files too")
+        ->excludes(ps);
+    convert->add_option("--profile", line.profile, "The Distiller profile of the PDF files")
+        ->type_name("NAME")
+        ->excludes(ps);
+    convert->add_option("-j,--jobs", line.jobs, "How many documents to convert at a time")
+        ->type_name("N")
+        ->check(CLI::Range(1U, MostJobs));
     convert->add_option("--set", line.settings, "One setting; may be given several times")
         ->type_name("KEY=VALUE")
         ->allow_extra_args(false);
     convert->final_callback([&line] { line.command = Command::Convert; });
+}
+
+void AddSettings(CLI::App& app, CommandLine& line) {
+    CLI::App* const settings =
+        app.add_subcommand("settings", "Show the filters' settings in a window and change them:\n"
+                                       "quillon settings --settings FILE.xml");
+    settings->add_option("--settings", line.settingsFile, "The file; if there is none, it is made")
+        ->required()
+        ->type_name("FILE.xml");
+    settings->final_callback([&line] { line.command = Command::Settings; });
 }
 
 void AddCommands(CLI::App& app, CommandLine& line) {
@@ -85,6 +114,9 @@ void AddCommands(CLI::App& app, CommandLine& line) {
     AddPaths(*screen, line);
     screen->final_callback([&line] { line.command = Command::Screen; });
     AddConvert(app, line);
+    AddSettings(app, line);
+    app.add_subcommand("worker")->group("")->final_callback(
+        [&line] { line.command = Command::Worker; }); // see WorkerPool
     app.require_subcommand(1);
     for (CLI::App* const command : app.get_subcommands({}))
         command->fallthrough();
@@ -92,6 +124,8 @@ void AddCommands(CLI::App& app, CommandLine& line) {
 
 void AddCommonOptions(CLI::App& app, CommandLine& line) {
     const CLI::Range seconds(1U, LongestSeconds);
+    app.add_option("--lang", line.language, "The language of texts and windows: de, fr, es, ja, en")
+        ->type_name("LANG");
     app.add_flag("--json", line.json, "Write JSON Lines to stdout, lines for people to stderr");
     app.add_flag("-v,--verbose", line.verbose, "Show the whole log on stderr, not only warnings");
     app.add_option("--log", line.logFile, "Append the whole log to a file")->type_name("FILE");

@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-enum class Command { Status, Screen, Convert };
+enum class Command { Status, Screen, Convert, Settings, Worker };
 
 /// What the command line asks for. Texts and paths are as they were given.
 struct CommandLine {
@@ -13,9 +13,14 @@ struct CommandLine {
 
     std::string out;
     std::optional<std::string> printer;
-    std::optional<std::string> settingsFile;
-    std::vector<std::string> settings; ///< KEY=VALUE
+    std::optional<std::string> settingsFile; ///< of convert and settings
+    std::vector<std::string> settings;       ///< KEY=VALUE
 
+    std::optional<bool> pdf; ///< true for PDF, false for PostScript only
+    std::optional<std::string> profile;
+    unsigned jobs = 1; ///< documents at a time
+
+    std::optional<std::string> language;
     bool json = false;
     bool verbose = false;
     std::optional<std::string> logFile;

@@ -18,3 +18,11 @@ ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filters
 /// `quillon convert`: converts documents into a folder.
 ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filtersFolder,
                     Reporter& reporter);
+
+/// `quillon settings`: shows the filters' settings panels in a window, and stores what is chosen.
+/// Needs a GUI.
+ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                     Reporter& reporter);
+
+/// `quillon worker`: converts what another process of this program asks for; see WorkerPool.
+ExitCode RunWorker(const std::filesystem::path& filtersFolder);

@@ -1,40 +1,107 @@
 #include "host/program/PathText.h"
 #include "host/program/commands/Commands.h"
 #include "host/program/documents/Conversion.h"
+#include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
 #include "host/program/report/OutcomeReport.h"
+#include "host/program/report/Progress.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/system/Interruption.h"
-
-#include <chrono>
+#include "host/program/workers/WorkerPool.h"
 
 namespace {
 
-/// The base name of each input's output, in the inputs' order. Given out beforehand, so that they
-/// do not depend on which documents turn out well.
+/// The base name of each input's output, in the inputs' order; empty for those that are no text,
+/// or no filter's business. Given out beforehand, so that they do not depend on which documents
+/// turn out well.
 std::vector<wxString> AllotNames(const std::vector<Input>& inputs, const FilterSet& filters,
                                  OutputFolder& outputFolder) {
     std::vector<wxString> names;
     for (const Input& input : inputs) {
         const std::optional<wxString> fileName = ToText(input.full.filename());
-        names.push_back(fileName && filters.Claiming(ExtensionOf(input))
+        names.push_back(fileName && ToText(input.given) && filters.Claiming(ExtensionOf(input))
                             ? outputFolder.Allot(*fileName)
                             : wxString());
     }
     return names;
 }
 
-Outcome ConvertOne(const Input& input, const wxString& baseName, const FilterSet& filters,
-                   const OutputFolder& outputFolder, Reporter& reporter) {
-    if (Interruption::Requested())
-        return NotReached(filters, input);
-    const auto start = std::chrono::steady_clock::now();
-    const ScreenedInput screened = Screen(filters, input);
-    Outcome outcome =
-        screened.item ? Convert(screened, outputFolder, baseName, reporter) : screened.outcome;
-    outcome.seconds =
-        std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
-    return outcome;
+/// Tells the outcomes in the order of the inputs, whichever comes first.
+class OrderedReport {
+public:
+    OrderedReport(std::size_t count, Reporter& reporter) : m_arrived(count), m_reporter(reporter) {}
+
+    void Add(std::size_t number, Outcome outcome) {
+        m_arrived[number] = std::move(outcome);
+        for (; m_told.size() < m_arrived.size() && m_arrived[m_told.size()];
+             m_told.push_back(std::move(*m_arrived[m_told.size()])))
+            Tell(*m_arrived[m_told.size()], m_reporter);
+    }
+
+    ExitCode Finish() const { return TellSummary(m_told, m_reporter); }
+
+private:
+    std::vector<std::optional<Outcome>> m_arrived;
+    std::vector<Outcome> m_told;
+    Reporter& m_reporter;
+};
+
+/// What a run works on.
+struct Run {
+    const std::vector<Input>& inputs;
+    const std::vector<wxString>& names;
+    const FilterSet& filters;
+    const OutputFolder& outputFolder;
+};
+
+void ConvertInTurn(const Run& run, Reporter& reporter, OrderedReport& report) {
+    for (std::size_t i = 0; i < run.inputs.size(); ++i) {
+        const Input& input = run.inputs[i];
+        Progress progress(reporter, Shown(input.given.filename()));
+        report.Add(i, Interruption::Requested() ? NotReached(run.filters, input)
+                                                : ConvertInput(input, run.names[i], run.filters,
+                                                               run.outputFolder, progress));
+    }
+}
+
+/// The arguments that make this program a worker of the run.
+std::vector<std::string> WorkerArguments(const CommandLine& line) {
+    std::vector<std::string> arguments = {"worker"};
+    const auto pass = [&arguments](const char* option, const std::optional<std::string>& value) {
+        if (value)
+            arguments.insert(arguments.end(), {option, *value});
+    };
+    const auto text = [](const std::optional<unsigned>& number) {
+        return number ? std::optional(std::to_string(*number)) : std::nullopt;
+    };
+    pass("--filters", line.filtersFolder);
+    pass("--stand-ins", line.standInsFolder);
+    pass("--engine-stall", text(line.stallSeconds));
+    pass("--engine-limit", text(line.limitSeconds));
+    pass("--log", line.logFile);
+    pass("--lang", line.language);
+    if (line.verbose)
+        arguments.emplace_back("--verbose");
+    return arguments;
+}
+
+void ConvertSideBySide(const Run& run, const CommandLine& line, const Settings& settings,
+                       Reporter& reporter, OrderedReport& report) {
+    std::vector<Assignment> assignments;
+    std::vector<std::size_t> numbers; // of the assignments' inputs
+    for (std::size_t i = 0; i < run.inputs.size(); ++i) {
+        if (run.names[i].empty()) { // there is nothing to convert, nor to wait for
+            report.Add(i, Screen(run.filters, run.inputs[i]).outcome);
+            continue;
+        }
+        assignments.push_back({run.inputs[i], run.names[i]});
+        numbers.push_back(i);
+    }
+    WorkerPool pool(WorkerArguments(line), {settings.Xml(), run.outputFolder.Path()}, run.filters,
+                    reporter);
+    pool.Run(assignments, line.jobs, [&](std::size_t assignment, Outcome outcome) {
+        report.Add(numbers[assignment], std::move(outcome));
+    });
 }
 
 } // namespace
@@ -59,12 +126,14 @@ ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filter
         return ExitCode::WrongUsage;
     }
     Workplace::RemoveAbandoned(outputFolder->Path());
-    filters.ApplySettings(settings->Node());
     const std::vector<wxString> names = AllotNames(inputs, filters, *outputFolder);
-    std::vector<Outcome> outcomes;
-    for (std::size_t i = 0; i < inputs.size(); ++i) {
-        outcomes.push_back(ConvertOne(inputs[i], names[i], filters, *outputFolder, reporter));
-        Tell(outcomes.back(), reporter);
+    const Run run = {inputs, names, filters, *outputFolder};
+    OrderedReport report(inputs.size(), reporter);
+    if (line.jobs > 1) {
+        ConvertSideBySide(run, line, *settings, reporter, report);
+    } else {
+        filters.ApplySettings(settings->Node());
+        ConvertInTurn(run, reporter, report);
     }
-    return TellSummary(outcomes, reporter);
+    return report.Finish();
 }

@@ -1,18 +1,20 @@
 #include "host/program/documents/Conversion.h"
 
 #include "host/program/PathText.h"
+#include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
-#include "host/program/report/Progress.h"
+#include "host/program/machine/Distiller.h"
+#include "host/program/system/ConversionTurn.h"
+#include "host/program/system/InstallAdvice.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>
 
+#include <chrono>
+
 namespace fs = std::filesystem;
 
 namespace {
-
-/// The shared table's code for a failure that no filter is to blame for.
-constexpr int ConversionFailed = -1003;
 
 void Fail(int code, const wxString& reason, const Filter& filter, Outcome& outcome) {
     outcome.state = State::Failed;
@@ -28,6 +30,10 @@ void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
         outcome.reason = MachineReason();
     } else if (outputFolder.IsFull()) {
         outcome.reason = "there is no space left for the output or for temporary files";
+        outcome.machineAtFault = true;
+    } else if (outcome.code == Result::PdfConversionFailed && DistillerEngine().empty()) {
+        outcome.reason = "there is nothing to make PDF files with. " + PdfInstallAdvice() +
+                         "; or ask for PostScript with --ps";
         outcome.machineAtFault = true;
     } else if (outcome.code == Result::PrintFailed) {
         outcome.reason = "its application could not open or print it: it may be damaged or "
@@ -53,11 +59,13 @@ bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wx
 
 /// Runs the filter in the workplace and takes over what it made.
 void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const wxString& baseName,
-               Reporter& reporter, Outcome& outcome) {
-    Progress progress(reporter, screened.item->fileName);
+               ProgressSink& progress, Outcome& outcome) {
     wxString outputName;
-    const int code = screened.filter->Convert(
-        *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
+    const int code = [&] {
+        const ConversionTurn turn;
+        return screened.filter->Convert(
+            *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
+    }();
     if (code != Result::Success)
         return Fail(code, {}, *screened.filter, outcome);
     std::error_code error;
@@ -72,18 +80,29 @@ void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const 
         workplace.Path().parent_path() / FromText(baseName + '.' + wxFileName(outputName).GetExt());
 }
 
-} // namespace
-
-Outcome Convert(const ScreenedInput& screened, const OutputFolder& outputFolder,
-                const wxString& baseName, Reporter& reporter) {
+Outcome Convert(const ScreenedInput& screened, const wxString& baseName,
+                const OutputFolder& outputFolder, ProgressSink& progress) {
     Outcome outcome = screened.outcome;
     wxString fault;
     const std::optional<Workplace> workplace = Workplace::Create(outputFolder.Path(), fault);
     if (workplace)
-        RunFilter(screened, *workplace, baseName, reporter, outcome);
+        RunFilter(screened, *workplace, baseName, progress, outcome);
     else
         Fail(ConversionFailed, fault, *screened.filter, outcome);
     if (outcome.state == State::Failed && outcome.reason.empty())
         Explain(outputFolder, outcome);
+    return outcome;
+}
+
+} // namespace
+
+Outcome ConvertInput(const Input& input, const wxString& baseName, const FilterSet& filters,
+                     const OutputFolder& outputFolder, ProgressSink& progress) {
+    const auto start = std::chrono::steady_clock::now();
+    const ScreenedInput screened = Screen(filters, input);
+    Outcome outcome =
+        screened.item ? Convert(screened, baseName, outputFolder, progress) : screened.outcome;
+    outcome.seconds =
+        std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
     return outcome;
 }

@@ -1,12 +1,13 @@
 #pragma once
 
+#include "host/program/documents/Inputs.h"
+#include "host/program/documents/Outcome.h"
 #include "host/program/documents/OutputFolder.h"
-#include "host/program/documents/Screening.h"
-#include "host/program/report/Reporter.h"
+#include "host/program/filters/FilterSet.h"
+#include "plugin/ProgressSink.h"
 
-/// Converts a screened document into the output folder.
-/// @param screened accepted by a filter
+/// Screens a file and, if a filter accepts it, converts it into the output folder.
 /// @param baseName the output's name there, without ending
-/// @return what came of it
-Outcome Convert(const ScreenedInput& screened, const OutputFolder& outputFolder,
-                const wxString& baseName, Reporter& reporter);
+/// @return what came of it, with the time that it took
+Outcome ConvertInput(const Input& input, const wxString& baseName, const FilterSet& filters,
+                     const OutputFolder& outputFolder, ProgressSink& progress);

@@ -27,6 +27,9 @@ struct Outcome {
     std::optional<double> seconds; ///< of screening and conversion
 };
 
+/// The shared table's code for a failure that no filter is to blame for.
+constexpr int ConversionFailed = -1003;
+
 /// The state's name, as people and records have it.
 const char* NameOf(State state);
 

@@ -3,6 +3,8 @@
 #include "common/WQServices.h"
 #include "plugin/ResultCodes.h"
 
+#include <wx/xml/xml.h>
+
 #include <algorithm>
 
 namespace {
@@ -47,6 +49,21 @@ bool Filter::Claims(const wxString& extension) const {
         m_info.extensions.begin(), m_info.extensions.end(), [&extension](const wxString& listed) {
             return extension.IsSameAs(listed, false) || extension.IsSameAs(listed + 'x', false);
         });
+}
+
+wxWindow* Filter::CreatePanel(wxWindow* parent, const wxXmlNode& settings) {
+    m_plugin->LoadSettings(&settings);
+    return m_plugin->CreateSettingsPanel(parent);
+}
+
+std::map<wxString, wxString> Filter::PanelValues() {
+    wxXmlNode parent(wxXML_ELEMENT_NODE, "Settings");
+    m_plugin->SaveSettings(&parent);
+    std::map<wxString, wxString> values;
+    for (const wxXmlNode* ui = parent.GetChildren(); ui; ui = ui->GetNext())
+        for (const wxXmlNode* setting = ui->GetChildren(); setting; setting = setting->GetNext())
+            values[setting->GetName()] = setting->GetNodeContent();
+    return values;
 }
 
 Filter::Screened Filter::Screen(const wxString& path) {

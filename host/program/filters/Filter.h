@@ -2,6 +2,7 @@
 
 #include "host/program/filters/FilterModule.h"
 
+#include <map>
 #include <memory>
 
 /// A filter at work: one module and one plug-in object of it, initialised.
@@ -23,6 +24,14 @@ public:
     bool IsReady() const { return m_plugin->IsReady(); }
 
     void ApplySettings(const wxXmlNode& settings) { m_plugin->ApplySettings(&settings); }
+
+    /// Builds the filter's settings panel.
+    /// @param settings what it shows
+    /// @return the panel, which belongs to `parent`; null when there is none
+    wxWindow* CreatePanel(wxWindow* parent, const wxXmlNode& settings);
+
+    /// The settings as they are in the panel, if there is one.
+    std::map<wxString, wxString> PanelValues();
 
     struct Screened {
         int code = 0;

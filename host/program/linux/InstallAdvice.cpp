@@ -22,3 +22,7 @@ wxString InstallAdvice(const wxString& progId) {
             packages << ' ' << package.name;
     return packages.empty() ? wxString() : "Install LibreOffice with: apt-get install" + packages;
 }
+
+wxString PdfInstallAdvice() {
+    return "Install Ghostscript with: apt-get install ghostscript";
+}

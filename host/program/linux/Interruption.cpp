@@ -10,8 +10,7 @@ namespace {
 
 volatile std::sig_atomic_t g_requested = 0;
 
-constexpr char Note[] =
-    "\nquillon: finishing the document under way; a second Ctrl-C ends at once\n";
+constexpr char Note[] = "\nquillon: finishing what is under way; a second Ctrl-C ends at once\n";
 
 extern "C" void NoteRequest(int signal) {
     if (g_requested != 0) {
@@ -25,7 +24,7 @@ extern "C" void NoteRequest(int signal) {
     errno = error;
 }
 
-extern "C" void IgnoreBrokenPipe(int) {}
+extern "C" void DoNothing(int) {}
 
 void Handle(int signal, void (*handler)(int)) {
     struct sigaction action = {};
@@ -42,7 +41,12 @@ void Interruption::Install() {
         Handle(signal, NoteRequest);
     // A reader of our output that has gone is no reason to leave documents unconverted. A handler,
     // not SIG_IGN, since programs started from here would inherit that.
-    Handle(SIGPIPE, IgnoreBrokenPipe);
+    Handle(SIGPIPE, DoNothing);
+}
+
+void Interruption::LeaveToParent() {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE})
+        Handle(signal, DoNothing);
 }
 
 bool Interruption::Requested() {

@@ -4,12 +4,10 @@
 #include "host/program/PathText.h"
 #include "host/program/machine/Printers.h"
 #include "host/program/machine/ProgramFiles.h"
-#include "host/program/machine/RegistryNames.h"
+#include "host/program/machine/Registry.h"
 
 #include <objbase.h>
 #include <windows.h>
-
-#include <wx/msw/registry.h>
 
 namespace {
 

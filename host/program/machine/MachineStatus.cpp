@@ -1,21 +1,12 @@
 #include "host/program/machine/MachineStatus.h"
 
-#include "host/program/machine/RegistryNames.h"
+#include "host/program/machine/Distiller.h"
+#include "host/program/machine/Registry.h"
 #include "host/program/system/InstallAdvice.h"
-
-#include <wx/msw/registry.h>
 
 #include <algorithm>
 
 namespace {
-
-wxString RegisteredText(wxRegKey::StdKey root, const wxString& keyName, const wxString& valueName) {
-    const wxRegKey key(root, keyName);
-    wxString text;
-    if (key.Exists() && key.HasValue(valueName))
-        key.QueryValue(valueName, text);
-    return text;
-}
 
 OfficeApplication LookFor(const wxString& name) {
     OfficeApplication application;
@@ -38,6 +29,8 @@ std::vector<MissingPart> FindMissing(const MachineStatus& status) {
     if (!PreferredPrinter(status.printers))
         missing.push_back({"There is no PostScript printer",
                            "Install the program anew, which brings one, or add one to the system"});
+    if (status.pdfEngine.empty())
+        missing.push_back({"There is nothing to make PDF files with", PdfInstallAdvice()});
     return missing;
 }
 
@@ -49,6 +42,8 @@ MachineStatus LookAtMachine() {
         status.applications.push_back(LookFor(name));
     status.engine = RegisteredText(wxRegKey::HKLM, StandInsKey, EngineValue);
     status.printers = ListPrinters();
+    status.pdfEngine = DistillerEngine();
+    status.profiles = ListDistillerProfiles();
     status.missing = FindMissing(status);
     return status;
 }

@@ -26,6 +26,8 @@ struct MachineStatus {
     std::vector<OfficeApplication> applications;
     wxString engine; ///< what stands behind them, with its version; empty when there is none
     std::vector<Printer> printers;
+    wxString pdfEngine; ///< what makes PDF files, with its version; empty when nothing does
+    std::vector<wxString> profiles; ///< Distiller's
     std::vector<MissingPart> missing;
 };
 

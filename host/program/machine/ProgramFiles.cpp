@@ -8,8 +8,12 @@
 
 namespace fs = std::filesystem;
 
+fs::path ProgramFile() {
+    return FromText(wxStandardPaths::Get().GetExecutablePath());
+}
+
 fs::path ProgramFolder() {
-    return FromText(wxStandardPaths::Get().GetExecutablePath()).parent_path();
+    return ProgramFile().parent_path();
 }
 
 std::vector<fs::path> ModuleFiles(const fs::path& folder) {

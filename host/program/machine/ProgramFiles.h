@@ -3,6 +3,9 @@
 #include <filesystem>
 #include <vector>
 
+/// The program's own file.
+std::filesystem::path ProgramFile();
+
 /// The folder of the program's file, beside which its parts lie: Filters, StandIns, Printers,
 /// locale. No separator at its end.
 std::filesystem::path ProgramFolder();

@@ -3,6 +3,9 @@
 #include "host/program/report/Reporter.h"
 #include "plugin/ProgressSink.h"
 
+/// A bar with a text behind it, for one line of a terminal.
+wxString ProgressLine(int percent, const wxString& text);
+
 /// Shows how far one document has come: a bar at a terminal, elsewhere a line for each
 /// step and each quarter.
 class Progress : public ProgressSink {
@@ -10,6 +13,8 @@ public:
     /// @param document the document's file name
     Progress(Reporter& reporter, const wxString& document)
         : m_reporter(reporter), m_document(document) {}
+
+    const wxString& Document() const { return m_document; }
 
     bool Report(const wxString& text, int percent) override;
 

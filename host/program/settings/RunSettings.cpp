@@ -2,6 +2,7 @@
 
 #include "common/WQServices.h"
 #include "host/program/PathText.h"
+#include "host/program/machine/Distiller.h"
 #include "host/program/machine/Printers.h"
 
 #include <algorithm>
@@ -29,32 +30,63 @@ bool Apply(const std::string& assignment, Settings& settings, Obstacle& obstacle
     return true;
 }
 
-wxString ListOf(const std::vector<Printer>& printers) {
-    wxString names;
-    for (const Printer& printer : printers)
-        names << (names.empty() ? "\"" : ", \"") << printer.name << '"';
-    return names.empty() ? wxString("none") : names;
+wxString ListOf(const std::vector<wxString>& names) {
+    wxString list;
+    for (const wxString& name : names)
+        list << (list.empty() ? "\"" : ", \"") << name << '"';
+    return list.empty() ? wxString("none") : list;
 }
 
 /// @return whether the settings name a printer that there is
-bool ChoosePrinter(Settings& settings, Obstacle& obstacle) {
-    const std::vector<Printer> printers = ListPrinters();
+bool CheckPrinter(const Settings& settings, Obstacle& obstacle) {
     const wxString wanted = settings.Value("PRINTER");
-    if (wanted.empty()) {
-        const Printer* const preferred = PreferredPrinter(printers);
-        if (!preferred)
-            obstacle = {ExitCode::MachineAtFault,
-                        "there is no PostScript printer; add one to the system"};
-        else
-            settings.Set("PRINTER", preferred->name);
-        return preferred != nullptr;
-    }
-    if (std::any_of(printers.begin(), printers.end(),
-                    [&wanted](const Printer& printer) { return printer.name == wanted; }))
+    std::vector<wxString> names;
+    for (const Printer& printer : ListPrinters())
+        names.push_back(printer.name);
+    if (std::find(names.begin(), names.end(), wanted) != names.end())
         return true;
-    obstacle = {ExitCode::WrongUsage,
-                "there is no printer \"" + wanted + "\"; the printers are: " + ListOf(printers)};
+    if (wanted.empty())
+        obstacle = {ExitCode::MachineAtFault,
+                    "there is no PostScript printer; add one to the system"};
+    else
+        obstacle = {ExitCode::WrongUsage,
+                    "there is no printer \"" + wanted + "\"; the printers are: " + ListOf(names)};
     return false;
+}
+
+/// Completes the profile's name where a user has left out its ending.
+/// @return whether the settings name a profile that there is, or none
+bool CheckProfile(Settings& settings, Obstacle& obstacle) {
+    const wxString wanted = settings.Value("SELECTEDDISTILLERPROFILE");
+    const std::vector<wxString> names = ListDistillerProfiles();
+    const auto find = [&names](auto condition) {
+        return std::find_if(names.begin(), names.end(), condition);
+    };
+    if (wanted.empty() || find([&](const wxString& name) { return name == wanted; }) != names.end())
+        return true;
+    const auto meant = find([&](const wxString& name) {
+        return name.Contains(".") && name.BeforeLast('.').IsSameAs(wanted, false);
+    });
+    if (meant != names.end())
+        settings.Set("SELECTEDDISTILLERPROFILE", *meant);
+    else
+        obstacle = {ExitCode::WrongUsage, "there is no Distiller profile \"" + wanted +
+                                              "\"; the profiles are: " + ListOf(names)};
+    return meant != names.end();
+}
+
+void ApplyOptions(const CommandLine& line, Settings& settings) {
+    const auto text = [](const std::string& argument) {
+        return Shown(FromArgument(argument)); // what is no text is no name either
+    };
+    if (line.printer)
+        settings.Set("PRINTER", text(*line.printer));
+    if (line.profile)
+        settings.Set("SELECTEDDISTILLERPROFILE", text(*line.profile));
+    if (line.pdf) {
+        settings.Set("OUTPUTFILETYPEPS", *line.pdf ? "0" : "1");
+        settings.Set("OUTPUTFILETYPEPDF", *line.pdf ? "1" : "0");
+    }
 }
 
 } // namespace
@@ -62,9 +94,10 @@ bool ChoosePrinter(Settings& settings, Obstacle& obstacle) {
 const std::vector<SettingsKey>& KnownSettings() {
     static const std::vector<SettingsKey> s_settings = {
         {"PRINTER", "name", "the printer to print on, as `quillon status` lists it"},
-        {"OUTPUTFILETYPEPS", "1 0", "1: PostScript files"},
-        {"OUTPUTFILETYPEPDF", "1 0", "1: PDF files are chosen in the settings panel"},
-        {"SELECTEDDISTILLERPROFILE", "file name", "the job options for PDF files"},
+        {"OUTPUTFILETYPEPS", "1 0", "1: PostScript files only; 0: PDF files too"},
+        {"OUTPUTFILETYPEPDF", "1 0", "the opposite, for the settings panel"},
+        {"SELECTEDDISTILLERPROFILE", "file name",
+         "the Distiller profile, as `quillon status` lists it"},
         {"PRINTOUTPUTTYPE", "text", "Slides, Handouts, Notes Pages or Outline View"},
         {"COLOR", "text", "Color, Grayscale or Pure Black and White"},
         {"SLIDESPERPAGE", "1 2 3 4 6 9", "slides on a page of handouts"},
@@ -77,6 +110,18 @@ const std::vector<SettingsKey>& KnownSettings() {
         {"HIGHQUALITY", "1 0", "1: slides are printed in high quality"},
     };
     return s_settings;
+}
+
+void FillIn(Settings& settings) {
+    const auto fill = [&settings](const char* key, const wxString& value) {
+        if (settings.Value(key).empty())
+            settings.Set(key, value);
+    };
+    const std::vector<Printer> printers = ListPrinters();
+    if (const Printer* const preferred = PreferredPrinter(printers))
+        fill("PRINTER", preferred->name);
+    fill("OUTPUTFILETYPEPS", "0");
+    fill("OUTPUTFILETYPEPDF", settings.Value("OUTPUTFILETYPEPS") == "1" ? "0" : "1");
 }
 
 std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle) {
@@ -94,11 +139,10 @@ std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obsta
     for (const std::string& assignment : line.settings)
         if (!Apply(assignment, *settings, obstacle))
             return std::nullopt;
-    if (line.printer)
-        settings->Set("PRINTER", ToText(FromArgument(*line.printer)).value_or(wxString()));
-    if (settings->Value("OUTPUTFILETYPEPS").empty())
-        settings->Set("OUTPUTFILETYPEPS", "1");
-    if (!ChoosePrinter(*settings, obstacle))
+    ApplyOptions(line, *settings);
+    FillIn(*settings);
+    const bool takesProfile = line.profile || settings->Value("OUTPUTFILETYPEPS") != "1";
+    if (!CheckPrinter(*settings, obstacle) || (takesProfile && !CheckProfile(*settings, obstacle)))
         return std::nullopt;
     return settings;
 }

@@ -24,7 +24,10 @@ struct Obstacle {
     wxString text;
 };
 
-/// Puts together the settings of a run: the file's, the command line's in their place, and where
-/// neither says anything, PostScript output on the preferred printer.
+/// Fills in what the settings do not say: PDF output on the preferred printer, if there is one.
+void FillIn(Settings& settings);
+
+/// Puts together the settings of a run: the file's, the command line's in their place, and what
+/// FillIn adds.
 /// @param obstacle receives why there is no result
 std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle);

@@ -5,8 +5,9 @@
 #include <filesystem>
 #include <memory>
 #include <optional>
+#include <string>
 
-/// The settings of a run, as XML with an element "UI" in it, which filters read.
+/// Settings as XML with an element "UI" in it, which filters read: those of a run, or a file's.
 class Settings {
 public:
     /// No settings yet.
@@ -15,6 +16,18 @@ public:
     /// Reads a settings file, which must hold an element "UI" anywhere.
     /// @param fault receives why there is no result, for people, naming line numbers of the file
     static std::optional<Settings> Load(const std::filesystem::path& file, wxString& fault);
+
+    /// Reads a settings file with its comments and its layout. Where the file, or the element "UI"
+    /// in it, is missing, there are no settings yet.
+    /// @param fault receives why there is no result, as above
+    static std::optional<Settings> LoadForEditing(const std::filesystem::path& file,
+                                                  wxString& fault);
+
+    /// Reads what Xml gave.
+    static std::optional<Settings> FromXml(const std::string& bytes, wxString& fault);
+
+    /// The whole document in UTF-8.
+    std::string Xml() const;
 
     /// @return the setting's value; empty when there is none
     wxString Value(const wxString& key) const;
@@ -26,8 +39,14 @@ public:
     const wxXmlNode& Node() const { return *m_document->GetDocumentNode(); }
 
 private:
-    explicit Settings(std::unique_ptr<wxXmlDocument> document);
+    Settings(std::unique_ptr<wxXmlDocument> document, bool keepsLayout);
+
+    static std::optional<Settings> Parse(const std::string& bytes, bool keepLayout,
+                                         wxString& fault);
+    void MakeUi();
+    void Append(wxXmlNode* setting);
 
     std::unique_ptr<wxXmlDocument> m_document;
-    wxXmlNode* m_ui; ///< of the document; null when it has none
+    bool m_keepsLayout = false; ///< the document has the file's white space
+    wxXmlNode* m_ui;            ///< of the document; null when it has none
 };

@@ -7,6 +7,10 @@ namespace Interruption {
 /// a second one ends the process.
 void Install();
 
+/// For a process that another one of this program has started: the other one decides, and such
+/// requests, which a terminal sends to both, mean nothing here.
+void LeaveToParent();
+
 /// Whether one has come.
 bool Requested();
 

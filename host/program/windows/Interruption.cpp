@@ -8,8 +8,7 @@ namespace {
 
 std::atomic<bool> g_requested{false};
 
-constexpr char Note[] =
-    "\nquillon: finishing the document under way; a second Ctrl-C ends at once\n";
+constexpr char Note[] = "\nquillon: finishing what is under way; a second Ctrl-C ends at once\n";
 
 void WriteNote() {
     DWORD written = 0;
@@ -35,6 +34,10 @@ BOOL WINAPI OnRequest(DWORD kind) {
 
 void Interruption::Install() {
     SetConsoleCtrlHandler(OnRequest, TRUE);
+}
+
+void Interruption::LeaveToParent() {
+    SetConsoleCtrlHandler(nullptr, TRUE); // nor for the processes started from here
 }
 
 bool Interruption::Requested() {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/engine/Heartbeat.h"
+#include "standins/engine/Heartbeat.h"
 
 #include <string>
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "standins/office/server/Applications.h"
-#include "standins/office/server/Module.h"
+#include "standins/office/server/ModuleUse.h"
 
 #include <atomic>
 

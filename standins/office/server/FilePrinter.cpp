@@ -1,8 +1,8 @@
 #include "standins/office/server/FilePrinter.h"
 
+#include "standins/module/ModulePath.h"
 #include "standins/module/Text.h"
 #include "standins/office/server/Call.h"
-#include "standins/office/server/Module.h"
 #include "standins/office/server/Settings.h"
 #include "standins/process/ChildProcess.h"
 #include "standins/process/Clocks.h"

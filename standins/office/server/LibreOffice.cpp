@@ -1,12 +1,12 @@
 #include "standins/office/server/LibreOffice.h"
 
+#include "standins/module/SearchPath.h"
+
 #include <glib.h>
 #include <unistd.h>
 
-#include <cstdlib>
 #include <filesystem>
 #include <memory>
-#include <sstream>
 #include <string_view>
 
 namespace fs = std::filesystem;
@@ -16,9 +16,7 @@ namespace standins {
 namespace {
 
 std::optional<fs::path> ProgramFolder() {
-    const char* path = std::getenv("PATH"); // NOLINT(concurrency-mt-unsafe): nobody changes it
-    std::istringstream folders(path ? path : "");
-    for (std::string folder; std::getline(folders, folder, ':');) {
+    for (const std::string& folder : SearchPath()) {
         std::error_code error;
         const fs::path launcher = fs::canonical(fs::path(folder) / "soffice", error);
         if (error)

@@ -1,10 +1,10 @@
 #include "standins/office/server/Registration.h"
 
+#include "standins/module/ModulePath.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
 #include "standins/office/server/Applications.h"
 #include "standins/office/server/LibreOffice.h"
-#include "standins/office/server/Module.h"
 #include "standins/office/server/Settings.h"
 
 namespace standins {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/office/server/Module.h"
+#include "standins/office/server/ModuleUse.h"
 
 #include <string>
 

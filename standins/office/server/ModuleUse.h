@@ -1,14 +1,6 @@
 #pragma once
 
-#include <string>
-
 namespace standins {
-
-/// This module's full path.
-std::wstring ModulePath();
-
-/// The path of a program that stands beside this module.
-std::string HelperPath(const std::string& name);
 
 // What keeps the module in memory.
 

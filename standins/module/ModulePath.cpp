@@ -1,17 +1,18 @@
-#include "standins/office/server/Module.h"
+#include "standins/module/ModulePath.h"
 
 #include "standins/module/Text.h"
 
 #include <windows.h>
 
-#include <atomic>
 #include <filesystem>
+
+namespace fs = std::filesystem;
 
 namespace standins {
 
 namespace {
 
-std::atomic<long> g_uses = 0;
+const char AddressHere = 0;
 
 } // namespace
 
@@ -19,7 +20,7 @@ std::wstring ModulePath() {
     HMODULE module = nullptr;
     GetModuleHandleExW(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
                            GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
-                       reinterpret_cast<LPCWSTR>(&g_uses), &module);
+                       reinterpret_cast<LPCWSTR>(&AddressHere), &module);
     for (std::wstring path(MAX_PATH, L'\0');; path.resize(2 * path.size())) {
         const DWORD length =
             GetModuleFileNameW(module, path.data(), static_cast<DWORD>(path.size()));
@@ -31,24 +32,10 @@ std::wstring ModulePath() {
 }
 
 std::string HelperPath(const std::string& name) {
-    const std::filesystem::path module = ToUtf8(ModulePath()).value_or(std::string());
-    return module.parent_path() / name;
-}
-
-ModuleUse::ModuleUse() {
-    LockModule(true);
-}
-
-ModuleUse::~ModuleUse() {
-    LockModule(false);
-}
-
-void LockModule(bool lock) {
-    g_uses += lock ? 1 : -1;
-}
-
-bool IsModuleInUse() {
-    return g_uses > 0;
+    const fs::path module = ToUtf8(ModulePath()).value_or(std::string());
+    std::error_code error;
+    const fs::path file = fs::canonical(module, error); // it may have been loaded by a link
+    return ((error ? module : file).parent_path() / name).lexically_normal();
 }
 
 } // namespace standins

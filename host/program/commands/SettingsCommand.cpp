@@ -1,0 +1,27 @@
+#include "host/program/PathText.h"
+#include "host/program/commands/Commands.h"
+#include "host/program/settings/RunSettings.h"
+#include "host/program/settings/SettingsDialogue.h"
+
+ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                     Reporter& reporter) {
+    const std::filesystem::path file = FromArgument(*line.settingsFile);
+    wxString fault;
+    std::optional<Settings> settings = Settings::LoadForEditing(file, fault);
+    if (!settings || !ToText(file)) {
+        reporter.Error("the settings file " + Shown(file) +
+                       " cannot be used: " + (settings ? "its name is not valid UTF-8" : fault));
+        return ExitCode::WrongUsage;
+    }
+    FillIn(*settings);
+    const FilterSet filters(filtersFolder);
+    SettingsDialogue dialogue(filters, *settings, file);
+    if (!dialogue.HasPanel()) {
+        reporter.Error("no filter has settings to show; `quillon status` lists the filters");
+        return ExitCode::MachineAtFault;
+    }
+    const bool saved = dialogue.ShowModal() == wxID_SAVE;
+    reporter.Line(saved ? "The settings are saved in " + Shown(file) + '.'
+                        : wxString("The settings are left as they were."));
+    return ExitCode::Done;
+}

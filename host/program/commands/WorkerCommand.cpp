@@ -1,0 +1,109 @@
+#include "host/program/commands/Commands.h"
+#include "host/program/documents/Conversion.h"
+#include "host/program/settings/Settings.h"
+#include "host/program/system/ChildProcess.h"
+#include "host/program/system/Interruption.h"
+#include "host/program/workers/Messages.h"
+
+#include <condition_variable>
+#include <cstdlib>
+#include <deque>
+#include <mutex>
+#include <thread>
+
+namespace {
+
+[[noreturn]] void EndAtOnce(ExitCode exitCode) {
+    std::_Exit(static_cast<int>(exitCode));
+}
+
+/// The run that this process works for. When it is gone with work under way, nobody waits for that
+/// work any more, and it may take long: the process ends at once.
+class Run : public ProgressSink {
+public:
+    Run() : m_channel(TakeStandardStreams()), m_reader([this] { ReadAll(); }) {}
+    ~Run() override { m_reader.join(); }
+    Run(const Run&) = delete;
+    Run& operator=(const Run&) = delete;
+
+    /// Waits for a message; the work that it asks for is under way from then on.
+    /// @return nothing when the run has no more
+    template <typename Message>
+    std::optional<Message> Next(std::optional<Message> (*decode)(const std::string&)) {
+        std::unique_lock lock(m_mutex);
+        m_read.wait(lock, [this] { return m_closed || !m_lines.empty(); });
+        if (m_lines.empty())
+            return std::nullopt;
+        std::optional<Message> message = decode(m_lines.front());
+        m_lines.pop_front();
+        if (!message) {
+            std::fputs("quillon: a worker is for the program's own use\n", stderr);
+            EndAtOnce(ExitCode::WrongUsage);
+        }
+        m_busy = true;
+        return message;
+    }
+
+    void Done() {
+        const std::lock_guard lock(m_mutex);
+        m_busy = false;
+    }
+
+    void Tell(const News& news) const { m_channel.Write(Encode(news)); }
+
+    bool Report(const wxString& text, int percent) override {
+        Tell({text, percent, std::nullopt});
+        return true;
+    }
+
+private:
+    void ReadAll() {
+        while (std::optional<std::string> line = m_channel.Read()) {
+            const std::lock_guard lock(m_mutex);
+            m_lines.push_back(std::move(*line));
+            m_read.notify_one();
+        }
+        const std::lock_guard lock(m_mutex);
+        if (m_busy)
+            EndAtOnce(ExitCode::Interrupted);
+        m_closed = true;
+        m_read.notify_one();
+    }
+
+    const LineChannel m_channel;
+    std::mutex m_mutex; ///< of what follows
+    std::condition_variable m_read;
+    std::deque<std::string> m_lines;
+    bool m_closed = false;
+    bool m_busy = false;
+
+    std::thread m_reader; // last: it uses all of the above
+};
+
+ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& filtersFolder) {
+    wxString fault;
+    const std::optional<Settings> settings = Settings::FromXml(facts.settings, fault);
+    const std::optional<OutputFolder> outputFolder = OutputFolder::Open(facts.outputFolder, fault);
+    if (!settings || !outputFolder)
+        EndAtOnce(ExitCode::WrongUsage);
+    FilterSet filters(filtersFolder);
+    filters.ApplySettings(settings->Node());
+    run.Done();
+    while (const std::optional<Assignment> work = run.Next(DecodeAssignment)) {
+        run.Tell({}); // it has begun
+        News news;
+        news.outcome = ConvertInput(work->input, work->baseName, filters, *outputFolder, run);
+        run.Done();
+        run.Tell(news);
+    }
+    return ExitCode::Done;
+}
+
+} // namespace
+
+ExitCode RunWorker(const std::filesystem::path& filtersFolder) {
+    Interruption::LeaveToParent();
+    Run run;
+    const std::optional<RunFacts> facts = run.Next(DecodeRunFacts);
+    return facts ? Serve(run, *facts, filtersFolder) : ExitCode::Done;
+}

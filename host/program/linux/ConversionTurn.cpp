@@ -1,0 +1,3 @@
+#include "host/program/system/ConversionTurn.h"
+
+ConversionTurn::ConversionTurn() = default; // each process has a registry of its own

@@ -1,0 +1,96 @@
+#include "host/program/workers/Messages.h"
+
+#include "host/program/PathText.h"
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+using nlohmann::json;
+
+/// Runs `make` on the line's JSON.
+template <typename Message, typename Make>
+std::optional<Message> Decode(const std::string& line, Make make) {
+    try {
+        const json message = json::parse(line);
+        return make(message);
+    } catch (const json::exception&) {
+        return std::nullopt;
+    }
+}
+
+wxString TextOf(const json& value) {
+    return wxString::FromUTF8(value.get<std::string>());
+}
+
+std::filesystem::path PathOf(const json& value) {
+    return FromArgument(value.get<std::string>());
+}
+
+json ToJson(const Outcome& outcome) {
+    return {{"input", outcome.input.u8string()},        {"output", outcome.output.u8string()},
+            {"state", static_cast<int>(outcome.state)}, {"code", outcome.code},
+            {"text", outcome.text.utf8_string()},       {"reason", outcome.reason.utf8_string()},
+            {"machineAtFault", outcome.machineAtFault}, {"seconds", outcome.seconds.value_or(0)}};
+}
+
+Outcome OutcomeOf(const json& value) {
+    Outcome outcome;
+    outcome.input = PathOf(value.at("input"));
+    outcome.output = PathOf(value.at("output"));
+    outcome.state = static_cast<State>(value.at("state").get<int>());
+    outcome.code = value.at("code");
+    outcome.text = TextOf(value.at("text"));
+    outcome.reason = TextOf(value.at("reason"));
+    outcome.machineAtFault = value.at("machineAtFault");
+    outcome.seconds = value.at("seconds").get<double>();
+    return outcome;
+}
+
+/// A text that has half a surrogate pair in it is told with a mark in its place.
+std::string LineOf(const json& message) {
+    return message.dump(-1, ' ', false, json::error_handler_t::replace);
+}
+
+} // namespace
+
+std::string Encode(const RunFacts& facts) {
+    return LineOf({{"settings", facts.settings}, {"outputFolder", facts.outputFolder.u8string()}});
+}
+
+std::string Encode(const Assignment& assignment) {
+    return LineOf({{"given", assignment.input.given.u8string()},
+                   {"full", assignment.input.full.u8string()},
+                   {"named", assignment.input.named},
+                   {"baseName", assignment.baseName.utf8_string()}});
+}
+
+std::string Encode(const News& news) {
+    json message = {{"step", news.step.utf8_string()}, {"percent", news.percent}};
+    if (news.outcome)
+        message["outcome"] = ToJson(*news.outcome);
+    return LineOf(message);
+}
+
+std::optional<RunFacts> DecodeRunFacts(const std::string& line) {
+    return Decode<RunFacts>(line, [](const json& message) {
+        return RunFacts{message.at("settings"), PathOf(message.at("outputFolder"))};
+    });
+}
+
+std::optional<Assignment> DecodeAssignment(const std::string& line) {
+    return Decode<Assignment>(line, [](const json& message) {
+        return Assignment{
+            {PathOf(message.at("given")), PathOf(message.at("full")), message.at("named")},
+            TextOf(message.at("baseName"))};
+    });
+}
+
+std::optional<News> DecodeNews(const std::string& line) {
+    return Decode<News>(line, [](const json& message) {
+        News news{TextOf(message.at("step")), message.at("percent"), std::nullopt};
+        if (message.contains("outcome"))
+            news.outcome = OutcomeOf(message["outcome"]);
+        return news;
+    });
+}

@@ -1,0 +1,176 @@
+#include "host/program/workers/WorkerPool.h"
+
+#include "common/WQServices.h"
+#include "host/program/PathText.h"
+#include "host/program/documents/Screening.h"
+#include "host/program/documents/Workplace.h"
+#include "host/program/system/Interruption.h"
+#include "plugin/ResultCodes.h"
+
+#include <algorithm>
+
+WorkerPool::WorkerPool(std::vector<std::string> arguments, RunFacts facts, const FilterSet& filters,
+                       Reporter& reporter)
+    : m_arguments(std::move(arguments)), m_facts(std::move(facts)), m_filters(filters),
+      m_reporter(reporter) {}
+
+WorkerPool::~WorkerPool() {
+    for (Worker& worker : m_workers) // none are left but after an exception
+        if (worker.process) {
+            worker.process->Kill();
+            worker.reader.join();
+        }
+}
+
+void WorkerPool::Run(const std::vector<Assignment>& assignments, std::size_t workers,
+                     const Deliver& deliver) {
+    m_assignments = &assignments;
+    m_deliver = &deliver;
+    m_workers.resize(std::min(workers, assignments.size()));
+    for (std::size_t number = 0; number < m_workers.size(); ++number)
+        GiveWork(number);
+    while (IsAnyBusy()) {
+        Event event = Await();
+        std::optional<News> news = event.line ? DecodeNews(*event.line) : std::nullopt;
+        if (news)
+            OnNews(event.worker, std::move(*news));
+        else if (!event.line)
+            OnEnd(event.worker);
+    }
+    for (Worker& worker : m_workers)
+        if (worker.process)
+            worker.process->Channel().CloseOutput();
+    for (Worker& worker : m_workers)
+        if (worker.process) {
+            worker.reader.join();
+            worker.process->Wait();
+            worker.process.reset();
+        }
+}
+
+/// Gives the worker the next assignment, if there is one.
+void WorkerPool::GiveWork(std::size_t number) {
+    while (m_next < m_assignments->size() && !m_workers[number].assignment) {
+        const std::size_t assignment = m_next++;
+        if (Interruption::Requested())
+            (*m_deliver)(assignment, NotReached(m_filters, (*m_assignments)[assignment].input));
+        else
+            Assign(number, assignment);
+    }
+}
+
+void WorkerPool::Assign(std::size_t number, std::size_t assignment) {
+    Worker& worker = m_workers[number];
+    const Assignment& work = (*m_assignments)[assignment];
+    worker.assignment = assignment;
+    worker.begun = false;
+    worker.progress.emplace(m_reporter, Shown(work.input.given.filename()));
+    // When it has ended meanwhile, its reader will say so.
+    if (EnsureProcess(number))
+        worker.process->Channel().Write(Encode(work));
+}
+
+/// @return whether the worker has a process; if not, its assignment has failed
+bool WorkerPool::EnsureProcess(std::size_t number) {
+    Worker& worker = m_workers[number];
+    if (worker.process)
+        return true;
+    wxString fault;
+    worker.process = ChildProcess::Start(m_arguments, fault);
+    if (!worker.process) {
+        Fail(number, "no process could be started for it: " + fault, true);
+        return false;
+    }
+    worker.proven = false;
+    LineChannel& channel = worker.process->Channel();
+    channel.Write(Encode(m_facts));
+    worker.reader = std::thread([this, number, &channel] {
+        while (std::optional<std::string> line = channel.Read())
+            Post({number, std::move(line)});
+        Post({number, std::nullopt});
+    });
+    return true;
+}
+
+void WorkerPool::OnNews(std::size_t number, News news) {
+    Worker& worker = m_workers[number];
+    if (!worker.assignment)
+        return;
+    worker.begun = true;
+    if (news.outcome) {
+        worker.proven = true;
+        Finish(number, std::move(*news.outcome));
+        GiveWork(number);
+    } else {
+        ShowProgress(worker, news);
+    }
+}
+
+void WorkerPool::OnEnd(std::size_t number) {
+    Worker& worker = m_workers[number];
+    worker.reader.join();
+    worker.process->Kill(); // it may only have closed its side
+    const wxString end = worker.process->Wait();
+    worker.process.reset();
+    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+        << "A worker has " << end << (worker.assignment ? " with a document under way" : "");
+    Workplace::RemoveAbandoned(m_facts.outputFolder);
+    if (!worker.assignment)
+        return;
+    if (worker.proven && !worker.begun) // it ended before the document reached it
+        Assign(number, *worker.assignment);
+    else
+        Fail(number, "the process that converted it " + end, false);
+    GiveWork(number);
+}
+
+void WorkerPool::Finish(std::size_t number, Outcome outcome) {
+    Worker& worker = m_workers[number];
+    ++m_done;
+    (*m_deliver)(*worker.assignment, std::move(outcome));
+    worker.assignment.reset();
+}
+
+void WorkerPool::Fail(std::size_t number, const wxString& reason, bool machineAtFault) {
+    Outcome outcome;
+    outcome.input = (*m_assignments)[*m_workers[number].assignment].input.given;
+    outcome.state = State::Failed;
+    outcome.code = ConversionFailed;
+    outcome.text = m_filters.ErrorText(ConversionFailed);
+    outcome.reason = reason;
+    outcome.machineAtFault = machineAtFault;
+    Finish(number, std::move(outcome));
+}
+
+void WorkerPool::ShowProgress(Worker& worker, const News& news) {
+    if (!m_reporter.ForTerminal()) {
+        worker.progress->Report(news.step, news.percent);
+        return;
+    }
+    wxString names; // one line is there for all that is under way
+    for (const Worker& each : m_workers)
+        if (each.assignment)
+            names << (names.empty() ? "" : ", ") << each.progress->Document();
+    m_reporter.Passing(
+        ProgressLine(static_cast<int>(m_done * 100 / m_assignments->size()),
+                     wxString::Format("%zu of %zu  ", m_done, m_assignments->size()) + names));
+}
+
+bool WorkerPool::IsAnyBusy() const {
+    return std::any_of(m_workers.begin(), m_workers.end(),
+                       [](const Worker& worker) { return worker.assignment.has_value(); });
+}
+
+void WorkerPool::Post(Event event) {
+    const std::lock_guard lock(m_mutex);
+    m_events.push_back(std::move(event));
+    m_posted.notify_one();
+}
+
+WorkerPool::Event WorkerPool::Await() {
+    std::unique_lock lock(m_mutex);
+    m_posted.wait(lock, [this] { return !m_events.empty(); });
+    Event event = std::move(m_events.front());
+    m_events.pop_front();
+    return event;
+}

@@ -1,0 +1,98 @@
+#include "standins/engine/EngineProcess.h"
+
+#include "standins/process/ChildProcess.h"
+#include "standins/process/ProcessTable.h"
+
+#include <fcntl.h>
+#include <sys/prctl.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <csignal>
+#include <cstdlib>
+
+namespace standins {
+
+namespace {
+
+void DefaultSignals() {
+    for (int number = 1; number < SIGRTMAX; ++number)
+        signal(number, SIG_DFL);
+    sigset_t none;
+    sigemptyset(&none);
+    sigprocmask(SIG_SETMASK, &none, nullptr);
+}
+
+/// @return false when the system has no more descriptors
+bool TakeDescriptors(const std::vector<int>& descriptors) {
+    const int count = static_cast<int>(descriptors.size());
+    std::vector<int> copies; // out of the way of the numbers that are to be taken
+    for (const int descriptor : descriptors)
+        copies.push_back(fcntl(descriptor, F_DUPFD_CLOEXEC, count));
+    for (int number = 0; number < count; ++number) {
+        if (dup2(copies[static_cast<std::size_t>(number)], number) < 0)
+            return false;
+    }
+    return close_range(static_cast<unsigned>(count), ~0U, CLOSE_RANGE_CLOEXEC) == 0;
+}
+
+/// The child between fork and exec.
+[[noreturn]] void BecomeEngine(const EngineCommand& command, pid_t supervisor) {
+    setpgid(0, 0);
+    prctl(PR_SET_PDEATHSIG, SIGKILL);
+    if (getppid() != supervisor) // it went before it could take us along
+        _exit(EngineCannotStart);
+    DefaultSignals();
+    std::vector<std::string> words = command.words;
+    std::vector<std::string> environment = command.environment;
+    const std::vector<char*> wordPointers = ExecWords(words);
+    const std::vector<char*> environmentPointers = ExecWords(environment);
+    if (TakeDescriptors(command.descriptors) && chdir(command.folder.c_str()) == 0) {
+        DenyNetwork();
+        if (!command.mayStartProcesses)
+            DenyProcesses();
+        LimitResources(command.resources, command.times);
+        execve(wordPointers[0], wordPointers.data(), environmentPointers.data());
+    }
+    _exit(EngineCannotStart);
+}
+
+} // namespace
+
+std::vector<std::string> EngineEnvironment(const std::string& folder) {
+    std::vector<std::string> environment = {
+        "HOME=" + folder,
+        "TMPDIR=" + folder,
+        // There is no program that an engine needs; LibreOffice would ask gpg for its version for
+        // each document.
+        "PATH=/nonexistent",
+        "LC_ALL=C.UTF-8",
+    };
+    if (const char* zone = std::getenv("TZ")) // dates in documents are those of the user
+        environment.push_back(std::string("TZ=") + zone);
+    return environment;
+}
+
+EngineProcess::EngineProcess(const EngineCommand& command) {
+    const pid_t supervisor = getpid();
+    m_id = fork();
+    if (m_id == 0)
+        BecomeEngine(command, supervisor);
+    if (m_id < 0)
+        return;
+    setpgid(m_id, m_id); // here too, so that the group exists whoever comes first
+    m_exit = WatchProcess(m_id);
+}
+
+int EngineProcess::End() {
+    int status = 0;
+    if (m_id > 0) {
+        kill(-m_id, SIGKILL); // nobody has waited for it yet, so the number is still its own
+        waitpid(m_id, &status, 0);
+    }
+    EndChildren();
+    return status;
+}
+
+} // namespace standins

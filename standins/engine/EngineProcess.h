@@ -1,0 +1,51 @@
+#pragma once
+
+#include "standins/engine/Sandbox.h"
+#include "standins/process/Clocks.h"
+#include "standins/process/Descriptor.h"
+
+#include <sys/types.h>
+
+#include <string>
+#include <vector>
+
+namespace standins {
+
+/// A program to be run as an engine.
+struct EngineCommand {
+    std::vector<std::string> words; ///< the program's full path and its arguments
+    std::vector<std::string> environment;
+    std::string folder;           ///< where it runs
+    std::vector<int> descriptors; ///< what it gets as descriptors 0, 1, 2 and so on, and no others
+    TimeLimits times{};
+    ResourceLimits resources;
+    bool mayStartProcesses = true;
+};
+
+/// The environment of an engine whose home and temporary files are in `folder`.
+std::vector<std::string> EngineEnvironment(const std::string& folder);
+
+/// The exit code, as a shell has it, of an engine that could not be started.
+constexpr int EngineCannotStart = 127;
+
+/// An engine at work: in a process group of its own, with limits on what it may use, without a
+/// network, without the caller's environment. It dies with the caller.
+class EngineProcess {
+public:
+    /// Starts it. The caller must have a single thread.
+    explicit EngineProcess(const EngineCommand& command);
+
+    bool IsStarted() const { return m_exit.IsOpen(); }
+    pid_t Group() const { return m_id; }
+    /// Becomes readable when the engine has ended.
+    int ExitDescriptor() const { return m_exit.Get(); }
+    /// Ends the engine if it has not ended, with everything that it started.
+    /// @return the status as waitpid gives it
+    int End();
+
+private:
+    pid_t m_id = -1;
+    Descriptor m_exit; ///< a pidfd
+};
+
+} // namespace standins

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "standins/process/Channel.h"
+#include "standins/process/Clocks.h"
+
+#include <string>
+#include <vector>
+
+namespace standins {
+
+/// An engine to be run under a supervisor.
+struct SupervisedRun {
+    std::string engine;                 ///< its name, for messages
+    std::string supervisor;             ///< the supervisor's full path
+    std::vector<std::string> arguments; ///< beside those that every supervisor gets
+    std::vector<int> descriptors;       ///< what is handed to it, in its order
+    std::string folder;                 ///< the work folder, not made yet
+    TimeLimits limits{};
+};
+
+/// Runs it, and returns when nothing of the run is left: no process, no file. The supervisor sees
+/// to it that the engine ends; that the supervisor itself ends is seen to here.
+/// @return a message Done, or Failed with the reason as the end of a sentence
+Message RunSupervised(const SupervisedRun& run);
+
+} // namespace standins

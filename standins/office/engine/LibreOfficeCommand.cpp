@@ -1,0 +1,57 @@
+#include "standins/office/engine/LibreOfficeCommand.h"
+
+#include "standins/office/UserInstallation.h"
+
+namespace standins {
+
+namespace {
+
+std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
+    const std::string installation = UserInstallationUrl(folder.Path());
+    return {
+        job.program + "/soffice.bin",
+        "--headless",
+        "--norestore",
+        "--nologo",
+        "--nodefault",
+        "--nolockcheck",
+        "-env:UserInstallation=" + installation,
+        // As root it would write a stamp into its own program folder.
+        "-env:UNO_SHARED_PACKAGES_CACHE=" + installation + "/shared",
+        "--infilter=" + job.importFilter,
+        "--convert-to",
+        "pdf:" + job.exportFilter,
+        "--outdir",
+        folder.Path() + "/out",
+        DocumentPath(folder, job),
+    };
+}
+
+} // namespace
+
+std::string DocumentPath(const WorkFolder& folder, const EngineJob& job) {
+    return folder.Path() + "/document." + job.extension;
+}
+
+std::string PdfPath(const WorkFolder& folder) {
+    return folder.Path() + "/out/document.pdf";
+}
+
+std::string LogPath(const WorkFolder& folder) {
+    return folder.Path() + "/engine.log";
+}
+
+EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job, int input,
+                                 int log) {
+    EngineCommand command;
+    command.words = Words(folder, job);
+    command.environment = EngineEnvironment(folder.Path());
+    command.environment.emplace_back("SAL_USE_VCLPLUGIN=svp");
+    command.folder = folder.Path();
+    command.descriptors = {input, log, log};
+    command.times = job.limits;
+    command.resources.memory = MostMemory;
+    return command;
+}
+
+} // namespace standins

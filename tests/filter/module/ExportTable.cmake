@@ -1,0 +1,27 @@
+# Reads a module's export table with the toolchain's own tool and holds it against a list.
+#   cmake -DMODULE=… -DNM=… -DOBJDUMP=… -DWINDOWS=ON|OFF -DEXPECTED=a,b,c -P ExportTable.cmake
+if(WINDOWS)
+    set(command "${OBJDUMP}" -p "${MODULE}")
+    set(line "\n[ \t]*\\[ *[0-9]+\\] ([^\n ]+)")
+else()
+    set(command "${NM}" --dynamic --defined-only "${MODULE}")
+    set(line "\n[0-9a-f]* [A-Za-z] ([^\n]+)")
+endif()
+execute_process(COMMAND ${command} OUTPUT_VARIABLE table COMMAND_ERROR_IS_FATAL ANY)
+if(WINDOWS) # the names stand behind the addresses, in a table of the same form
+    string(FIND "${table}" "[Ordinal/Name Pointer] Table" begin)
+    string(SUBSTRING "${table}" ${begin} -1 table)
+endif()
+
+string(REGEX MATCHALL "${line}" lines "\n${table}")
+set(names "")
+foreach(found IN LISTS lines)
+    string(REGEX REPLACE "${line}" "\\1" name "${found}")
+    list(APPEND names "${name}")
+endforeach()
+list(SORT names)
+string(REPLACE "," ";" expected "${EXPECTED}")
+list(SORT expected)
+if(NOT names STREQUAL expected)
+    message(FATAL_ERROR "The module exports\n  ${names}\nand should export\n  ${expected}")
+endif()

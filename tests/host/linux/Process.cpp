@@ -1,0 +1,53 @@
+#include "tests/host/Process.h"
+
+#include <fcntl.h>
+#include <gtest/gtest.h>
+#include <spawn.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <csignal>
+
+Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
+                 const std::filesystem::path& err) {
+    std::vector<char*> arguments;
+    arguments.reserve(command.size() + 1);
+    for (const std::string& argument : command)
+        arguments.push_back(const_cast<char*>(argument.c_str()));
+    arguments.push_back(nullptr);
+    posix_spawn_file_actions_t actions = {};
+    posix_spawn_file_actions_init(&actions);
+    posix_spawn_file_actions_addopen(&actions, STDIN_FILENO, "/dev/null", O_RDONLY, 0);
+    posix_spawn_file_actions_addopen(&actions, STDOUT_FILENO, out.c_str(),
+                                     O_WRONLY | O_CREAT | O_APPEND, 0600);
+    posix_spawn_file_actions_addopen(&actions, STDERR_FILENO, err.c_str(),
+                                     O_WRONLY | O_CREAT | O_APPEND, 0600);
+    pid_t process = -1;
+    const int error =
+        posix_spawn(&process, arguments[0], &actions, nullptr, arguments.data(), environ);
+    posix_spawn_file_actions_destroy(&actions);
+    EXPECT_EQ(error, 0) << command[0];
+    m_process = error == 0 ? process : None;
+}
+
+Process::~Process() {
+    if (m_process == None)
+        return;
+    kill(static_cast<pid_t>(m_process), SIGKILL);
+    waitpid(static_cast<pid_t>(m_process), nullptr, 0);
+}
+
+void Process::Interrupt() const {
+    kill(static_cast<pid_t>(m_process), SIGINT);
+}
+
+void Process::Terminate() const {
+    kill(static_cast<pid_t>(m_process), SIGTERM);
+}
+
+int Process::Wait() {
+    int status = 0;
+    waitpid(static_cast<pid_t>(m_process), &status, 0);
+    m_process = None;
+    return WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status);
+}

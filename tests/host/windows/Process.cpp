@@ -1,0 +1,96 @@
+#include "tests/host/Process.h"
+
+#include <windows.h>
+
+#include <wx/string.h>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+HANDLE HandleOf(std::intptr_t process) {
+    return reinterpret_cast<HANDLE>(process); // NOLINT(performance-no-int-to-ptr)
+}
+
+HANDLE OpenForChild(const wchar_t* name, DWORD access, DWORD disposition) {
+    SECURITY_ATTRIBUTES inherited = {sizeof inherited, nullptr, TRUE};
+    return CreateFileW(name, access, FILE_SHARE_READ | FILE_SHARE_WRITE, &inherited, disposition,
+                       FILE_ATTRIBUTE_NORMAL, nullptr);
+}
+
+/// The argument such that a program finds it again in its command line: backslashes count where a
+/// quotation mark follows.
+std::wstring Quoted(const std::wstring& argument) {
+    std::wstring quoted = L"\"";
+    std::size_t backslashes = 0;
+    for (const wchar_t letter : argument) {
+        if (letter == L'"')
+            quoted.append(backslashes + 1, L'\\');
+        backslashes = letter == L'\\' ? backslashes + 1 : 0;
+        quoted += letter;
+    }
+    return quoted.append(backslashes, L'\\') + L'"';
+}
+
+/// A console of its own, so that it can be told Ctrl-C and nobody else is.
+BOOL Start(std::wstring commandLine, STARTUPINFOW& startup, PROCESS_INFORMATION& process) {
+    return CreateProcessW(nullptr, commandLine.data(), nullptr, nullptr, TRUE, CREATE_NEW_CONSOLE,
+                          nullptr, nullptr, &startup, &process);
+}
+
+} // namespace
+
+Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
+                 const std::filesystem::path& err) {
+    std::wstring commandLine;
+    for (const std::string& argument : command)
+        commandLine += Quoted(wxString::FromUTF8(argument).ToStdWstring()) + L' ';
+    STARTUPINFOW startup = {};
+    startup.cb = sizeof startup;
+    startup.dwFlags = STARTF_USESTDHANDLES | STARTF_USESHOWWINDOW;
+    startup.wShowWindow = SW_HIDE;
+    startup.hStdInput = OpenForChild(L"NUL", GENERIC_READ, OPEN_EXISTING);
+    startup.hStdOutput = OpenForChild(out.c_str(), GENERIC_WRITE, CREATE_NEW);
+    startup.hStdError = OpenForChild(err.c_str(), GENERIC_WRITE, CREATE_NEW);
+    PROCESS_INFORMATION process = {};
+    if (Start(commandLine, startup, process)) {
+        CloseHandle(process.hThread);
+        m_process = reinterpret_cast<std::intptr_t>(process.hProcess);
+    } else {
+        ADD_FAILURE() << command[0] << ": error " << GetLastError();
+    }
+    for (HANDLE file : {startup.hStdInput, startup.hStdOutput, startup.hStdError})
+        CloseHandle(file);
+}
+
+Process::~Process() {
+    if (m_process == None)
+        return;
+    TerminateProcess(HandleOf(m_process), 1);
+    WaitForSingleObject(HandleOf(m_process), INFINITE);
+    CloseHandle(HandleOf(m_process));
+}
+
+void Process::Interrupt() const {
+    FreeConsole();
+    ASSERT_TRUE(AttachConsole(GetProcessId(HandleOf(m_process)))) << "error " << GetLastError();
+    SetConsoleCtrlHandler(nullptr, TRUE); // this process is not meant
+    EXPECT_TRUE(GenerateConsoleCtrlEvent(CTRL_C_EVENT, 0)) << "error " << GetLastError();
+    FreeConsole();
+    AttachConsole(ATTACH_PARENT_PROCESS);
+}
+
+void Process::Terminate() const {
+    Interrupt();
+}
+
+int Process::Wait() {
+    if (m_process == None)
+        return -1;
+    DWORD exitCode = 0;
+    WaitForSingleObject(HandleOf(m_process), INFINITE);
+    GetExitCodeProcess(HandleOf(m_process), &exitCode);
+    CloseHandle(HandleOf(m_process));
+    m_process = None;
+    return static_cast<int>(exitCode);
+}
