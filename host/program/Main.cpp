@@ -74,9 +74,11 @@ ExitCode RunOnConsole(const CommandLine& line) {
     return toolkit.IsOk() ? Run(line) : ExitCode::MachineAtFault;
 }
 
-ExitCode RunOnDesktop(const CommandLine& line, int argc, char** argv) {
+ExitCode RunOnDesktop(const CommandLine& line, char* programName) {
     wxApp::SetInstance(new wxApp); // belongs to wxWidgets
-    if (!wxEntryStart(argc, argv) || !wxTheApp->CallOnInit()) {
+    int count = 1;                 // the toolkit would take our options for its own
+    char* arguments[] = {programName, nullptr};
+    if (!wxEntryStart(count, arguments) || !wxTheApp->CallOnInit()) {
         Reporter(line.json).Error("there is no display to show the settings on; run it on a "
                                   "desktop, or set them with convert --set");
         return ExitCode::MachineAtFault;
@@ -97,7 +99,7 @@ int main(int argc, char** argv) {
         const std::optional<CommandLine> line = ReadCommandLine(Arguments(argc, argv), exitCode);
         if (!line)
             return exitCode;
-        return static_cast<int>(line->command == Command::Settings ? RunOnDesktop(*line, argc, argv)
+        return static_cast<int>(line->command == Command::Settings ? RunOnDesktop(*line, argv[0])
                                                                    : RunOnConsole(*line));
     } catch (const std::exception& error) { // out of memory, above all
         std::fprintf(stderr, "quillon: %s\n", error.what());

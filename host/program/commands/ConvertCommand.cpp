@@ -11,6 +11,8 @@
 
 namespace {
 
+constexpr unsigned WorkerPatience = 60; // seconds
+
 /// The base name of each input's output, in the inputs' order; empty for those that are no text,
 /// or no filter's business. Given out beforehand, so that they do not depend on which documents
 /// turn out well.
@@ -97,8 +99,9 @@ void ConvertSideBySide(const Run& run, const CommandLine& line, const Settings& 
         assignments.push_back({run.inputs[i], run.names[i]});
         numbers.push_back(i);
     }
-    WorkerPool pool(WorkerArguments(line), {settings.Xml(), run.outputFolder.Path()}, run.filters,
-                    reporter);
+    WorkerPool pool(WorkerArguments(line),
+                    std::chrono::seconds(line.stallSeconds.value_or(WorkerPatience)),
+                    {settings.Xml(), run.outputFolder.Path()}, run.filters, reporter);
     pool.Run(assignments, line.jobs, [&](std::size_t assignment, Outcome outcome) {
         report.Add(numbers[assignment], std::move(outcome));
     });

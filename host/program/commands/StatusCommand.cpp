@@ -81,6 +81,28 @@ void TellPrinters(const MachineStatus& status, Reporter& reporter) {
     }
 }
 
+void TellDistiller(const MachineStatus& status, Reporter& reporter) {
+    reporter.Line("Distiller");
+    reporter.Line("  " + (status.pdfEngine.empty() ? wxString("none") : OneLine(status.pdfEngine)));
+    Json record = {{"type", "distiller"},
+                   {"engine", JsonText(status.pdfEngine)},
+                   {"profiles", Json::array()}};
+    for (const wxString& profile : status.profiles) {
+        reporter.Line("  profile " + OneLine(profile));
+        record["profiles"].push_back(JsonText(profile));
+    }
+    reporter.Record(record);
+}
+
+void TellPanel(const MachineStatus& status, Reporter& reporter) {
+    reporter.Line("Settings panel");
+    const wxString& obstacle = status.panelObstacle;
+    reporter.Line("  " + (obstacle.empty() ? wxString("can be used") : "disabled: " + obstacle));
+    reporter.Record({{"type", "panel"},
+                     {"enabled", obstacle.empty()},
+                     {"reason", JsonText(obstacle)}});
+}
+
 ExitCode TellMissing(std::vector<MissingPart> missing, bool hasFilter, Reporter& reporter) {
     if (!hasFilter)
         missing.push_back({"There is no filter", "Install the program anew"});
@@ -104,5 +126,7 @@ ExitCode RunStatus(const std::filesystem::path& filtersFolder, Reporter& reporte
     TellFilters(filters, filtersFolder, reporter);
     TellApplications(status, reporter);
     TellPrinters(status, reporter);
+    TellDistiller(status, reporter);
+    TellPanel(status, reporter);
     return TellMissing(status.missing, !filters.Filters().empty(), reporter);
 }

@@ -21,8 +21,13 @@ namespace {
 /// work any more, and it may take long: the process ends at once.
 class Run : public ProgressSink {
 public:
-    Run() : m_channel(TakeStandardStreams()), m_reader([this] { ReadAll(); }) {}
-    ~Run() override { m_reader.join(); }
+    Run()
+        : m_channel(TakeStandardStreams()), m_reader([this] { ReadAll(); }),
+          m_heart([this] { Beat(); }) {}
+    ~Run() override {
+        m_reader.join();
+        m_heart.join();
+    }
     Run(const Run&) = delete;
     Run& operator=(const Run&) = delete;
 
@@ -49,7 +54,7 @@ public:
         m_busy = false;
     }
 
-    void Tell(const News& news) const { m_channel.Write(Encode(news)); }
+    void Tell(const News& news) { Write(Encode(news)); }
 
     bool Report(const wxString& text, int percent) override {
         Tell({text, percent, std::nullopt});
@@ -57,6 +62,21 @@ public:
     }
 
 private:
+    void Write(const std::string& line) {
+        const std::lock_guard lock(m_writing);
+        m_channel.Write(line);
+    }
+
+    /// Whoever waits for a document cannot tell a process that takes long from one that was stopped.
+    void Beat() {
+        std::unique_lock lock(m_mutex);
+        while (!m_end.wait_for(lock, BetweenSignsOfLife, [this] { return m_closed; })) {
+            lock.unlock(); // whoever does not read must not keep the rest from ending
+            Write(SignOfLife);
+            lock.lock();
+        }
+    }
+
     void ReadAll() {
         while (std::optional<std::string> line = m_channel.Read()) {
             const std::lock_guard lock(m_mutex);
@@ -68,16 +88,20 @@ private:
             EndAtOnce(ExitCode::Interrupted);
         m_closed = true;
         m_read.notify_one();
+        m_end.notify_one();
     }
 
     const LineChannel m_channel;
-    std::mutex m_mutex; ///< of what follows
+    std::mutex m_writing; ///< to the channel
+    std::mutex m_mutex;   ///< of what follows
     std::condition_variable m_read;
+    std::condition_variable m_end;
     std::deque<std::string> m_lines;
     bool m_closed = false;
     bool m_busy = false;
 
-    std::thread m_reader; // last: it uses all of the above
+    std::thread m_reader; // last: they use all of the above
+    std::thread m_heart;
 };
 
 ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& filtersFolder) {

@@ -13,7 +13,7 @@ constexpr int ServerVersion = 16;
 
 /// The XML text in which the host describes the print server that it submits to, as filters expect
 /// it at their initialisation.
-wxString ServerInformation() {
+wxString DescribeServer() {
     return wxString::Format("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
                             "<ServerInformation>\n"
                             "  <ServerName>Marlo</ServerName>\n"
@@ -37,7 +37,7 @@ std::unique_ptr<Filter> Filter::Start(std::unique_ptr<FilterModule> module) {
 
 Filter::Filter(std::unique_ptr<FilterModule> module, WQPlugin* plugin, PluginInfo info)
     : m_module(std::move(module)), m_plugin(plugin), m_info(std::move(info)) {
-    m_plugin->Initialize(ServerInformation());
+    m_plugin->Initialize(DescribeServer());
 }
 
 Filter::~Filter() {

@@ -46,9 +46,9 @@ void RegisterStandIns(const std::filesystem::path& folder) {
 void SetUpMachine(const MachineSetup& setup) {
     Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
     if (setup.stallSeconds)
-        Enter(wxRegKey::HKCU, StandInsKey, StallSecondsValue, long{*setup.stallSeconds});
+        Enter(wxRegKey::HKCU, StandInsKey, StallSecondsValue, static_cast<long>(*setup.stallSeconds));
     if (setup.limitSeconds)
-        Enter(wxRegKey::HKCU, StandInsKey, TotalSecondsValue, long{*setup.limitSeconds});
+        Enter(wxRegKey::HKCU, StandInsKey, TotalSecondsValue, static_cast<long>(*setup.limitSeconds));
     RegisterStandIns(setup.standInsFolder);
     AddFilePrinter(ProgramFolder() / "Printers" / "QuillonPS.ppd");
 }

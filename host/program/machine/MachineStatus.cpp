@@ -21,10 +21,14 @@ OfficeApplication LookFor(const wxString& name) {
     return application;
 }
 
+bool HasOffice(const MachineStatus& status) {
+    return std::any_of(status.applications.begin(), status.applications.end(),
+                       [](const OfficeApplication& application) { return application.installed; });
+}
+
 std::vector<MissingPart> FindMissing(const MachineStatus& status) {
     std::vector<MissingPart> missing;
-    if (std::none_of(status.applications.begin(), status.applications.end(),
-                     [](const OfficeApplication& application) { return application.installed; }))
+    if (!HasOffice(status))
         missing.push_back({"No Office application is installed", InstallAdvice({})});
     if (!PreferredPrinter(status.printers))
         missing.push_back({"There is no PostScript printer",
@@ -45,5 +49,8 @@ MachineStatus LookAtMachine() {
     status.pdfEngine = DistillerEngine();
     status.profiles = ListDistillerProfiles();
     status.missing = FindMissing(status);
+    // With a server as new as the one that the host speaks of, a missing printer disables nothing.
+    if (!HasOffice(status))
+        status.panelObstacle = "no Office application is installed. " + InstallAdvice({});
     return status;
 }

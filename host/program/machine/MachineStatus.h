@@ -29,6 +29,7 @@ struct MachineStatus {
     wxString pdfEngine; ///< what makes PDF files, with its version; empty when nothing does
     std::vector<wxString> profiles; ///< Distiller's
     std::vector<MissingPart> missing;
+    wxString panelObstacle; ///< why the settings panel's controls are disabled; empty when not
 };
 
 MachineStatus LookAtMachine();

@@ -55,7 +55,7 @@ LPWSTR Writable(const wchar_t* text) {
     return const_cast<LPWSTR>(text);
 }
 
-bool AddDriver(std::wstring dataFile) {
+bool PutInDriver(std::wstring dataFile) {
     DRIVER_INFO_3W driver = {};
     driver.cVersion = 3;
     driver.pName = Writable(FilePrinterName);
@@ -67,7 +67,7 @@ bool AddDriver(std::wstring dataFile) {
            GetLastError() == ERROR_PRINTER_DRIVER_ALREADY_INSTALLED;
 }
 
-bool AddPrinter() {
+bool PutInPrinter() {
     PRINTER_INFO_2W record = {};
     record.pPrinterName = Writable(FilePrinterName);
     record.pDriverName = Writable(FilePrinterName);
@@ -127,7 +127,7 @@ void AddFilePrinter(const std::filesystem::path& ppd) {
             << "The description of the file printer is missing: " << Shown(ppd);
         return;
     }
-    if (!AddDriver(ToText(ppd).value_or(wxString()).ToStdWstring()) || !AddPrinter())
+    if (!PutInDriver(ToText(ppd).value_or(wxString()).ToStdWstring()) || !AddPrinter())
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "The file printer could not be added, error "
             << wxString::Format("%u", GetLastError());

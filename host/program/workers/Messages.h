@@ -5,13 +5,14 @@
 
 #include <wx/string.h>
 
+#include <chrono>
 #include <filesystem>
 #include <optional>
 #include <string>
 
 // What a run and its workers tell each other: JSON texts, one a line. A worker is told the run's
 // facts once and then one document after the other; it answers each with the news of its progress
-// and in the end with its outcome.
+// and in the end with its outcome. All the while it gives signs of life.
 
 /// What holds for all documents of a run.
 struct RunFacts {
@@ -31,6 +32,10 @@ struct News {
     int percent = 0;
     std::optional<Outcome> outcome;
 };
+
+/// A line that says nothing else.
+constexpr const char* SignOfLife = "alive";
+constexpr std::chrono::milliseconds BetweenSignsOfLife{250};
 
 std::string Encode(const RunFacts& facts);
 std::string Encode(const Assignment& assignment);

@@ -9,10 +9,12 @@
 
 #include <algorithm>
 
-WorkerPool::WorkerPool(std::vector<std::string> arguments, RunFacts facts, const FilterSet& filters,
-                       Reporter& reporter)
-    : m_arguments(std::move(arguments)), m_facts(std::move(facts)), m_filters(filters),
-      m_reporter(reporter) {}
+using Clock = std::chrono::steady_clock;
+
+WorkerPool::WorkerPool(std::vector<std::string> arguments, std::chrono::seconds patience,
+                       RunFacts facts, const FilterSet& filters, Reporter& reporter)
+    : m_arguments(std::move(arguments)), m_patience(patience), m_facts(std::move(facts)),
+      m_filters(filters), m_reporter(reporter) {}
 
 WorkerPool::~WorkerPool() {
     for (Worker& worker : m_workers) // none are left but after an exception
@@ -27,15 +29,17 @@ void WorkerPool::Run(const std::vector<Assignment>& assignments, std::size_t wor
     m_assignments = &assignments;
     m_deliver = &deliver;
     m_workers.resize(std::min(workers, assignments.size()));
+    m_looked = Clock::now();
     for (std::size_t number = 0; number < m_workers.size(); ++number)
         GiveWork(number);
     while (IsAnyBusy()) {
-        Event event = Await();
-        std::optional<News> news = event.line ? DecodeNews(*event.line) : std::nullopt;
-        if (news)
-            OnNews(event.worker, std::move(*news));
-        else if (!event.line)
-            OnEnd(event.worker);
+        if (const std::optional<Event> event = Await()) {
+            if (event->line)
+                OnLine(event->worker, *event->line);
+            else
+                OnEnd(event->worker);
+        }
+        EndTheSilent();
     }
     for (Worker& worker : m_workers)
         if (worker.process)
@@ -81,7 +85,8 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
         Fail(number, "no process could be started for it: " + fault, true);
         return false;
     }
-    worker.proven = false;
+    worker.proven = worker.silent = false;
+    worker.heard = Clock::now();
     LineChannel& channel = worker.process->Channel();
     channel.Write(Encode(m_facts));
     worker.reader = std::thread([this, number, &channel] {
@@ -92,17 +97,19 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
     return true;
 }
 
-void WorkerPool::OnNews(std::size_t number, News news) {
+void WorkerPool::OnLine(std::size_t number, const std::string& line) {
     Worker& worker = m_workers[number];
-    if (!worker.assignment)
+    worker.heard = Clock::now();
+    std::optional<News> news = DecodeNews(line);
+    if (!news || !worker.assignment)
         return;
     worker.begun = true;
-    if (news.outcome) {
+    if (news->outcome) {
         worker.proven = true;
-        Finish(number, std::move(*news.outcome));
+        Finish(number, std::move(*news->outcome));
         GiveWork(number);
     } else {
-        ShowProgress(worker, news);
+        ShowProgress(worker, *news);
     }
 }
 
@@ -120,7 +127,10 @@ void WorkerPool::OnEnd(std::size_t number) {
     if (worker.proven && !worker.begun) // it ended before the document reached it
         Assign(number, *worker.assignment);
     else
-        Fail(number, "the process that converted it " + end, false);
+        Fail(number,
+             "the process that converted it " +
+                 (worker.silent ? wxString("gave no sign of life any more and was ended") : end),
+             false);
     GiveWork(number);
 }
 
@@ -156,6 +166,22 @@ void WorkerPool::ShowProgress(Worker& worker, const News& news) {
                      wxString::Format("%zu of %zu  ", m_done, m_assignments->size()) + names));
 }
 
+/// Ends the workers that have been silent for too long; their readers will say so.
+void WorkerPool::EndTheSilent() {
+    const Clock::time_point now = Clock::now();
+    // Has this process been stopped, and its workers with it, they get their time anew.
+    const bool hasSlept = now - m_looked > m_patience / 2;
+    m_looked = now;
+    for (Worker& worker : m_workers) {
+        if (hasSlept)
+            worker.heard = now;
+        if (worker.process && !worker.silent && now - worker.heard > m_patience) {
+            worker.silent = true;
+            worker.process->Kill();
+        }
+    }
+}
+
 bool WorkerPool::IsAnyBusy() const {
     return std::any_of(m_workers.begin(), m_workers.end(),
                        [](const Worker& worker) { return worker.assignment.has_value(); });
@@ -167,9 +193,11 @@ void WorkerPool::Post(Event event) {
     m_posted.notify_one();
 }
 
-WorkerPool::Event WorkerPool::Await() {
+/// @return nothing when there was none for some time
+std::optional<WorkerPool::Event> WorkerPool::Await() {
     std::unique_lock lock(m_mutex);
-    m_posted.wait(lock, [this] { return !m_events.empty(); });
+    if (!m_posted.wait_for(lock, BetweenSignsOfLife, [this] { return !m_events.empty(); }))
+        return std::nullopt;
     Event event = std::move(m_events.front());
     m_events.pop_front();
     return event;

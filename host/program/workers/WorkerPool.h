@@ -5,6 +5,7 @@
 #include "host/program/system/ChildProcess.h"
 #include "host/program/workers/Messages.h"
 
+#include <chrono>
 #include <condition_variable>
 #include <deque>
 #include <functional>
@@ -12,13 +13,15 @@
 #include <thread>
 
 /// Converts documents side by side, each worker in a process of its own. A worker serves one
-/// document after the other; one that ends fails the document that it had, and is replaced.
+/// document after the other; one that ends, or gives no sign of life any more, fails the document
+/// that it had, and is replaced.
 class WorkerPool {
 public:
     /// @param arguments that make this program a worker
+    /// @param patience how long a worker may give no sign of life
     /// @param filters asked for the texts of what the workers cannot tell any more
-    WorkerPool(std::vector<std::string> arguments, RunFacts facts, const FilterSet& filters,
-               Reporter& reporter);
+    WorkerPool(std::vector<std::string> arguments, std::chrono::seconds patience, RunFacts facts,
+               const FilterSet& filters, Reporter& reporter);
     ~WorkerPool();
     WorkerPool(const WorkerPool&) = delete;
     WorkerPool& operator=(const WorkerPool&) = delete;
@@ -39,6 +42,8 @@ private:
         std::optional<Progress> progress;
         bool begun = false;  ///< with the assignment
         bool proven = false; ///< has brought a document to an end
+        bool silent = false; ///< was ended for that
+        std::chrono::steady_clock::time_point heard; ///< its last sign of life
     };
     /// A line from a worker, or nothing when it has ended.
     struct Event {
@@ -50,15 +55,18 @@ private:
     void Assign(std::size_t number, std::size_t assignment);
     bool EnsureProcess(std::size_t number);
     void OnNews(std::size_t number, News news);
+    void OnLine(std::size_t number, const std::string& line);
     void OnEnd(std::size_t number);
     void Finish(std::size_t number, Outcome outcome);
     void Fail(std::size_t number, const wxString& reason, bool machineAtFault);
     void ShowProgress(Worker& worker, const News& news);
+    void EndTheSilent();
     bool IsAnyBusy() const;
     void Post(Event event);
-    Event Await();
+    std::optional<Event> Await();
 
     const std::vector<std::string> m_arguments;
+    const std::chrono::seconds m_patience;
     const RunFacts m_facts;
     const FilterSet& m_filters;
     Reporter& m_reporter;
@@ -67,6 +75,7 @@ private:
     const Deliver* m_deliver = nullptr;
     std::size_t m_next = 0; ///< the first assignment that no worker has had
     std::size_t m_done = 0;
+    std::chrono::steady_clock::time_point m_looked; ///< for silent workers
     std::deque<Worker> m_workers;
 
     std::mutex m_mutex; ///< of what follows, which the readers share
