@@ -1,6 +1,6 @@
-// Prints the PDF that it gets as standard input: PostScript on standard output. In a process of
-// its own, since the PDF comes from a document that anybody may have made. What goes wrong is one
-// line on standard error and exit code 1.
+// Prints what the engine made of a document, its standard input: PostScript on standard output. In
+// a process of its own, since the document is one that anybody may have made. What goes wrong is
+// one line on standard error and exit code 1.
 
 #include "standins/office/printer/PostScriptWriter.h"
 
@@ -13,6 +13,8 @@
 #include <cstdio>
 #include <cstdlib>
 #include <exception>
+#include <map>
+#include <string>
 
 namespace {
 
@@ -27,6 +29,35 @@ void LimitResources() {
     setrlimit(RLIMIT_CORE, &none);
 }
 
+void AddOptions(CLI::App& options, standins::PrintJob& job) {
+    using standins::Colours;
+    using standins::Contents;
+    options.add_option("--title", job.title, "the document's name");
+    options.add_option("--user", job.user, "for whom it is printed");
+    options.add_option("--copies", job.copies, "how often")->check(CLI::Range(1, 32767));
+    options.add_flag("--collate,!--no-collate", job.collate, "whole copies, one after the other");
+    options
+        .add_option_function<int>(
+            "--handout",
+            [&job](int slides) {
+                job.contents = Contents::Handouts;
+                job.slidesPerSheet = slides;
+            },
+            "so many pages a sheet")
+        ->check(CLI::IsMember({1, 2, 3, 4, 6, 9}));
+    options.add_flag("--down-first", job.downFirst, "handouts go down first, then across");
+    options.add_flag_callback(
+        "--outline", [&job] { job.contents = Contents::Outline; },
+        "the input is a presentation in OpenDocument, of which the outline is printed");
+    options.add_flag("--hidden", job.printHidden, "hidden slides too, in an outline");
+    options.add_flag("--fit", job.fitToPaper, "scale pages to the paper");
+    options.add_flag("--frames", job.frames, "a frame around each page");
+    options.add_flag("--comments", job.comments, "comments too");
+    options.add_option("--colours", job.colours, "all, gray or black")
+        ->transform(CLI::CheckedTransformer(std::map<std::string, Colours>{
+            {"all", Colours::All}, {"gray", Colours::Gray}, {"black", Colours::BlackAndWhite}}));
+}
+
 int Run(int argc, char** argv) {
     signal(SIGPIPE, SIG_IGN);               // a failing write says so
     signal(SIGXFSZ, SIG_IGN);               // likewise
@@ -36,10 +67,7 @@ int Run(int argc, char** argv) {
 
     standins::PrintJob job;
     CLI::App options("Prints a PDF as PostScript, from standard input to standard output.");
-    options.add_option("--title", job.title, "the document's name");
-    options.add_option("--user", job.user, "for whom it is printed");
-    options.add_option("--copies", job.copies, "how often")->check(CLI::Range(1, 32767));
-    options.add_flag("--collate,!--no-collate", job.collate, "whole copies, one after the other");
+    AddOptions(options, job);
     CLI11_PARSE(options, argc, argv);
 
     const std::string failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);

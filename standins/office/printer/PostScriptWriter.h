@@ -6,11 +6,12 @@
 
 namespace standins {
 
-/// Prints a PDF as PostScript level 3: text stays text, each page has the size and the orientation
-/// in which a viewer shows it.
-/// @param pdf open for reading, a regular file
+/// Prints a document as PostScript level 3: text stays text.
+/// @param document open for reading, a regular file: a PDF, or for an outline an OpenDocument
+/// presentation
 /// @param postScript open for writing
 /// @return what went wrong; empty when all is written
-std::string WritePostScript(int pdf, int postScript, const PrintJob& job);
+/// @throws std::runtime_error when the document cannot be read
+std::string WritePostScript(int document, int postScript, const PrintJob& job);
 
 } // namespace standins

@@ -1,0 +1,111 @@
+#include "standins/office/printer/PdfSheets.h"
+
+#include "standins/office/printer/Text.h"
+
+#include <algorithm>
+
+namespace standins {
+
+namespace {
+
+/// What printers leave white at the edges.
+constexpr double PaperMargin = 18;
+
+Area PaperFor(Size page) {
+    const bool isWide = page.width > page.height;
+    return {0, 0, isWide ? Paper.height : Paper.width, isWide ? Paper.width : Paper.height};
+}
+
+Area WithoutMargin(const Area& area) {
+    return {area.x + PaperMargin, area.y + PaperMargin, area.width - 2 * PaperMargin,
+            area.height - 2 * PaperMargin};
+}
+
+void DrawFrame(const Area& area, cairo_t* sheet) {
+    cairo_rectangle(sheet, area.x, area.y, area.width, area.height);
+    cairo_set_source_rgb(sheet, 0, 0, 0);
+    cairo_set_line_width(sheet, 1);
+    cairo_stroke(sheet);
+}
+
+void RuleLines(const Area& area, cairo_t* sheet) {
+    constexpr double Distance = 26;
+    cairo_set_source_rgb(sheet, 0, 0, 0);
+    cairo_set_line_width(sheet, 0.5);
+    for (double y = area.y + area.height; y > area.y; y -= Distance) {
+        cairo_move_to(sheet, area.x, y);
+        cairo_line_to(sheet, area.x + area.width, y);
+    }
+    cairo_stroke(sheet);
+}
+
+} // namespace
+
+PdfSheets::PdfSheets(const PdfDocument& document, const PrintJob& job,
+                     std::vector<Comment> comments)
+    : m_document(document), m_job(job), m_grid(job.slidesPerSheet, job.downFirst),
+      m_comments(std::move(comments)) {}
+
+int PdfSheets::Count() const {
+    const int pages = m_document.PageCount();
+    return m_job.contents == Contents::Handouts ? (pages + m_grid.Slides() - 1) / m_grid.Slides()
+                                                : pages;
+}
+
+void PdfSheets::Print(int number, PostScriptOutput& output) const {
+    if (m_job.contents == Contents::Handouts)
+        PrintHandout(number * m_grid.Slides(), output);
+    else
+        PrintPage(number, output);
+}
+
+void PdfSheets::PrintPage(int page, PostScriptOutput& output) const {
+    const Size size = m_document.PageSize(page);
+    const Area paper = m_job.fitToPaper ? PaperFor(size) : Area{0, 0, size.width, size.height};
+    cairo_t* sheet = output.NewSheet({paper.width, paper.height});
+    DrawPage(page, m_job.fitToPaper ? FitInto(WithoutMargin(paper), size) : paper, sheet);
+}
+
+void PdfSheets::PrintHandout(int first, PostScriptOutput& output) const {
+    cairo_t* sheet = output.NewSheet(Paper);
+    const int end = std::min(first + m_grid.Slides(), m_document.PageCount());
+    for (int page = first; page < end; ++page) {
+        const Area place = m_grid.SlideArea(page - first);
+        DrawPage(page, FitInto(place, m_document.PageSize(page)), sheet);
+        if (m_grid.HasLines())
+            RuleLines(m_grid.LinesArea(page - first), sheet);
+    }
+}
+
+void PdfSheets::DrawPage(int page, const Area& area, cairo_t* sheet) const {
+    const double scale = area.width / m_document.PageSize(page).width;
+    cairo_save(sheet);
+    cairo_rectangle(sheet, area.x, area.y, area.width, area.height);
+    cairo_clip(sheet); // what sticks out of a slide is not seen on it
+    cairo_translate(sheet, area.x, area.y);
+    cairo_scale(sheet, scale, scale);
+    m_document.DrawPage(page, sheet);
+    DrawMarkers(page, sheet);
+    cairo_restore(sheet);
+    if (m_job.frames)
+        DrawFrame(area, sheet);
+}
+
+/// The number under which a comment is found on the sheets of comments.
+void PdfSheets::DrawMarkers(int page, cairo_t* sheet) const {
+    constexpr double Side = 18;
+    for (std::size_t i = 0; i < m_comments.size(); ++i) {
+        const Comment& comment = m_comments[i];
+        if (comment.page != page)
+            continue;
+        cairo_rectangle(sheet, comment.x, comment.y, Side, Side);
+        cairo_set_source_rgb(sheet, 1, 0.95, 0.6);
+        cairo_fill_preserve(sheet);
+        cairo_set_source_rgb(sheet, 0, 0, 0);
+        cairo_set_line_width(sheet, 1);
+        cairo_stroke(sheet);
+        DrawCentred(std::to_string(i + 1), {comment.x, comment.y, Side, Side}, sheet);
+    }
+}
+
+} // namespace standins
