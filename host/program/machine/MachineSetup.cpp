@@ -41,14 +41,20 @@ void RegisterStandIns(const std::filesystem::path& folder) {
         Register(file);
 }
 
+/// Sets a clock of the engines: Office's and Distiller's.
+void EnterClock(const char* valueName, std::optional<unsigned> seconds) {
+    if (!seconds)
+        return;
+    for (const char* keyName : {StandInsKey, DistillerStandInKey})
+        Enter(wxRegKey::HKCU, keyName, valueName, static_cast<long>(*seconds));
+}
+
 } // namespace
 
 void SetUpMachine(const MachineSetup& setup) {
     Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
-    if (setup.stallSeconds)
-        Enter(wxRegKey::HKCU, StandInsKey, StallSecondsValue, static_cast<long>(*setup.stallSeconds));
-    if (setup.limitSeconds)
-        Enter(wxRegKey::HKCU, StandInsKey, TotalSecondsValue, static_cast<long>(*setup.limitSeconds));
+    EnterClock(StallSecondsValue, setup.stallSeconds);
+    EnterClock(TotalSecondsValue, setup.limitSeconds);
     RegisterStandIns(setup.standInsFolder);
     AddFilePrinter(ProgramFolder() / "Printers" / "QuillonPS.ppd");
 }

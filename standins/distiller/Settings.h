@@ -1,0 +1,11 @@
+#pragma once
+
+namespace standins {
+
+/// Under HKEY_LOCAL_MACHINE the engine's name and version, "Engine", entered by registration. Under
+/// HKEY_CURRENT_USER, or else HKEY_LOCAL_MACHINE, the limits: the numbers "StallSeconds" and
+/// "TotalSeconds".
+constexpr const wchar_t* DistillerSettingsKey = L"SOFTWARE\\Orvanta\\Distiller Stand-In";
+constexpr const wchar_t* DistillerEngineValue = L"Engine";
+
+} // namespace standins

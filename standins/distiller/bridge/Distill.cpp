@@ -1,0 +1,110 @@
+#include "standins/distiller/bridge/Distill.h"
+
+#include "standins/distiller/Ghostscript.h"
+#include "standins/distiller/Settings.h"
+#include "standins/distiller/bridge/Profiles.h"
+#include "standins/module/DocumentFile.h"
+#include "standins/module/ModulePath.h"
+#include "standins/module/SupervisedRun.h"
+#include "standins/module/Text.h"
+#include "standins/module/TimeSettings.h"
+#include "standins/process/NewFile.h"
+#include "standins/process/WorkFolder.h"
+
+#include <system_error>
+
+using namespace std::chrono_literals;
+
+namespace standins {
+
+namespace {
+
+/// A failure on the way; caught where the outcome is made.
+struct Failed {
+    DistillOutcome outcome;
+};
+
+[[noreturn]] void Fail(DistillResult result, std::string reason) {
+    throw Failed{{result, std::move(reason)}};
+}
+
+Descriptor OpenPostScript(const std::string& path) {
+    std::wstring failure;
+    DocumentFile file = OpenDocumentFile(FromUtf8(path), failure);
+    if (!file.descriptor.IsOpen())
+        Fail(DistillResult::NoPostScript, ToUtf8(failure).value_or("it cannot be read"));
+    return std::move(file.descriptor);
+}
+
+std::string Joined(const std::vector<std::string>& folders) {
+    std::string text;
+    for (const std::string& folder : folders)
+        text += (text.empty() ? "" : " or ") + folder;
+    return text;
+}
+
+/// @return closed when none is asked for
+Descriptor OpenProfile(const std::string& name) {
+    if (name.empty())
+        return Descriptor();
+    const std::optional<std::string> path = FindProfile(name);
+    if (!path) {
+        const std::string folders = Joined(ProfileFolders());
+        Fail(DistillResult::NoProfile, "there is no profile \"" + name + '"' +
+                                           (folders.empty() ? folders : " in " + folders));
+    }
+    std::wstring failure;
+    DocumentFile file = OpenDocumentFile(FromUtf8(*path), failure);
+    if (!file.descriptor.IsOpen())
+        Fail(DistillResult::NoProfile, "the profile " + *path + " cannot be used: " +
+                                           ToUtf8(failure).value_or("it cannot be read"));
+    return std::move(file.descriptor);
+}
+
+void CheckOutput(int error) {
+    if (error != 0)
+        Fail(DistillResult::NoOutput, std::generic_category().message(error));
+}
+
+SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
+                         const Descriptor& profile) {
+    const std::optional<Ghostscript> ghostscript = FindGhostscript();
+    if (!ghostscript)
+        Fail(DistillResult::NoEngine, "Ghostscript is not installed");
+    SupervisedRun run;
+    run.engine = "Ghostscript";
+    run.supervisor = HelperPath("../StandIns/distiller-engine");
+    run.arguments = {"--program=" + ghostscript->program};
+    run.descriptors = {postScript.Get(), pdf.Get()};
+    if (profile.IsOpen()) {
+        run.arguments.emplace_back("--profile");
+        run.descriptors.push_back(profile.Get());
+    }
+    run.folder = WorkFolder::NewPath("distiller");
+    run.limits = ReadTimeLimits(DistillerSettingsKey, {60s, 600s});
+    return run;
+}
+
+void MakePdf(const DistillRequest& request) {
+    const Descriptor postScript = OpenPostScript(request.postScript);
+    const Descriptor profile = OpenProfile(request.profile);
+    NewFile pdf(request.pdf);
+    CheckOutput(pdf.Error());
+    const Message result = RunSupervised(PrepareRun(postScript, pdf, profile));
+    if (result.kind != MessageKind::Done)
+        Fail(DistillResult::NotConverted, result.text);
+    CheckOutput(pdf.Appear());
+}
+
+} // namespace
+
+DistillOutcome Distill(const DistillRequest& request) {
+    try {
+        MakePdf(request);
+        return {};
+    } catch (const Failed& failed) {
+        return failed.outcome;
+    }
+}
+
+} // namespace standins

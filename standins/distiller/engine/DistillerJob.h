@@ -1,0 +1,19 @@
+#pragma once
+
+#include "standins/process/Clocks.h"
+
+#include <string>
+
+namespace standins {
+
+/// One PostScript file to turn into PDF. The files are handed over open.
+struct DistillerJob {
+    std::string program; ///< Ghostscript's full path
+    std::string folder;  ///< the work folder, not made yet
+    TimeLimits limits{};
+    int postScript = -1; ///< open for reading
+    int pdf = -1;        ///< open for writing, empty
+    int profile = -1;    ///< the job options, open for reading; -1 for Ghostscript's own defaults
+};
+
+} // namespace standins

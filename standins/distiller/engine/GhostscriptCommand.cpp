@@ -1,0 +1,47 @@
+#include "standins/distiller/engine/GhostscriptCommand.h"
+
+namespace standins {
+
+namespace {
+
+/// Ghostscript gets its files as descriptors. SAFER lets a PostScript program touch the files of
+/// the command line, its fonts and its folder for temporary files: so it has no way to any file by
+/// name, and no file's name can be taken for an option.
+std::string FileName(int descriptor) {
+    return "/dev/fd/" + std::to_string(descriptor);
+}
+
+enum EngineDescriptor { Input, Output, Errors, PostScript, Pdf, Profile };
+
+std::vector<std::string> Words(const DistillerJob& job) {
+    std::vector<std::string> words = {
+        job.program, "-q", "-dBATCH", "-dNOPAUSE", "-dSAFER", "-sDEVICE=pdfwrite",
+    };
+    words.push_back("-sOutputFile=" + FileName(Pdf));
+    if (job.profile >= 0) {
+        words.push_back(FileName(Profile));
+        words.insert(words.end(),
+                     {"-c", std::string("(") + ProfileIsRead + "\\n) print flush", "-f"});
+    }
+    words.push_back(FileName(PostScript));
+    return words;
+}
+
+} // namespace
+
+EngineCommand GhostscriptCommand(const WorkFolder& folder, const DistillerJob& job, int input,
+                                 int log) {
+    EngineCommand command;
+    command.words = Words(job);
+    command.environment = EngineEnvironment(folder.Path());
+    command.folder = folder.Path();
+    command.descriptors = {input, log, log, job.postScript, job.pdf};
+    if (job.profile >= 0)
+        command.descriptors.push_back(job.profile);
+    command.times = job.limits;
+    command.resources.memory = MostGhostscriptMemory;
+    command.mayStartProcesses = false;
+    return command;
+}
+
+} // namespace standins

@@ -1,0 +1,24 @@
+#pragma once
+
+#include "standins/distiller/engine/DistillerJob.h"
+#include "standins/engine/EngineProcess.h"
+#include "standins/process/WorkFolder.h"
+
+#include <cstdint>
+#include <string>
+
+namespace standins {
+
+/// What Ghostscript may take of the address space, in bytes.
+constexpr std::uint64_t MostGhostscriptMemory = std::uint64_t{2} << 30;
+
+/// What Ghostscript says when it has read the profile to its end.
+constexpr const char* ProfileIsRead = "%%[Profile is read]%%";
+
+/// How Ghostscript is started in its work folder.
+/// @param input open for reading, its standard input
+/// @param log open for writing, where its messages go
+EngineCommand GhostscriptCommand(const WorkFolder& folder, const DistillerJob& job, int input,
+                                 int log);
+
+} // namespace standins

@@ -1,0 +1,43 @@
+// The supervisor of one run of Ghostscript. The bridge gives it the PostScript file to read, the
+// PDF file to write and, if there is one, the profile to read.
+
+#include "standins/distiller/engine/GhostscriptCommand.h"
+#include "standins/distiller/engine/Supervision.h"
+#include "standins/engine/Supervisor.h"
+
+#include <cstdlib>
+#include <exception>
+
+namespace {
+
+int Run(int argc, char** argv) {
+    constexpr int Given = 3;
+    const standins::Channel bridge =
+        standins::BecomeSupervisor(Given, standins::MostGhostscriptMemory);
+    standins::DistillerJob job;
+    standins::SupervisorOptions supervisor;
+    bool hasProfile = false;
+    CLI::App options("Supervises one run of Ghostscript.");
+    supervisor.AddTo(options);
+    options.add_option("--program", job.program)->required();
+    options.add_flag("--profile", hasProfile);
+    CLI11_PARSE(options, argc, argv);
+    job.folder = supervisor.folder;
+    job.limits = supervisor.Limits();
+    job.postScript = standins::FirstGivenDescriptor;
+    job.pdf = standins::FirstGivenDescriptor + 1;
+    if (hasProfile)
+        job.profile = standins::FirstGivenDescriptor + 2;
+    standins::Supervise(job, bridge);
+    return EXIT_SUCCESS;
+}
+
+} // namespace
+
+int main(int argc, char** argv) {
+    try {
+        return Run(argc, argv);
+    } catch (const std::exception&) { // the bridge sees the channel close
+        return EXIT_FAILURE;
+    }
+}
