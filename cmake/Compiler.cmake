@@ -2,8 +2,11 @@
 add_library(project_options INTERFACE)
 target_compile_options(project_options INTERFACE
     -Wall -Wextra -Wpedantic -Werror
-    -Wshadow -Wnon-virtual-dtor -Woverloaded-virtual -Wcast-qual -Wformat=2
+    -Wshadow -Woverloaded-virtual -Wcast-qual -Wformat=2
     -Wimplicit-fallthrough -Wextra-semi -Wundef -Wvla)
+if(NOT WIN32) # whose COM interfaces have none
+    target_compile_options(project_options INTERFACE -Wnon-virtual-dtor)
+endif()
 # A log record names its source file as it stands in the project, wherever that was built.
 target_compile_options(project_options INTERFACE "-fmacro-prefix-map=${PROJECT_SOURCE_DIR}/=")
 target_compile_definitions(project_options INTERFACE UNICODE _UNICODE)

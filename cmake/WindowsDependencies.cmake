@@ -9,8 +9,8 @@ add_subdirectory(/usr/src/googletest "${CMAKE_BINARY_DIR}/googletest" EXCLUDE_FR
 
 # The libraries lie beside the program, as on a machine where it is installed.
 file(GLOB libraries
-    "${QUILLON_WINDOWS_LIBRARIES}/lib/wxbase32u_*.dll"
-    "${QUILLON_WINDOWS_LIBRARIES}/lib/wxmsw32u_core_*.dll")
+    "${QUILLON_WINDOWS_LIBRARIES}/bin/wxbase32u_*.dll"
+    "${QUILLON_WINDOWS_LIBRARIES}/bin/wxmsw32u_core_*.dll")
 foreach(name libstdc++-6.dll libgcc_s_seh-1.dll libwinpthread-1.dll zlib1.dll)
     execute_process(COMMAND "${CMAKE_CXX_COMPILER}" -print-file-name=${name}
                     OUTPUT_VARIABLE path OUTPUT_STRIP_TRAILING_WHITESPACE)

@@ -33,7 +33,9 @@ COleVariant::COleVariant(const COleVariant& other) : VARIANT() {
 }
 
 COleVariant& COleVariant::operator=(const COleVariant& other) {
-    const HRESULT result = this == &other ? S_OK : VariantCopy(this, &other);
+    // Only read from; some editions of the header have forgotten to say so.
+    auto* const source = const_cast<COleVariant*>(&other);
+    const HRESULT result = this == &other ? S_OK : VariantCopy(this, source);
     if (FAILED(result))
         AfxThrowOleException(result);
     return *this;

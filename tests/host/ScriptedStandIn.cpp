@@ -4,6 +4,8 @@
 #include <objbase.h>
 #include <windows.h>
 
+#include <wx/string.h>
+// After the strings, which it takes for granted.
 #include <wx/msw/registry.h>
 
 STDAPI DllRegisterServer() {

@@ -144,7 +144,7 @@ TEST(Variant, ACopyThroughAReferenceHoldsTheValue) {
     toVariant.pvarVal = &text;
     VARIANT toReference = toVariant;
     toReference.pvarVal = &toText;
-    for (const VARIANT& reference : {toText, toVariant, toReference}) {
+    for (VARIANT reference : {toText, toVariant, toReference}) {
         VARIANT copy{};
         ASSERT_EQ(S_OK, VariantCopyInd(&copy, &reference));
         EXPECT_TRUE(Equal(text, copy));

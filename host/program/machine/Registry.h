@@ -1,7 +1,8 @@
 #pragma once
 
-#include <wx/msw/registry.h>
 #include <wx/string.h>
+// After the strings, which it takes for granted.
+#include <wx/msw/registry.h>
 
 // The registry keys and values that the host shares with its filters and the stand-ins.
 
