@@ -16,10 +16,14 @@ const Theme& HeaderTheme() {
 
 } // namespace
 
-wxBEGIN_EVENT_TABLE(CWndDCPluginNamePanel, wxPanel) EVT_PAINT(CWndDCPluginNamePanel::OnPaint)
-    EVT_SIZE(CWndDCPluginNamePanel::OnSize) wxEND_EVENT_TABLE()
+// clang-format off
+wxBEGIN_EVENT_TABLE(CWndDCPluginNamePanel, wxPanel)
+    EVT_PAINT(CWndDCPluginNamePanel::OnPaint)
+    EVT_SIZE(CWndDCPluginNamePanel::OnSize)
+wxEND_EVENT_TABLE();
+// clang-format on
 
-        CWndDCPluginNamePanel::CWndDCPluginNamePanel(wxWindow* parent, int id)
+CWndDCPluginNamePanel::CWndDCPluginNamePanel(wxWindow* parent, int id)
     : wxPanel(parent, id, wxDefaultPosition, wxSize(wxDefaultCoord, StripHeight),
               wxTAB_TRAVERSAL | wxBORDER_NONE) {
     SetBackgroundColour(HeaderTheme().backgroundColour);

@@ -21,9 +21,8 @@ wxStaticText* NewLabel(wxWindow* parent, int id, const char* english) {
     return new wxStaticText(parent, id, Translated(english), wxDefaultPosition, wxDefaultSize, 0);
 }
 
-wxPanel* NewBorderPanel(wxWindow* parent, int id, int height) {
-    auto* panel =
-        new wxPanel(parent, id, wxDefaultPosition, wxSize(wxDefaultCoord, height), BorderlessPanel);
+wxPanel* NewBorderPanel(wxWindow* parent) {
+    auto* panel = new wxPanel(parent, wxID_ANY, wxDefaultPosition, wxDefaultSize, BorderlessPanel);
     panel->SetBackgroundColour(DefaultTheme().borderColour);
     return panel;
 }

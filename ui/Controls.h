@@ -14,8 +14,8 @@ class wxWindow;
 /// A label. Its English text is looked up in the host's catalogue.
 wxStaticText* NewLabel(wxWindow* parent, int id, const char* english);
 
-/// A panel without a border, in the colour of frames and lines, or in that of what they enclose.
-wxPanel* NewBorderPanel(wxWindow* parent, int id, int height);
+/// A panel without a border, in the colour of frames, or in that of what they enclose.
+wxPanel* NewBorderPanel(wxWindow* parent);
 wxPanel* NewContentPanel(wxWindow* parent);
 
 /// A frame of one pixel around `content`, which must be its child: gives the frame its sizer.

@@ -19,25 +19,23 @@ constexpr std::initializer_list<int> HandoutGroup = {
 
 } // namespace
 
-wxBEGIN_EVENT_TABLE(MSOfficePanel,
-                    OutputFileTypePanelMSO) EVT_RADIOBUTTON(ControlId::OrderHorizontal,
-                                                            MSOfficePanel::OnHorizontalOrder)
+// clang-format off
+wxBEGIN_EVENT_TABLE(MSOfficePanel, OutputFileTypePanelMSO)
+    EVT_RADIOBUTTON(ControlId::OrderHorizontal, MSOfficePanel::OnHorizontalOrder)
     EVT_RADIOBUTTON(ControlId::OrderVertical, MSOfficePanel::OnVerticalOrder)
-        EVT_CHECKBOX(ControlId::ScaleToFitPaper, MSOfficePanel::OnScaleToFitPage)
-            EVT_CHECKBOX(ControlId::PrintHiddenSlides, MSOfficePanel::OnPrintHiddenSlides)
-                EVT_CHECKBOX(ControlId::FrameSlides, MSOfficePanel::OnFrameSlides)
-                    EVT_CHECKBOX(ControlId::PrintCommentsAndInkMarkup,
-                                 MSOfficePanel::OnPrintCommentsAndInkMarkup)
-                        EVT_CHECKBOX(ControlId::HighQuality, MSOfficePanel::OnHighQuality)
-                            EVT_CHOICE(ControlId::Printer, MSOfficePanel::OnPrinter)
-                                EVT_CHOICE(ControlId::Print, MSOfficePanel::OnPrintOutputType)
-                                    EVT_CHOICE(ControlId::Colour, MSOfficePanel::OnColor)
-                                        EVT_CHOICE(ControlId::SlidesPerPage,
-                                                   MSOfficePanel::OnSlidesPerPage)
-                                            wxEND_EVENT_TABLE()
+    EVT_CHECKBOX(ControlId::ScaleToFitPaper, MSOfficePanel::OnScaleToFitPage)
+    EVT_CHECKBOX(ControlId::PrintHiddenSlides, MSOfficePanel::OnPrintHiddenSlides)
+    EVT_CHECKBOX(ControlId::FrameSlides, MSOfficePanel::OnFrameSlides)
+    EVT_CHECKBOX(ControlId::PrintCommentsAndInkMarkup, MSOfficePanel::OnPrintCommentsAndInkMarkup)
+    EVT_CHECKBOX(ControlId::HighQuality, MSOfficePanel::OnHighQuality)
+    EVT_CHOICE(ControlId::Printer, MSOfficePanel::OnPrinter)
+    EVT_CHOICE(ControlId::Print, MSOfficePanel::OnPrintOutputType)
+    EVT_CHOICE(ControlId::Colour, MSOfficePanel::OnColor)
+    EVT_CHOICE(ControlId::SlidesPerPage, MSOfficePanel::OnSlidesPerPage)
+wxEND_EVENT_TABLE();
+// clang-format on
 
-                                                MSOfficePanel::MSOfficePanel(wxWindow* parent,
-                                                                             bool controlsEnabled)
+MSOfficePanel::MSOfficePanel(wxWindow* parent, bool controlsEnabled)
     : OutputFileTypePanelMSO(parent, controlsEnabled), m_controlsEnabled(controlsEnabled) {
     SetBackgroundColour(Themer::GetThemeService()->GetTheme("Default").backgroundColour);
 }

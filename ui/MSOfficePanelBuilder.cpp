@@ -8,6 +8,7 @@
 #include "ui/MSOfficePanel.h"
 #include "ui/NotePanel.h"
 #include "ui/OutputFileType.h"
+#include "ui/PanelFit.h"
 #include "ui/PowerPointSettings.h"
 
 #include <wx/sizer.h>
@@ -60,6 +61,7 @@ MSOfficePanel* BuildMSOfficePanel(wxWindow* parent, const wxString& vendorName,
     panel->SetDistillerProfiles(profiles);
     panel->SetPrinters(printers);
     panel->SetupControls();
+    FitToTexts(panel);
     panel->TransferDataToWindow();
     return panel;
 }

@@ -47,7 +47,7 @@ wxSizer* OutputFileTypeFunc(wxWindow* parent, bool callFit, bool setSizer) {
     auto* top = new wxBoxSizer(wxVERTICAL);
     top->Add(NewLabel(parent, wxID_ANY, "Output file type"), 0, wxLEFT, 10);
 
-    wxPanel* frame = NewBorderPanel(parent, wxID_ANY, wxDefaultCoord);
+    wxPanel* frame = NewBorderPanel(parent);
     wxPanel* content = NewContentPanel(frame);
     FillContent(content);
     PutFrameAround(frame, content);

@@ -21,12 +21,14 @@ constexpr std::initializer_list<int> OutputGroup = {ControlId::OutputPDF, Contro
 
 } // namespace
 
+// clang-format off
 wxBEGIN_EVENT_TABLE(OutputFileTypePanelMSO, wxPanel)
     EVT_RADIOBUTTON(ControlId::OutputPS, OutputFileTypePanelMSO::OnPSChosen)
-        EVT_RADIOBUTTON(ControlId::OutputPDF,
-                        OutputFileTypePanelMSO::OnPDFChosen) wxEND_EVENT_TABLE()
+    EVT_RADIOBUTTON(ControlId::OutputPDF, OutputFileTypePanelMSO::OnPDFChosen)
+wxEND_EVENT_TABLE();
+// clang-format on
 
-            OutputFileTypePanelMSO::OutputFileTypePanelMSO(wxWindow* parent, bool controlsEnabled)
+OutputFileTypePanelMSO::OutputFileTypePanelMSO(wxWindow* parent, bool controlsEnabled)
     : wxPanel(parent, wxID_ANY, wxDefaultPosition, wxDefaultSize, wxTAB_TRAVERSAL | wxBORDER_NONE),
       m_controlsEnabled(controlsEnabled) {
     // The values go to controls in panels within this one, whatever the host's window says of

@@ -3,6 +3,7 @@
 #include "common/Translated.h"
 #include "ui/ControlIds.h"
 #include "ui/Controls.h"
+#include "ui/SeparatorLine.h"
 
 #include <wx/checkbox.h>
 #include <wx/choice.h>
@@ -18,7 +19,6 @@ namespace {
 constexpr int PrinterWidth = 212;
 constexpr int OptionWidth = 140;
 constexpr int CountWidth = 50;
-constexpr int LineHeight = 1;
 constexpr int SpacerSize = 20;
 
 // The flags of a cell, by what they do.
@@ -36,9 +36,7 @@ public:
         m_sizer->Add(NewLabel(m_parent, id, english), 0, flags, border);
     }
     void Space(int flags) { m_sizer->Add(SpacerSize, SpacerSize, 0, flags, 5); }
-    void Line() {
-        m_sizer->Add(NewBorderPanel(m_parent, ControlId::Separator, LineHeight), 0, wxEXPAND, 0);
-    }
+    void Line() { m_sizer->Add(new SeparatorLine(m_parent, ControlId::Separator), 0, wxEXPAND, 0); }
     void Choice(int id, int width, std::initializer_list<const char*> entries, int flags) {
         wxArrayString shown;
         for (const char* entry : entries)
@@ -152,7 +150,7 @@ wxSizer* PowerPointSettingsFunc(wxWindow* parent, bool callFit, bool setSizer) {
     top->Add(NewPrinterRow(parent), 0, wxEXPAND | wxALIGN_CENTER_VERTICAL | wxALL, 5);
     top->Add(NewLabel(parent, wxID_ANY, "PowerPoint settings"), 0, wxLEFT, 10);
 
-    wxPanel* frame = NewBorderPanel(parent, wxID_ANY, wxDefaultCoord);
+    wxPanel* frame = NewBorderPanel(parent);
     wxPanel* content = NewContentPanel(frame);
     FillContent(content);
     PutFrameAround(frame, content);

@@ -11,6 +11,7 @@
 
 #include <wx/app.h>
 #include <wx/init.h>
+#include <wx/utils.h>
 
 #include <exception>
 
@@ -75,6 +76,8 @@ ExitCode RunOnConsole(const CommandLine& line) {
 }
 
 ExitCode RunOnDesktop(const CommandLine& line, char* programName) {
+    // A scroll bar that hides would leave whoever needs large letters without a hint of the rest.
+    wxSetEnv("GTK_OVERLAY_SCROLLING", "0");
     wxApp::SetInstance(new wxApp); // belongs to wxWidgets
     int count = 1;                 // the toolkit would take our options for its own
     char* arguments[] = {programName, nullptr};

@@ -10,6 +10,7 @@
 namespace {
 
 constexpr int ConsolePointSize = 10;
+constexpr int MostHeaderPixels = 13;
 
 bool HasDesktop() {
     const wxAppConsole* const app = wxAppConsole::GetInstance(); // wxTheApp believes it is a wxApp
@@ -25,14 +26,21 @@ wxColour Colour(unsigned rgb) {
             static_cast<unsigned char>(rgb)};
 }
 
+/// The strips that the header's font is for have room for one line of it and do not grow.
+wxFont Bounded(wxFont font) {
+    if (font.GetPixelSize().y > MostHeaderPixels)
+        font.SetPixelSize(wxSize(0, MostHeaderPixels));
+    return font;
+}
+
 wxFont Font(Surface surface) {
     const wxFont font = HasDesktop() ? wxSystemSettings::GetFont(wxSYS_DEFAULT_GUI_FONT)
                                      : wxFont(wxFontInfo(ConsolePointSize));
     switch (surface) {
     case Surface::HeaderView:
-        return font.Scaled(1.3F).Bold();
+        return Bounded(font.Bold());
     case Surface::Note:
-        return font.Scaled(0.95F);
+        return font.Bold();
     case Surface::Default:
         break;
     }

@@ -32,8 +32,7 @@ SettingsDialogue::SettingsDialogue(const FilterSet& filters, const Settings& set
     top->Add(new wxStaticLine(this), 0, wxEXPAND);
     top->Add(NewButtons(), 0, wxEXPAND | wxALL, FromDIP(Margin));
     SetSizerAndFit(top);
-    SetEscapeId(wxID_CANCEL);
-    Bind(wxEVT_BUTTON, &SettingsDialogue::OnSave, this, wxID_SAVE);
+    Bind(wxEVT_BUTTON, &SettingsDialogue::OnSave, this, ButtonId::Save);
     Bind(wxEVT_CHAR_HOOK, &SettingsDialogue::OnKey, this);
     CentreOnScreen();
 }
@@ -64,13 +63,15 @@ wxScrolledWindow* SettingsDialogue::NewPanels(const Settings& settings) {
 }
 
 wxSizer* SettingsDialogue::NewButtons() {
-    // In our own words: wxWidgets knows them only in the languages that are installed with it.
-    auto* const save = new wxButton(this, wxID_SAVE, _("&Save"));
+    // Identifiers of our own: the toolkit words buttons with its own in the desktop's language.
+    auto* const save = new wxButton(this, ButtonId::Save, _("&Save"));
+    auto* const cancel = new wxButton(this, ButtonId::Cancel, _("&Cancel"));
     auto* const buttons = new wxStdDialogButtonSizer;
-    buttons->AddButton(save);
-    buttons->AddButton(new wxButton(this, wxID_CANCEL, _("&Cancel")));
+    buttons->SetAffirmativeButton(save);
+    buttons->SetCancelButton(cancel);
     buttons->Realize();
     save->SetDefault();
+    SetEscapeId(ButtonId::Cancel);
     return buttons;
 }
 
@@ -93,6 +94,6 @@ void SettingsDialogue::OnKey(wxKeyEvent& event) {
         event.GetKeyCode() == WXK_RETURN || event.GetKeyCode() == WXK_NUMPAD_ENTER;
     if (!isReturn || event.HasAnyModifiers() || wxDynamicCast(FindFocus(), wxButton))
         return event.Skip();
-    wxCommandEvent save(wxEVT_BUTTON, wxID_SAVE);
+    wxCommandEvent save(wxEVT_BUTTON, ButtonId::Save);
     OnSave(save);
 }

@@ -9,6 +9,13 @@
 class Settings;
 class wxScrolledWindow;
 
+/// The identifiers of the window's buttons.
+namespace ButtonId {
+
+enum : int { Save = wxID_HIGHEST + 1, Cancel };
+
+} // namespace ButtonId
+
 /// The window with the settings panel of each filter that has one. It ends with wxID_SAVE when the
 /// settings are stored, else with wxID_CANCEL.
 class SettingsDialogue : public wxDialog {
