@@ -6,13 +6,13 @@
 
 namespace standins {
 
-/// One document to turn into PDF.
+/// One document to turn into something else.
 struct EngineJob {
     std::string program;      ///< LibreOffice's program folder
     std::string folder;       ///< the work folder, not made yet
     std::string extension;    ///< of the document, without a dot
     std::string importFilter; ///< LibreOffice's name of the document's type
-    std::string exportFilter; ///< LibreOffice's PDF filter, with options in JSON if any
+    std::string exportTo;     ///< extension, colon, LibreOffice's filter with options if any
     TimeLimits limits{};
 };
 

@@ -7,11 +7,11 @@
 namespace standins {
 
 /// Opens what the engine made.
-/// @return closed when there is no PDF
-Descriptor OpenPdf(const std::string& path);
+/// @return closed when there is none: no PDF, no package, whichever its extension says
+Descriptor OpenOutput(const std::string& path);
 
-/// Why there is no PDF although the engine ended well: LibreOffice answers success when it failed,
+/// Why there is none although the engine ended well: LibreOffice answers success when it failed,
 /// and only its log tells more.
-std::string DescribeMissingPdf(const std::string& log);
+std::string DescribeMissingOutput(const std::string& log);
 
 } // namespace standins

@@ -20,7 +20,7 @@ std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
         "-env:UNO_SHARED_PACKAGES_CACHE=" + installation + "/shared",
         "--infilter=" + job.importFilter,
         "--convert-to",
-        "pdf:" + job.exportFilter,
+        job.exportTo,
         "--outdir",
         folder.Path() + "/out",
         DocumentPath(folder, job),
@@ -33,8 +33,8 @@ std::string DocumentPath(const WorkFolder& folder, const EngineJob& job) {
     return folder.Path() + "/document." + job.extension;
 }
 
-std::string PdfPath(const WorkFolder& folder) {
-    return folder.Path() + "/out/document.pdf";
+std::string OutputPath(const WorkFolder& folder, const EngineJob& job) {
+    return folder.Path() + "/out/document." + job.exportTo.substr(0, job.exportTo.find(':'));
 }
 
 std::string LogPath(const WorkFolder& folder) {

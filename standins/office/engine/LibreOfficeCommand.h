@@ -10,7 +10,7 @@ namespace standins {
 
 // The files of a work folder.
 std::string DocumentPath(const WorkFolder& folder, const EngineJob& job);
-std::string PdfPath(const WorkFolder& folder);
+std::string OutputPath(const WorkFolder& folder, const EngineJob& job);
 std::string LogPath(const WorkFolder& folder);
 
 /// What an engine of this kind may take of the address space, in bytes: LibreOffice takes 450 MB

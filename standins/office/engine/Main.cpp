@@ -19,7 +19,7 @@ int Run(int argc, char** argv) {
     options.add_option("--program", job.program)->required();
     options.add_option("--extension", job.extension)->required();
     options.add_option("--import", job.importFilter)->required();
-    options.add_option("--export", job.exportFilter)->required();
+    options.add_option("--export", job.exportTo)->required();
     CLI11_PARSE(options, argc, argv);
     job.folder = supervisor.folder;
     job.limits = supervisor.Limits();

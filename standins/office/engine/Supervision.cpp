@@ -64,12 +64,12 @@ Message ConvertInFolder(const EngineJob& job, int document, const Channel& serve
         return Failure(DescribeError("LibreOffice's profile cannot be written", errno));
     EngineWatch watch(EngineName, job.limits, server);
     std::string failure = RunEngine(job, folder, watch);
-    Descriptor pdf = failure.empty() ? OpenPdf(PdfPath(folder)) : Descriptor();
-    if (pdf.IsOpen())
-        return Message{MessageKind::Done, copy.sha256, std::move(pdf)};
+    Descriptor output = failure.empty() ? OpenOutput(OutputPath(folder, job)) : Descriptor();
+    if (output.IsOpen())
+        return Message{MessageKind::Done, copy.sha256, std::move(output)};
     if (IsFull(folder.Path()))
         return Failure(DescribeFull(job.folder.substr(0, job.folder.rfind('/'))));
-    return Failure(failure.empty() ? DescribeMissingPdf(LogPath(folder)) : failure);
+    return Failure(failure.empty() ? DescribeMissingOutput(LogPath(folder)) : failure);
 }
 
 } // namespace

@@ -7,7 +7,7 @@ namespace standins {
 
 /// Does a whole engine run: makes the work folder, copies the document into it, lets LibreOffice
 /// convert it under the two clocks, and clears everything away again; then tells the server, by a
-/// message Done with the PDF attached and the document's SHA-256 as its text, or by a message
+/// message Done with the output attached and the document's SHA-256 as its text, or by a message
 /// Failed with the reason. While it works it sends a message Alive from time to time. When the
 /// server goes, everything ends at once.
 /// @param document open for reading

@@ -11,8 +11,8 @@ struct Application {
     CLSID clsid;           ///< our own, not Office's
     const wchar_t* progId; ///< without a version: "Word.Application"
     const wchar_t* title;
-    const char* library;   ///< of LibreOffice's, without which the application cannot be served
-    IDispatch* (*start)(); ///< a new running application
+    std::vector<const char*> libraries; ///< of LibreOffice's, without which it cannot be served
+    IDispatch* (*start)();              ///< a new running application
 };
 
 const std::vector<Application>& Applications();

@@ -1,5 +1,7 @@
 #include "standins/office/server/AutomationObject.h"
 
+#include <windows.h>
+
 #include <cwchar>
 #include <exception>
 #include <new>
@@ -36,6 +38,8 @@ HRESULT CheckArguments(const Member& member, const DISPPARAMS& arguments) {
 }
 
 HRESULT Raise(const Raised& error, const wchar_t* source, EXCEPINFO* exception) {
+    // Clients tend to answer with a code alone.
+    OutputDebugStringW((std::wstring(source) + L": " + error.description).c_str());
     if (exception) {
         *exception = EXCEPINFO{};
         exception->bstrSource = SysAllocString(source);

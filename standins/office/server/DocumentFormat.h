@@ -11,7 +11,7 @@ struct DocumentFormat {
     /// Said to LibreOffice, it takes nothing else under this extension; left to itself, it would
     /// import anything at all as text.
     const char* importFilter;
-    const char* exportFilter; ///< makes the PDF
+    std::string exportTo; ///< what its pages are made as: LibreOffice's "pdf:" and a filter
 };
 
 /// @return the format of the document at `path` by its extension in any case; null when it is none

@@ -5,8 +5,6 @@
 #include "standins/office/server/EngineRun.h"
 #include "standins/office/server/Protection.h"
 
-#include <windows.h>
-
 namespace standins {
 
 namespace {
@@ -16,32 +14,38 @@ namespace {
 }
 
 [[noreturn]] void RaiseCannotLoad(const std::wstring& path, const std::wstring& reason) {
-    if (!IsPasswordProtected(path))
-        RaiseCannotOpen(path, reason);
-    OutputDebugStringW((path + L": protected by a password").c_str());
-    RaiseCannotOpen(path, L"it is protected by a password");
+    RaiseCannotOpen(path, IsPasswordProtected(path) ? L"it is protected by a password" : reason);
 }
 
 } // namespace
 
-Pdf LoadDocument(const std::wstring& path, const std::vector<DocumentFormat>& formats) {
+const DocumentFormat& FormatOf(const std::wstring& path,
+                               const std::vector<DocumentFormat>& formats) {
     const DocumentFormat* format = FindFormat(formats, path);
     if (!format)
         RaiseCannotOpen(path, L"it is not a document of this application");
+    return *format;
+}
+
+DocumentFile OpenDocument(const std::wstring& path) {
     std::wstring failure;
-    const DocumentFile document = OpenDocumentFile(path, failure);
+    DocumentFile document = OpenDocumentFile(path, failure);
     if (!document.descriptor.IsOpen())
         RaiseCannotOpen(path, failure);
+    return document;
+}
 
-    PdfCache& cache = PdfCache::Instance();
-    if (Pdf known = cache.Find(document, *format))
+Export LoadDocument(const std::wstring& path, const DocumentFile& document,
+                    const DocumentFormat& format) {
+    ExportCache& cache = ExportCache::Instance();
+    if (Export known = cache.Find(document, format))
         return known;
-    EngineResult result = RunEngine(document, *format);
-    if (!result.pdf.IsOpen())
+    EngineResult result = RunEngine(document, format);
+    if (!result.output.IsOpen())
         RaiseCannotLoad(path, result.failure);
-    Pdf pdf = std::make_shared<const Descriptor>(std::move(result.pdf));
-    cache.Add(document, *format, result.sha256, pdf);
-    return pdf;
+    Export output = std::make_shared<const Descriptor>(std::move(result.output));
+    cache.Add(document, format, result.sha256, output);
+    return output;
 }
 
 } // namespace standins

@@ -1,18 +1,27 @@
 #pragma once
 
+#include "standins/module/DocumentFile.h"
 #include "standins/office/server/DocumentFormat.h"
-#include "standins/office/server/PdfCache.h"
+#include "standins/office/server/ExportCache.h"
 
 #include <string>
 #include <vector>
 
 namespace standins {
 
-/// Opens a document as the applications do: it is loaded at once, to the last page.
-/// @param path full path
+// The steps of opening a document as the applications do. Each throws Raised when it cannot be
+// opened.
+
 /// @param formats those that the application opens
-/// @return its pages
-/// @throws Raised when it cannot be opened
-Pdf LoadDocument(const std::wstring& path, const std::vector<DocumentFormat>& formats);
+const DocumentFormat& FormatOf(const std::wstring& path,
+                               const std::vector<DocumentFormat>& formats);
+
+/// @param path full path
+DocumentFile OpenDocument(const std::wstring& path);
+
+/// Loads it at once, to the last page; not again when its bytes are known.
+/// @return what the format makes of it
+Export LoadDocument(const std::wstring& path, const DocumentFile& document,
+                    const DocumentFormat& format);
 
 } // namespace standins

@@ -20,7 +20,7 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
         "--program=" + program,
         std::string("--extension=") + format.extension,
         std::string("--import=") + format.importFilter,
-        std::string("--export=") + format.exportFilter,
+        "--export=" + format.exportTo,
     };
     run.descriptors = {document.descriptor.Get()};
     run.folder = WorkFolder::NewPath("office");

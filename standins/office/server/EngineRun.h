@@ -9,7 +9,7 @@ namespace standins {
 
 /// What came of an engine run.
 struct EngineResult {
-    Descriptor pdf; ///< closed when it failed
+    Descriptor output; ///< what LibreOffice made; closed when it failed
     std::string sha256;
     std::wstring failure; ///< why it failed, as the end of a sentence
 };

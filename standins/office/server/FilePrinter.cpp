@@ -41,6 +41,7 @@ std::vector<std::string> WriterArguments(const PrintRequest& request) {
     const std::string user = g_get_user_name();
     if (!user.empty())
         arguments.push_back("--user=" + user);
+    arguments.insert(arguments.end(), request.layout.begin(), request.layout.end());
     return arguments;
 }
 
@@ -92,6 +93,13 @@ std::string WritePostScript(const PrintRequest& request, int output) {
 }
 
 } // namespace
+
+int CheckCopies(long copies) {
+    constexpr long Most = 32767; // Office's own limit
+    if (copies < 1 || copies > Most)
+        throw Raised{L"A document cannot be printed " + std::to_wstring(copies) + L" times."};
+    return static_cast<int>(copies);
+}
 
 void PrintToFile(const PrintRequest& request) {
     const std::optional<std::string> path = ToUtf8(request.output);

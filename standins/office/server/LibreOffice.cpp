@@ -5,6 +5,7 @@
 #include <glib.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <memory>
 #include <string_view>
@@ -56,8 +57,10 @@ std::string NameOf(const fs::path& program) {
 
 } // namespace
 
-bool LibreOffice::Has(const std::string& library) const {
-    return access((fs::path(program) / library).c_str(), R_OK) == 0;
+bool LibreOffice::HasAll(const std::vector<const char*>& libraries) const {
+    return std::all_of(libraries.begin(), libraries.end(), [&](const char* library) {
+        return access((fs::path(program) / library).c_str(), R_OK) == 0;
+    });
 }
 
 std::optional<LibreOffice> FindLibreOffice() {

@@ -2,6 +2,7 @@
 
 #include <optional>
 #include <string>
+#include <vector>
 
 namespace standins {
 
@@ -10,8 +11,8 @@ struct LibreOffice {
     std::string program; ///< its program folder
     std::string name;    ///< for people, with its version: "LibreOffice 7.4.7.2"
 
-    /// Whether its program folder holds a library, for instance "libswlo.so".
-    bool Has(const std::string& library) const;
+    /// Whether its program folder holds these libraries, for instance "libswlo.so".
+    bool HasAll(const std::vector<const char*>& libraries) const;
 };
 
 /// Looks for LibreOffice as a shell would, by `soffice` and PATH, and learns its version from its

@@ -7,9 +7,10 @@
 namespace standins {
 
 OpenedDocument::OpenedDocument(const std::wstring& path, const std::vector<DocumentFormat>& formats)
-    : m_name(FileName(path)), m_pages(LoadDocument(path, formats)) {}
+    : m_name(FileName(path)), m_path(path), m_format(FormatOf(path, formats)),
+      m_file(OpenDocument(path)), m_pages(LoadDocument(path, m_file, m_format)) {}
 
-const Pdf& OpenedDocument::Pages() const {
+const Export& OpenedDocument::Pages() const {
     if (!m_isOpen)
         throw Raised{m_name + L" is closed."};
     if (!m_pages)
@@ -17,11 +18,21 @@ const Pdf& OpenedDocument::Pages() const {
     return m_pages;
 }
 
+Export OpenedDocument::MadeAs(const std::string& exportTo) const {
+    if (exportTo == m_format.exportTo)
+        return Pages();
+    Pages();
+    DocumentFormat format = m_format;
+    format.exportTo = exportTo;
+    return LoadDocument(m_path, m_file, format);
+}
+
 void OpenedDocument::Close() {
     if (!m_isOpen)
         throw Raised{m_name + L" is closed."};
     m_isOpen = false;
     m_pages.reset();
+    m_file = {};
 }
 
 } // namespace standins

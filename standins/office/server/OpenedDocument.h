@@ -1,7 +1,7 @@
 #pragma once
 
 #include "standins/office/server/DocumentFormat.h"
-#include "standins/office/server/PdfCache.h"
+#include "standins/office/server/ExportCache.h"
 
 #include <string>
 #include <vector>
@@ -20,14 +20,22 @@ public:
     const std::wstring& Name() const { return m_name; }
 
     /// @throws Raised when the document is closed, or has nothing in it
-    const Pdf& Pages() const;
+    const Export& Pages() const;
+
+    /// The document made as something else than its pages; the engine may have to load it again.
+    /// @param exportTo as in DocumentFormat
+    /// @throws Raised when the document is closed, or that cannot be made
+    Export MadeAs(const std::string& exportTo) const;
 
     /// @throws Raised when the document is closed already
     void Close();
 
 private:
     std::wstring m_name = L"The new document";
-    Pdf m_pages;
+    std::wstring m_path;
+    DocumentFormat m_format{};
+    DocumentFile m_file; ///< held, so that it is the same one as long as the document is open
+    Export m_pages;
     bool m_isOpen = true;
 };
 

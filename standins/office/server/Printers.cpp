@@ -1,5 +1,7 @@
 #include "standins/office/server/Printers.h"
 
+#include "standins/office/server/Call.h"
+
 #include <windows.h>
 #include <winspool.h>
 
@@ -7,13 +9,14 @@
 
 namespace standins {
 
-bool PrinterExists(const std::wstring& name) {
+void RequirePrinter(const std::wstring& name) {
     std::wstring changeable = name; // the spooler's interface wants it so
     HANDLE printer = nullptr;
-    if (name.empty() || !OpenPrinterW(changeable.data(), &printer, nullptr))
-        return false;
+    if (name.empty())
+        throw Raised{L"There is no printer to print on."};
+    if (!OpenPrinterW(changeable.data(), &printer, nullptr))
+        throw Raised{L"There is no printer named " + name + L"."};
     ClosePrinter(printer);
-    return true;
 }
 
 std::wstring DefaultPrinter() {

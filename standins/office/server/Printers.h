@@ -4,7 +4,8 @@
 
 namespace standins {
 
-bool PrinterExists(const std::wstring& name);
+/// @throws Raised when there is no printer of this name
+void RequirePrinter(const std::wstring& name);
 
 /// The printer that an application starts with: the system's default printer, else the first one;
 /// empty when there is none.

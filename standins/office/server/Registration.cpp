@@ -76,7 +76,7 @@ HRESULT RegisterApplications() {
         return S_OK;
     bool isEntered = EnterFacts(*libreOffice);
     for (const Application& application : Applications()) {
-        if (libreOffice->Has(application.library))
+        if (libreOffice->HasAll(application.libraries))
             isEntered = Register(application) && isEntered;
     }
     return isEntered ? S_OK : SELFREG_E_CLASS;

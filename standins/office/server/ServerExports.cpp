@@ -1,7 +1,7 @@
 // What COM asks of an in-process server.
 
 #include "standins/office/server/ClassFactory.h"
-#include "standins/office/server/PdfCache.h"
+#include "standins/office/server/ExportCache.h"
 #include "standins/office/server/Registration.h"
 
 #include <exception>
@@ -41,7 +41,8 @@ STDAPI DllGetClassObject(REFCLSID clsid, REFIID iid, LPVOID* object) {
 
 /// The pages that are kept in case their document is opened again would go with the module.
 STDAPI DllCanUnloadNow() {
-    return !standins::IsModuleInUse() && standins::PdfCache::Instance().IsEmpty() ? S_OK : S_FALSE;
+    return !standins::IsModuleInUse() && standins::ExportCache::Instance().IsEmpty() ? S_OK
+                                                                                     : S_FALSE;
 }
 
 STDAPI DllRegisterServer() {

@@ -1,8 +1,12 @@
 #include "standins/office/server/excel/ExcelApplication.h"
 
+#include "standins/office/server/Printers.h"
 #include "standins/office/server/excel/ExcelWorkbooks.h"
 
 namespace standins {
+
+ExcelApplication::ExcelApplication()
+    : AutomationObject(std::make_shared<Session>(L"Excel", DefaultPrinter())) {}
 
 const std::vector<Member>& ExcelApplication::Members() const {
     static const std::vector<Member> members = {

@@ -7,7 +7,7 @@ namespace standins {
 /// Excel's Application object: one running Excel.
 class ExcelApplication : public AutomationObject {
 public:
-    ExcelApplication() : AutomationObject(std::make_shared<Session>(L"Excel")) {}
+    ExcelApplication();
 
 protected:
     const std::vector<Member>& Members() const override;

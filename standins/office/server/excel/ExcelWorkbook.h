@@ -16,6 +16,7 @@ protected:
 
 private:
     void Close(Call& call);
+    void PrintOut(Call& call);
 
     OpenedDocument m_document;
 };

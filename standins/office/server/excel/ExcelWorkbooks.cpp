@@ -7,8 +7,8 @@ namespace standins {
 namespace {
 
 const std::vector<DocumentFormat> Formats = {
-    {"xls", "MS Excel 97", "calc_pdf_Export"},
-    {"xlsx", "Calc MS Excel 2007 XML", "calc_pdf_Export"},
+    {"xls", "MS Excel 97", "pdf:calc_pdf_Export"},
+    {"xlsx", "Calc MS Excel 2007 XML", "pdf:calc_pdf_Export"},
 };
 
 // Arguments of Open. Those that are not named have no bearing: workbooks are read only, never

@@ -1,8 +1,12 @@
 #include "standins/office/server/powerpoint/PowerPointApplication.h"
 
+#include "standins/office/server/Printers.h"
 #include "standins/office/server/powerpoint/PowerPointPresentations.h"
 
 namespace standins {
+
+PowerPointApplication::PowerPointApplication()
+    : AutomationObject(std::make_shared<Session>(L"PowerPoint", DefaultPrinter())) {}
 
 const std::vector<Member>& PowerPointApplication::Members() const {
     static const std::vector<Member> members = {

@@ -7,7 +7,7 @@ namespace standins {
 /// PowerPoint's Application object: one running PowerPoint.
 class PowerPointApplication : public AutomationObject {
 public:
-    PowerPointApplication() : AutomationObject(std::make_shared<Session>(L"PowerPoint")) {}
+    PowerPointApplication();
 
 protected:
     const std::vector<Member>& Members() const override;

@@ -2,22 +2,25 @@
 
 #include "standins/office/server/AutomationObject.h"
 #include "standins/office/server/OpenedDocument.h"
+#include "standins/office/server/powerpoint/PresentationPrint.h"
 
 namespace standins {
 
 /// PowerPoint's Presentation object.
 class PowerPointPresentation : public AutomationObject {
 public:
-    PowerPointPresentation(SharedSession session, OpenedDocument document)
-        : AutomationObject(std::move(session)), m_document(std::move(document)) {}
+    PowerPointPresentation(SharedSession session, OpenedDocument document);
 
 protected:
     const std::vector<Member>& Members() const override;
 
 private:
+    void PrintOptions(Call& call);
+    void PrintOut(Call& call);
     void Close(Call& call);
 
     OpenedDocument m_document;
+    SharedPresentationPrint m_print;
 };
 
 } // namespace standins

@@ -7,10 +7,10 @@ namespace standins {
 namespace {
 
 const std::vector<DocumentFormat> Formats = {
-    {"ppt", "MS PowerPoint 97", "impress_pdf_Export"},
-    {"pps", "MS PowerPoint 97 AutoPlay", "impress_pdf_Export"},
-    {"pptx", "Impress MS PowerPoint 2007 XML", "impress_pdf_Export"},
-    {"ppsx", "Impress MS PowerPoint 2007 XML AutoPlay", "impress_pdf_Export"},
+    {"ppt", "MS PowerPoint 97", SlidesExport},
+    {"pps", "MS PowerPoint 97 AutoPlay", SlidesExport},
+    {"pptx", "Impress MS PowerPoint 2007 XML", SlidesExport},
+    {"ppsx", "Impress MS PowerPoint 2007 XML AutoPlay", SlidesExport},
 };
 
 constexpr UINT OpenFileName = 0; // the others have no bearing: nothing is changed or shown

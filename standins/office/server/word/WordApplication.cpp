@@ -6,9 +6,8 @@
 
 namespace standins {
 
-WordApplication::WordApplication() : AutomationObject(std::make_shared<Session>(L"Word")) {
-    TheSession()->printer = DefaultPrinter();
-}
+WordApplication::WordApplication()
+    : AutomationObject(std::make_shared<Session>(L"Word", DefaultPrinter())) {}
 
 const std::vector<Member>& WordApplication::Members() const {
     static const std::vector<Member> members = {
@@ -44,8 +43,7 @@ void WordApplication::Quit(Call& /*call*/) {
 }
 
 void SelectPrinter(Session& session, const std::wstring& name) {
-    if (!PrinterExists(name))
-        throw Raised{L"There is no printer named " + name + L"."};
+    RequirePrinter(name);
     session.printer = name;
 }
 

@@ -1,6 +1,7 @@
 #include "standins/office/server/word/WordDocument.h"
 
 #include "standins/office/server/FilePrinter.h"
+#include "standins/office/server/Printers.h"
 
 namespace standins {
 
@@ -55,14 +56,6 @@ void RefuseUnsupported(const Call& call) {
     }
 }
 
-int CopiesOf(const Call& call) {
-    constexpr LONG Most = 32767; // Word's own limit
-    const LONG copies = call.Number(Copies, 1);
-    if (copies < 1 || copies > Most)
-        throw Raised{L"A document cannot be printed " + std::to_wstring(copies) + L" times."};
-    return copies;
-}
-
 } // namespace
 
 const std::vector<Member>& WordDocument::Members() const {
@@ -74,12 +67,11 @@ const std::vector<Member>& WordDocument::Members() const {
 }
 
 void WordDocument::PrintOut(Call& call) {
-    const Pdf& pages = m_document.Pages();
-    if (TheSession()->printer.empty())
-        throw Raised{L"There is no printer to print on."};
+    const Export& pages = m_document.Pages();
+    RequirePrinter(TheSession()->printer);
     RefuseUnsupported(call);
-    standins::PrintToFile({pages, m_document.Name(), call.Text(OutputFileName), CopiesOf(call),
-                           call.Flag(Collate, true)});
+    standins::PrintToFile({pages, m_document.Name(), call.Text(OutputFileName),
+                           CheckCopies(call.Number(Copies, 1)), call.Flag(Collate, true)});
 }
 
 /// What is to be saved does not matter: documents are never changed.

@@ -7,8 +7,8 @@ namespace standins {
 namespace {
 
 const std::vector<DocumentFormat> Formats = {
-    {"doc", "MS Word 97", "writer_pdf_Export"},
-    {"docx", "MS Word 2007 XML", "writer_pdf_Export"},
+    {"doc", "MS Word 97", "pdf:writer_pdf_Export"},
+    {"docx", "MS Word 2007 XML", "pdf:writer_pdf_Export"},
 };
 
 // Arguments of Open. Those that are not named have no bearing: documents are read only, never

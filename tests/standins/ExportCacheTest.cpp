@@ -7,7 +7,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-class PdfCacheTest : public OfficeTest {
+class ExportCacheTest : public OfficeTest {
 protected:
     void Open(const fs::path& path) {
         WordClient word; // each its own, as a trial open and a print have it
@@ -22,7 +22,7 @@ protected:
 
 } // namespace
 
-TEST_F(PdfCacheTest, ADocumentIsLoadedOnceAsLongAsItsBytesStay) {
+TEST_F(ExportCacheTest, ADocumentIsLoadedOnceAsLongAsItsBytesStay) {
     const FakeEngine engine(FakeEngine::MakePdf());
     const fs::path path = m_files.Write("cached.docx", "The first bytes");
     Open(path);
@@ -43,7 +43,7 @@ TEST_F(PdfCacheTest, ADocumentIsLoadedOnceAsLongAsItsBytesStay) {
     EXPECT_EQ(3U, engine.Starts());
 }
 
-TEST_F(PdfCacheTest, WhatCouldNotBeLoadedIsTriedAgain) {
+TEST_F(ExportCacheTest, WhatCouldNotBeLoadedIsTriedAgain) {
     const fs::path path = m_files.Write("again.docx", "A document that is loaded the second time");
     {
         const FakeEngine engine("exit 1");
@@ -55,7 +55,7 @@ TEST_F(PdfCacheTest, WhatCouldNotBeLoadedIsTriedAgain) {
     EXPECT_EQ(1U, engine.Starts());
 }
 
-TEST_F(PdfCacheTest, ManyDocumentsDoNotFillTheMachine) {
+TEST_F(ExportCacheTest, ManyDocumentsDoNotFillTheMachine) {
     // Each leaves 3 MB; a hundred of them would stay if only their number counted.
     const FakeEngine engine(FakeEngine::MakePdf() + "truncate -s 3M \"$PDF\"");
     WordClient word;

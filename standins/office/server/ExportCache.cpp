@@ -1,4 +1,4 @@
-#include "standins/office/server/PdfCache.h"
+#include "standins/office/server/ExportCache.h"
 
 #include "standins/process/FileBytes.h"
 
@@ -32,52 +32,52 @@ std::string SumOf(const DocumentFile& document) {
 
 } // namespace
 
-PdfCache& PdfCache::Instance() {
-    static PdfCache cache;
+ExportCache& ExportCache::Instance() {
+    static ExportCache cache;
     return cache;
 }
 
-Pdf PdfCache::Find(const DocumentFile& document, const DocumentFormat& format) {
+Export ExportCache::Find(const DocumentFile& document, const DocumentFormat& format) {
     if (!MayKnow(document))
         return nullptr;
     const std::string sum = SumOf(document);
     const std::lock_guard lock(m_mutex);
     for (auto entry = m_entries.begin(); entry != m_entries.end(); ++entry) {
         if (entry->sha256 == sum && entry->importFilter == format.importFilter &&
-            entry->exportFilter == format.exportFilter) {
+            entry->exportTo == format.exportTo) {
             m_entries.splice(m_entries.begin(), m_entries, entry);
-            return entry->pdf;
+            return entry->output;
         }
     }
     return nullptr;
 }
 
-void PdfCache::Add(const DocumentFile& document, const DocumentFormat& format,
-                   const std::string& sha256, const Pdf& pdf) {
+void ExportCache::Add(const DocumentFile& document, const DocumentFormat& format,
+                      const std::string& sha256, const Export& output) {
     const std::lock_guard lock(m_mutex);
     m_entries.push_front(
-        {document.size, format.importFilter, format.exportFilter, sha256, pdf, SizeOf(*pdf)});
+        {document.size, format.importFilter, format.exportTo, sha256, output, SizeOf(*output)});
     Shrink();
 }
 
-bool PdfCache::IsEmpty() {
+bool ExportCache::IsEmpty() {
     const std::lock_guard lock(m_mutex);
     return m_entries.empty();
 }
 
 /// Spares the reading of a document that is not known for sure.
-bool PdfCache::MayKnow(const DocumentFile& document) {
+bool ExportCache::MayKnow(const DocumentFile& document) {
     const std::lock_guard lock(m_mutex);
     return std::any_of(m_entries.begin(), m_entries.end(),
                        [&](const Entry& entry) { return entry.documentSize == document.size; });
 }
 
-void PdfCache::Shrink() {
+void ExportCache::Shrink() {
     std::uint64_t bytes = 0;
     std::size_t kept = 0;
     auto entry = m_entries.begin();
     for (; entry != m_entries.end() && kept < MostEntries; ++entry, ++kept) {
-        bytes += entry->pdfSize;
+        bytes += entry->exportSize;
         if (bytes > MostBytes)
             break;
     }

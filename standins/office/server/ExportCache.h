@@ -11,30 +11,31 @@
 
 namespace standins {
 
-/// A PDF in a file that has no name any more: it goes with the last that holds it.
-using Pdf = std::shared_ptr<const Descriptor>;
+/// What LibreOffice made of a document, as a rule a PDF, in a file that has no name any more: it
+/// goes with the last that holds it.
+using Export = std::shared_ptr<const Descriptor>;
 
-/// The PDFs of the documents that were loaded last, so that a document which was tried a moment
-/// ago need not be loaded again. A document is known by its bytes, not by its name or time.
-class PdfCache {
+/// What was made of the documents that were loaded last, so that a document which was tried a
+/// moment ago need not be loaded again. A document is known by its bytes, not by its name or time.
+class ExportCache {
 public:
-    static PdfCache& Instance();
+    static ExportCache& Instance();
 
     /// @return null when the document is not known
-    Pdf Find(const DocumentFile& document, const DocumentFormat& format);
+    Export Find(const DocumentFile& document, const DocumentFormat& format);
     /// @param sha256 of the document, as the supervisor sent it
     void Add(const DocumentFile& document, const DocumentFormat& format, const std::string& sha256,
-             const Pdf& pdf);
+             const Export& output);
     bool IsEmpty();
 
 private:
     struct Entry {
         std::uint64_t documentSize;
         std::string importFilter;
-        std::string exportFilter;
+        std::string exportTo;
         std::string sha256;
-        Pdf pdf;
-        std::uint64_t pdfSize;
+        Export output;
+        std::uint64_t exportSize;
     };
 
     bool MayKnow(const DocumentFile& document);
