@@ -1,5 +1,7 @@
 #include "standins/distiller/engine/GhostscriptCommand.h"
 
+#include "standins/distiller/engine/FontNames.h"
+
 namespace standins {
 
 namespace {
@@ -18,11 +20,12 @@ std::vector<std::string> Words(const DistillerJob& job) {
         job.program, "-q", "-dBATCH", "-dNOPAUSE", "-dSAFER", "-sDEVICE=pdfwrite",
     };
     words.push_back("-sOutputFile=" + FileName(Pdf));
+    std::string preparation = KeepFontsApart;
     if (job.profile >= 0) {
         words.push_back(FileName(Profile));
-        words.insert(words.end(),
-                     {"-c", std::string("(") + ProfileIsRead + "\\n) print flush", "-f"});
+        preparation += std::string("(") + ProfileIsRead + "\\n) print flush";
     }
+    words.insert(words.end(), {"-c", preparation, "-f"});
     words.push_back(FileName(PostScript));
     return words;
 }
