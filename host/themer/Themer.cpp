@@ -28,7 +28,7 @@ wxColour Colour(unsigned rgb) {
 
 /// The strips that the header's font is for have room for one line of it and do not grow.
 wxFont Bounded(wxFont font) {
-    if (font.GetPixelSize().y > MostHeaderPixels)
+    if (HasDesktop() && font.GetPixelSize().y > MostHeaderPixels)
         font.SetPixelSize(wxSize(0, MostHeaderPixels));
     return font;
 }

@@ -1,47 +1,12 @@
-#include "tests/host/Program.h"
-#include "tests/support/TemporaryFolder.h"
-
-#include <gtest/gtest.h>
+#include "tests/host/ConvertRun.h"
 
 namespace fs = std::filesystem;
 
 namespace {
 
 using nlohmann::json;
-using Arguments = std::vector<std::string>;
 
-class ConvertTest : public testing::Test {
-protected:
-    RunResult Convert(const Arguments& paths, const Arguments& options = {}) const {
-        return RunQuillon(ArgumentsFor(paths, options));
-    }
-
-    Arguments ArgumentsFor(const Arguments& paths, const Arguments& options = {}) const {
-        Arguments arguments = {"convert", "--json", "--out", Out()};
-        arguments.insert(arguments.end(), options.begin(), options.end());
-        for (const std::string& path : paths)
-            arguments.push_back((m_folder / path).string());
-        return arguments;
-    }
-
-    std::string Out() const { return (m_folder / "out").string(); }
-
-    /// The names in the output folder, hidden ones too.
-    std::vector<std::string> Outputs() const {
-        std::vector<std::string> names;
-        for (const auto& entry : fs::directory_iterator(Out()))
-            names.push_back(entry.path().filename().string());
-        std::sort(names.begin(), names.end());
-        return names;
-    }
-
-    /// What the filter was told when it made the output.
-    std::string Output(const std::string& name) const { return ReadBytes(fs::path(Out()) / name); }
-
-    TemporaryFolder m_folder;
-};
-
-using Names = std::vector<std::string>;
+using ConvertTest = ConvertRun;
 
 TEST_F(ConvertTest, DrivesTheFilterInItsOrderAndReportsTheOutput) {
     m_folder.Write("a.doc", "script");
@@ -136,26 +101,45 @@ TEST_F(ConvertTest, DocumentsOfOneNameAllGetAnOutput) {
 
 TEST_F(ConvertTest, SettingsComeFromFileCommandLineAndDefaults) {
     m_folder.Write("a.doc", "script");
-    const auto told = [&](const std::string& file, const Arguments& options) {
-        Arguments all = {"--settings", m_folder.Write("s.xml", file).string()};
-        all.insert(all.end(), options.begin(), options.end());
-        const RunResult run = Convert({"a.doc"}, all);
-        EXPECT_EQ(run.exitCode, 0) << run.err;
-        const std::string output = Output("a.ps");
-        return output.substr(output.find("</ServerInformation>\n\n") + 22);
-    };
     const std::string printer = "PRINTER=Quillon PostScript File Printer\n";
-    EXPECT_EQ(told("<UI/>", {}), printer + "OUTPUTFILETYPEPS=1\n");
-    EXPECT_EQ(told("<a><b><UI><PRINTER/><OUTPUTFILETYPEPS>0</OUTPUTFILETYPEPS></UI></b></a>", {}),
-              printer + "OUTPUTFILETYPEPS=0\n")
-        << "only what is missing is filled in";
-    EXPECT_EQ(told("<a><b><UI><COLOR>a</COLOR></UI></b><UI><COLOR>near</COLOR></UI></a>", {}),
-              printer + "OUTPUTFILETYPEPS=1\nCOLOR=near\n")
-        << "the element that filters find";
-    EXPECT_EQ(told("<UI><COLOR>one</COLOR><COLOR>two</COLOR><PRINTER>Nobody's</PRINTER></UI>",
-                   {"--set", "COLOR=Grau=\xC3\xA4", "--set", "HIGHQUALITY=1", "--set",
-                    "HIGHQUALITY=", "--printer", "Quillon PostScript File Printer"}),
-              "OUTPUTFILETYPEPS=1\n" + printer + "HIGHQUALITY=\nCOLOR=Grau=\xC3\xA4\n");
+    const std::string pdf = "OUTPUTFILETYPEPS=0\nOUTPUTFILETYPEPDF=1\n";
+    const std::string ps = "OUTPUTFILETYPEPS=1\nOUTPUTFILETYPEPDF=0\n";
+    const std::string profile = "SELECTEDDISTILLERPROFILE=Press.joboptions\n";
+    struct Case {
+        std::string file;
+        Arguments options;
+        std::string told;
+    };
+    const Case cases[] = {
+        {"<UI/>", {}, printer + pdf},
+        {"<UI/>", {"--ps"}, ps + printer},
+        {"<UI/>", {"--pdf", "--profile", "press"}, profile + pdf + printer},
+        {"<a><b><UI><PRINTER/><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS></UI></b></a>",
+         {},
+         printer + ps},
+        {"<UI><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS><SELECTEDDISTILLERPROFILE>Gone"
+         "</SELECTEDDISTILLERPROFILE></UI>", // no PDF file, and so no need of it
+         {},
+         "OUTPUTFILETYPEPS=1\nSELECTEDDISTILLERPROFILE=Gone\n" + printer + "OUTPUTFILETYPEPDF=0\n"},
+        {"<a><b><UI><COLOR>a</COLOR></UI></b><UI><COLOR>near</COLOR></UI></a>", // which filters
+                                                                                // find
+         {},
+         "COLOR=near\n" + printer + pdf},
+        {"<UI><COLOR>one</COLOR><COLOR>two</COLOR><PRINTER>Nobody's</PRINTER></UI>",
+         {"--set", "COLOR=Grau=\xC3\xA4", "--set", "HIGHQUALITY=1", "--set",
+          "HIGHQUALITY=", "--printer", "Quillon PostScript File Printer"},
+         "COLOR=Grau=\xC3\xA4\n" + printer + "HIGHQUALITY=\n" + pdf},
+    };
+    for (const Case& each : cases)
+        for (const char* jobs : {"1", "2"}) { // in the process, or in one of its own
+            Arguments options = {"--settings", m_folder.Write("s.xml", each.file).string(), "-j",
+                                 jobs};
+            options.insert(options.end(), each.options.begin(), each.options.end());
+            const RunResult run = Convert({"a.doc"}, options);
+            EXPECT_EQ(run.exitCode, 0) << run.err;
+            const std::string output = Output("a.ps");
+            EXPECT_EQ(output.substr(output.find("</ServerInformation>\n\n") + 22), each.told);
+        }
 }
 
 TEST_F(ConvertTest, TheOutputFolderIsMadeAndMayBeWrittenAnyWay) {

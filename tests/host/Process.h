@@ -31,3 +31,7 @@ private:
 
     std::intptr_t m_process = None; ///< the system's id or handle
 };
+
+/// Whether a process of `quillon` runs that was given the argument; where tests run one at a time,
+/// any such process.
+bool IsQuillonRunningWith(const std::string& argument);

@@ -48,10 +48,14 @@ RunResult RunQuillon(std::vector<std::string> arguments) {
     return RunProgram(QuillonCommand(std::move(arguments)));
 }
 
-void AwaitFile(const fs::path& file) {
+void Await(const std::string& what, const std::function<bool()>& condition) {
     using namespace std::chrono;
     const auto end = steady_clock::now() + seconds(20);
-    while (!fs::exists(file) && steady_clock::now() < end)
+    while (!condition() && steady_clock::now() < end)
         std::this_thread::sleep_for(milliseconds(5));
-    ASSERT_TRUE(fs::exists(file)) << file;
+    ASSERT_TRUE(condition()) << what;
+}
+
+void AwaitFile(const fs::path& file) {
+    Await(file.string(), [&file] { return fs::exists(file); });
 }

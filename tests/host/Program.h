@@ -4,6 +4,7 @@
 #include "tests/support/TemporaryFolder.h"
 
 #include <filesystem>
+#include <functional>
 #include <nlohmann/json.hpp>
 #include <string>
 #include <vector>
@@ -32,6 +33,9 @@ public:
     void Terminate() const { m_process.Terminate(); }
     RunResult Wait();
 
+    /// What it has said so far on stderr.
+    std::string Err() const { return ReadBytes(m_folder / "err"); }
+
 private:
     TemporaryFolder m_folder; ///< holds its output
     Process m_process;
@@ -45,5 +49,8 @@ RunResult RunQuillon(std::vector<std::string> arguments);
 /// The command that RunQuillon runs.
 std::vector<std::string> QuillonCommand(std::vector<std::string> arguments);
 
-/// Waits until the file exists; the test fails when it does not appear.
+/// Waits until the condition holds; the test fails when it does not.
+void Await(const std::string& what, const std::function<bool()>& condition);
+
+/// Waits until the file exists.
 void AwaitFile(const std::filesystem::path& file);

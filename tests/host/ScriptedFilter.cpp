@@ -14,6 +14,8 @@
 #include <wx/utils.h>
 #include <wx/xml/xml.h>
 
+#include <csignal>
+#include <cstdlib>
 #include <map>
 
 namespace {
@@ -63,8 +65,7 @@ public:
         Note("ApplySettings");
         const wxXmlNode* const ui = FindUi(settings);
         for (const wxXmlNode* setting = ui->GetChildren(); setting; setting = setting->GetNext())
-            if (setting->GetChildren())
-                m_told << setting->GetName() << '=' << setting->GetChildren()->GetContent() << '\n';
+            m_told << setting->GetName() << '=' << setting->GetNodeContent() << '\n';
         return 0;
     }
 
@@ -110,6 +111,12 @@ public:
             wxFile(script["started"], wxFile::write);
         while (!script["wait"].empty() && !wxFileExists(script["wait"]))
             wxMilliSleep(5);
+        if (!script["crash"].empty())
+            std::abort();
+#ifdef SIGSTOP
+        if (!script["stop"].empty())
+            std::raise(SIGSTOP);
+#endif
         if (script["output"] != "none")
             wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_told);
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
@@ -118,7 +125,9 @@ public:
         return Number(script, "convert");
     }
 
-    bool IsReady() override { return wxRegKey(wxRegKey::HKCR, "Word.Application").Exists(); }
+    bool IsReady() override {
+        return wxRegKey(wxRegKey::HKCR, "Word.Application").Exists();
+    }
 
 private:
     static std::unique_ptr<JobItem> ItemFor(const wxString& path) {

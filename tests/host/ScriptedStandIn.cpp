@@ -1,5 +1,5 @@
-// An Office stand-in for tests of the host: enters a Word and its engine, and tells the engine's
-// clocks by way of the engine's name.
+// A stand-in for tests of the host: enters a Word and its engine, and tells the engine's clocks by
+// way of the engine's name; and a Distiller.
 
 #include <objbase.h>
 #include <windows.h>
@@ -22,5 +22,12 @@ STDAPI DllRegisterServer() {
     wxRegKey self(wxRegKey::HKLM, "SOFTWARE\\Orvanta\\Office Stand-Ins");
     self.Create();
     self.SetValue("Engine", wxString::Format("Scripted engine, %ld of %ld s", stall, total));
+
+    wxRegKey distiller(wxRegKey::HKLM, "SOFTWARE\\Orvanta\\Distiller Stand-In");
+    distiller.Create();
+    distiller.SetValue("Engine", wxString("Scripted Distiller"));
+    wxRegKey version(wxRegKey::HKLM, "SOFTWARE\\Adobe\\Acrobat Distiller\\9.0");
+    version.Create();
+    version.SetValue("JobOptionsFolder", wxString(TEST_PROFILES));
     return S_OK;
 }

@@ -34,6 +34,9 @@ TEST(Status, TellsWhatThereIs) {
             preferred.push_back(printer);
     ASSERT_EQ(preferred.size(), 1U) << run.out;
     EXPECT_EQ(preferred[0]["postScript"], true);
+    EXPECT_EQ(run.Records("distiller").at(0)["engine"], "Scripted Distiller");
+    EXPECT_EQ(run.Records("distiller").at(0)["profiles"], json{"Press.joboptions"});
+    EXPECT_EQ(run.Records("panel").at(0)["enabled"], true);
     EXPECT_TRUE(run.Records("missing").empty()) << run.out;
     EXPECT_TRUE(Contains(run.err, "Ready to convert.")) << run.err;
 }
@@ -52,6 +55,8 @@ TEST(Status, TellsWhatIsMissingAndWhatToDo) {
     EXPECT_TRUE(Contains(noOffice.out, "No Office application is installed")) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, "apt-get install libreoffice-writer-nogui")) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, "not ready")) << noOffice.out;
+    EXPECT_TRUE(Contains(noOffice.out, "disabled: no Office application is installed"));
+    EXPECT_TRUE(Contains(noOffice.out, "nothing to make PDF files with")) << noOffice.out;
 
     const RunResult noFilter =
         RunProgram({QUILLON_PROGRAM, "status", "--filters", folder, "--stand-ins", TEST_STAND_INS});

@@ -51,7 +51,7 @@ TEST(Themer, GivesEachNameItsThemeAndUnknownNamesTheDefault) {
     EXPECT_EQ(&themer.GetTheme("Note"), &note) << "a reference stays good";
     for (const Theme* theme : {&standard, &note, &header})
         EXPECT_TRUE(theme->font.IsOk() && theme->textColour.IsOk() && theme->borderColour.IsOk());
-    EXPECT_GT(header.font.GetPointSize(), note.font.GetPointSize());
+    EXPECT_EQ(header.font.GetWeight(), wxFONTWEIGHT_BOLD);
 }
 
 } // namespace

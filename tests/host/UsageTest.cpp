@@ -47,6 +47,12 @@ TEST_F(UsageTest, OfTheCommandLine) {
     ExpectRefusal(Convert({"--set", "=x"}), "KEY=VALUE");
     ExpectRefusal(Convert({"--printer", "Nobody's"}), "Quillon PostScript File Printer");
     ExpectRefusal(Convert({"--set", "PRINTER=Nobody's"}), "no printer \"Nobody's\"");
+    ExpectRefusal(Convert({"--profile", "Pres"}), "no Distiller profile \"Pres\"");
+    ExpectRefusal(Convert({"--ps", "--pdf"}), "--pdf");
+    ExpectRefusal(Convert({"--ps", "--profile", "Press"}), "--profile");
+    ExpectRefusal(Convert({"-j", "0"}), "--jobs");
+    ExpectRefusal(Convert({"--lang", "tlh"}), "de es fr ja en");
+    ExpectRefusal({"settings"}, "--settings");
 }
 
 TEST_F(UsageTest, OfTheOutputFolder) {
@@ -96,8 +102,9 @@ TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
     EXPECT_EQ(bare.exitCode, 3);
     const std::string help = RunQuillon({"--help"}).out;
     EXPECT_EQ(bare.err, help);
-    for (const char* word : {"status", "screen", "convert", "--settings", "--engine-stall",
-                             "SLIDESPERPAGE", "Exit codes", "budget.xls.ps"})
+    for (const char* word :
+         {"status", "screen", "convert", "--settings", "--engine-stall", "SLIDESPERPAGE",
+          "Exit codes", "budget.xls.pdf", "--lang", "--profile", "settings"})
         EXPECT_NE(help.find(word), std::string::npos) << word;
     const RunResult ofCommand = RunQuillon({"convert", "--help"});
     EXPECT_EQ(ofCommand.exitCode, 0);

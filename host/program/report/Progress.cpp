@@ -28,7 +28,8 @@ wxString ProgressLine(int percent, const wxString& text) {
 bool Progress::Report(const wxString& text, int percent) {
     const int bounded = std::clamp(percent, 0, 100);
     // A step that only repeats which document it is says nothing new.
-    const wxString step = text.Contains(m_document) ? wxString() : OneLine(text);
+    const bool isItsName = text.Contains(m_document) || m_document.StartsWith(text);
+    const wxString step = isItsName ? wxString() : OneLine(text);
     if (m_reporter.ForTerminal())
         m_reporter.Passing(
             ProgressLine(bounded, Shortened(OneLine(m_document), LongestName) + "  " + step));

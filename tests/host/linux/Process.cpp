@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <csignal>
+#include <fstream>
 
 Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
                  const std::filesystem::path& err) {
@@ -50,4 +51,15 @@ int Process::Wait() {
     waitpid(static_cast<pid_t>(m_process), &status, 0);
     m_process = None;
     return WIFEXITED(status) ? WEXITSTATUS(status) : -WTERMSIG(status);
+}
+
+bool IsQuillonRunningWith(const std::string& argument) {
+    std::error_code error;
+    for (const auto& process : std::filesystem::directory_iterator("/proc", error)) {
+        std::ifstream commandLine(process.path() / "cmdline", std::ios::binary);
+        for (std::string each; std::getline(commandLine, each, '\0');)
+            if (each == argument)
+                return true;
+    }
+    return false;
 }

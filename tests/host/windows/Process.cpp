@@ -1,10 +1,11 @@
 #include "tests/host/Process.h"
 
 #include <windows.h>
-
+// After it, which it takes for granted.
 #include <wx/string.h>
 
 #include <gtest/gtest.h>
+#include <tlhelp32.h>
 
 namespace {
 
@@ -93,4 +94,16 @@ int Process::Wait() {
     CloseHandle(HandleOf(m_process));
     m_process = None;
     return static_cast<int>(exitCode);
+}
+
+bool IsQuillonRunningWith(const std::string& /*argument*/) {
+    HANDLE processes = CreateToolhelp32Snapshot(TH32CS_SNAPPROCESS, 0);
+    PROCESSENTRY32W process = {};
+    process.dwSize = sizeof process;
+    bool found = false;
+    for (BOOL more = Process32FirstW(processes, &process); more && !found;
+         more = Process32NextW(processes, &process))
+        found = wxString(process.szExeFile).IsSameAs("quillon.exe", false);
+    CloseHandle(processes);
+    return found;
 }
