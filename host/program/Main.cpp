@@ -69,7 +69,9 @@ ExitCode Run(const CommandLine& line) {
 }
 
 ExitCode RunOnConsole(const CommandLine& line) {
-    if (line.command != Command::Worker)
+    if (line.command == Command::Worker)
+        Interruption::LeaveToParent();
+    else
         Interruption::Install();
     const wxInitializer toolkit;
     return toolkit.IsOk() ? Run(line) : ExitCode::MachineAtFault;

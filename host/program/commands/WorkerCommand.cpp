@@ -2,7 +2,6 @@
 #include "host/program/documents/Conversion.h"
 #include "host/program/settings/Settings.h"
 #include "host/program/system/ChildProcess.h"
-#include "host/program/system/Interruption.h"
 #include "host/program/workers/Messages.h"
 
 #include <condition_variable>
@@ -126,7 +125,6 @@ ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& fil
 } // namespace
 
 ExitCode RunWorker(const std::filesystem::path& filtersFolder) {
-    Interruption::LeaveToParent();
     Run run;
     const std::optional<RunFacts> facts = run.Next(DecodeRunFacts);
     return facts ? Serve(run, *facts, filtersFolder) : ExitCode::Done;

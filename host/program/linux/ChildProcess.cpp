@@ -41,6 +41,34 @@ struct Pipe {
     }
 };
 
+sigset_t RequestsToEnd() {
+    sigset_t signals;
+    sigemptyset(&signals);
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+        sigaddset(&signals, signal);
+    return signals;
+}
+
+/// What a process is started with: requests to end, which a terminal sends to it as well, wait
+/// until it says what it makes of them.
+class SpawnAttributes {
+public:
+    SpawnAttributes() {
+        posix_spawnattr_init(&m_attributes);
+        const sigset_t held = RequestsToEnd();
+        posix_spawnattr_setsigmask(&m_attributes, &held);
+        posix_spawnattr_setflags(&m_attributes, POSIX_SPAWN_SETSIGMASK);
+    }
+    ~SpawnAttributes() { posix_spawnattr_destroy(&m_attributes); }
+    SpawnAttributes(const SpawnAttributes&) = delete;
+    SpawnAttributes& operator=(const SpawnAttributes&) = delete;
+
+    const posix_spawnattr_t* Get() const { return &m_attributes; }
+
+private:
+    posix_spawnattr_t m_attributes = {};
+};
+
 /// @return 0, or the system's error
 int Spawn(const std::vector<std::string>& arguments, int in, int out, pid_t& process) {
     const std::string program = ProgramFile().string();
@@ -48,12 +76,13 @@ int Spawn(const std::vector<std::string>& arguments, int in, int out, pid_t& pro
     for (const std::string& argument : arguments)
         words.push_back(const_cast<char*>(argument.c_str()));
     words.push_back(nullptr);
+    const SpawnAttributes attributes;
     posix_spawn_file_actions_t actions;
     posix_spawn_file_actions_init(&actions);
     posix_spawn_file_actions_adddup2(&actions, in, STDIN_FILENO);
     posix_spawn_file_actions_adddup2(&actions, out, STDOUT_FILENO);
     const int error =
-        posix_spawn(&process, program.c_str(), &actions, nullptr, words.data(), environ);
+        posix_spawn(&process, program.c_str(), &actions, attributes.Get(), words.data(), environ);
     posix_spawn_file_actions_destroy(&actions);
     return error;
 }

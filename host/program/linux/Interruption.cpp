@@ -45,8 +45,13 @@ void Interruption::Install() {
 }
 
 void Interruption::LeaveToParent() {
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE})
+    sigset_t held; // by the parent, until now
+    sigemptyset(&held);
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE}) {
         Handle(signal, DoNothing);
+        sigaddset(&held, signal);
+    }
+    sigprocmask(SIG_UNBLOCK, &held, nullptr);
 }
 
 bool Interruption::Requested() {
