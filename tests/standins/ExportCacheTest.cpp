@@ -1,5 +1,6 @@
 #include "tests/standins/FakeEngine.h"
 #include "tests/standins/OfficeClient.h"
+#include "tests/standins/OfficePrints.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/StandInModule.h"
 
@@ -41,6 +42,27 @@ TEST_F(ExportCacheTest, ADocumentIsLoadedOnceAsLongAsItsBytesStay) {
     EXPECT_EQ(2U, engine.Starts());
     Open(m_files.Write("copy.doc", "The other bytes")); // of another kind
     EXPECT_EQ(3U, engine.Starts());
+}
+
+TEST_F(ExportCacheTest, OnlyOptionsThatChangeTheExportLoadAPresentationAgain) {
+    const FakeEngine engine(FakeEngine::MakePdf());
+    const fs::path path = m_files.Write("cached.pptx", "A presentation for the cache");
+    const auto print = [&](const std::function<void(powerpoint::PrintOptions&)>& change) {
+        EXPECT_EQ(L"", PrintPresentation(WidePath(path), PathOf("out.ps"), Printer, change));
+        return engine.Starts();
+    };
+    EXPECT_EQ(1U, print({}));
+    EXPECT_EQ(1U, print([](powerpoint::PrintOptions& options) {
+                  options.PutOutputType(4);
+                  options.PutPrintColorType(2);
+                  options.PutPrintComments(1);
+              }));
+    const auto withHidden = [](powerpoint::PrintOptions& options) {
+        options.PutPrintHiddenSlides(1);
+    };
+    EXPECT_EQ(2U, print(withHidden));
+    EXPECT_EQ(2U, print(withHidden));
+    EXPECT_EQ(3U, print([](powerpoint::PrintOptions& options) { options.PutOutputType(5); }));
 }
 
 TEST_F(ExportCacheTest, WhatCouldNotBeLoadedIsTriedAgain) {

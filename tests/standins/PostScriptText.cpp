@@ -44,3 +44,43 @@ std::vector<std::string> PostScriptPageSizes(const std::filesystem::path& file) 
     }
     return sizes;
 }
+
+std::vector<PrintedWord> PostScriptWords(const std::filesystem::path& file) {
+    std::istringstream lines(
+        OutputOf(Ghostscript + "pdfwrite -o - '" + file.string() + "' | pdftotext -bbox - - 2>&1"));
+    std::vector<PrintedWord> words;
+    int page = 0;
+    for (std::string line; std::getline(lines, line);) {
+        PrintedWord word{};
+        std::array<char, 200> text{};
+        page += line.find("<page ") != std::string::npos ? 1 : 0;
+        word.page = page;
+        if (std::sscanf(line.c_str(), " <word xMin=\"%lf\" yMin=\"%lf\" %*[^>]>%199[^<]", &word.x,
+                        &word.y, text.data()) == 3) {
+            word.text = text.data();
+            words.push_back(word);
+        }
+    }
+    return words;
+}
+
+std::vector<std::array<double, 4>> PostScriptInk(const std::filesystem::path& file) {
+    std::istringstream lines(OutputOf(Ghostscript + "inkcov -o - '" + file.string() + "'"));
+    std::vector<std::array<double, 4>> pages;
+    std::array<double, 4> ink{};
+    for (std::string rest; lines >> ink[0] >> ink[1] >> ink[2] >> ink[3];) {
+        std::getline(lines, rest);
+        pages.push_back(ink);
+    }
+    return pages;
+}
+
+std::string PostScriptBounds(const std::filesystem::path& file, int page) {
+    std::istringstream lines(OutputOf(Ghostscript + "bbox -sPageList=" + std::to_string(page) +
+                                      " '" + file.string() + "' 2>&1"));
+    std::string keyword;
+    std::string bounds;
+    lines >> keyword >> std::ws;
+    std::getline(lines, bounds);
+    return bounds;
+}

@@ -54,8 +54,8 @@ protected:
             m_files.Write("office/program/" + file, "");
             fs::permissions(program / file, fs::perms::owner_all);
         }
-        fs::create_directory(m_files / "bin");
-        fs::create_symlink(program / "soffice", m_files / "bin/soffice");
+        if (fs::create_directory(m_files / "bin"))
+            fs::create_symlink(program / "soffice", m_files / "bin/soffice");
         setenv("PATH", (m_files / "bin").c_str(), 1);
     }
 
@@ -66,7 +66,7 @@ protected:
 
 TEST_F(RegistrationTest, EntersEveryApplicationThatLibreOfficeServes) {
     NEEDS_LIBREOFFICE();
-    for (const std::wstring application : {L"Word", L"Excel", L"PowerPoint"}) {
+    for (const std::wstring application : {L"Word", L"Excel", L"PowerPoint", L"Publisher"}) {
         const std::wstring progId = application + L".Application";
         EXPECT_NE("(none)", Default(progId));
         EXPECT_EQ(std::string(progId.begin(), progId.end()) + ".16", Default(progId + L"\\CurVer"));
@@ -77,7 +77,6 @@ TEST_F(RegistrationTest, EntersEveryApplicationThatLibreOfficeServes) {
         EXPECT_EQ(fs::path(STANDINS_FOLDER) / "office.so", Default(server));
         EXPECT_EQ("Apartment", Text(HKEY_CLASSES_ROOT, server, L"ThreadingModel"));
     }
-    EXPECT_EQ("(none)", Default(L"Publisher.Application")); // it cannot print yet
 }
 
 TEST_F(RegistrationTest, TellsWhichEngineThereIs) {
@@ -85,6 +84,13 @@ TEST_F(RegistrationTest, TellsWhichEngineThereIs) {
     EXPECT_THAT(Text(HKEY_LOCAL_MACHINE, StandIns, L"Engine"),
                 testing::MatchesRegex("LibreOffice [0-9]+[.][0-9.]+"));
     EXPECT_TRUE(fs::exists(Text(HKEY_LOCAL_MACHINE, StandIns, L"EnginePath") + "/soffice.bin"));
+}
+
+TEST_F(RegistrationTest, WithoutAPathLibreOfficeIsFoundInTheUsualFolders) {
+    NEEDS_LIBREOFFICE();
+    unsetenv("PATH");
+    EXPECT_EQ(S_OK, StandInModule::Instance().Register());
+    EXPECT_NE("(none)", Default(L"Word.Application"));
 }
 
 TEST_F(RegistrationTest, WithoutLibreOfficeNothingIsEntered) {
@@ -103,6 +109,10 @@ TEST_F(RegistrationTest, EntersOnlyWhatTheInstalledPartsServe) {
     EXPECT_EQ("(none)", Default(L"Word.Application"));
     EXPECT_NE("(none)", Default(L"Excel.Application"));
     EXPECT_EQ("(none)", Default(L"PowerPoint.Application"));
+    Install({"libsdlo.so"});
+    EXPECT_EQ(S_OK, StandInModule::Instance().Register());
+    EXPECT_NE("(none)", Default(L"PowerPoint.Application"));
+    EXPECT_EQ("(none)", Default(L"Publisher.Application")); // Draw alone reads no publications
     EXPECT_EQ("LibreOffice", Text(HKEY_LOCAL_MACHINE, StandIns, L"Engine")); // of no known version
 }
 

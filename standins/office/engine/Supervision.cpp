@@ -8,6 +8,7 @@
 #include "standins/office/engine/LibreOfficeCommand.h"
 #include "standins/office/engine/PackageKind.h"
 #include "standins/office/engine/Profile.h"
+#include "standins/office/engine/Publication.h"
 #include "standins/process/WorkFolder.h"
 
 #include <fcntl.h>
@@ -60,6 +61,8 @@ Message ConvertInFolder(const EngineJob& job, int document, const Channel& serve
         return Failure(DescribeError("it cannot be copied to " + job.folder, copy.error));
     if (IsPackageOfAnotherKind(DocumentPath(folder, job), job.extension))
         return Failure("it is a document of another application");
+    if (job.extension == "pub" && !IsPublication(DocumentPath(folder, job)))
+        return Failure("it is not a publication");
     if (!MakeProfile(folder.Path(), job.program))
         return Failure(DescribeError("LibreOffice's profile cannot be written", errno));
     EngineWatch watch(EngineName, job.limits, server);

@@ -23,8 +23,9 @@ constexpr const char* Gray = R"(
 /shfill { QuillonGrayShading systemdict /shfill get exec } bind def
 )";
 
-/// As Office has it: text and lines are black, areas are white, and pictures are gray. An area that
-/// is as narrow as a line or as small as an arrowhead counts as one.
+/// As Office has it: text and lines are black, areas are white, and pictures are gray; so are areas
+/// that shine through, since they are pictures here. An area that is as narrow as a line or as
+/// small as an arrowhead counts as one.
 constexpr const char* BlackAndWhite = R"(
 /QuillonExtent {
   gsave initmatrix { pathbbox } stopped
@@ -34,6 +35,7 @@ constexpr const char* BlackAndWhite = R"(
 /QuillonArea { QuillonExtent 4 gt { 1 } { 0 } ifelse setgray } bind def
 /f { QuillonArea fill } bind def
 /f* { QuillonArea eofill } bind def
+/rectfill { 1 setgray systemdict /rectfill get exec } bind def
 /S { 0 setgray stroke } bind def
 /QuillonTj /Tj load def
 /QuillonTJ /TJ load def

@@ -19,6 +19,11 @@ void SetFont(PangoLayout* layout, double size, bool isBold) {
     pango_font_description_set_absolute_size(font.get(), size * PANGO_SCALE);
     pango_font_description_set_weight(font.get(), isBold ? PANGO_WEIGHT_BOLD : PANGO_WEIGHT_NORMAL);
     pango_layout_set_font_description(layout, font.get());
+    // PostScript has no way to tell which characters a ligature stands for.
+    PangoAttrList* attributes = pango_attr_list_new();
+    pango_attr_list_insert(attributes, pango_attr_font_features_new("liga=0, clig=0"));
+    pango_layout_set_attributes(layout, attributes);
+    pango_attr_list_unref(attributes);
 }
 
 void SetText(PangoLayout* layout, const std::string& text) {
