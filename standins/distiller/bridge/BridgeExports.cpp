@@ -14,7 +14,6 @@
 namespace {
 
 using standins::DistillOutcome;
-using standins::DistillRequest;
 using standins::DistillResult;
 
 /// @return nothing when it is null or no UTF-16

@@ -13,13 +13,13 @@ namespace standins {
 
 namespace {
 
-constexpr std::size_t LongEnough = std::size_t{64} << 10;
+constexpr off_t LongEnough = off_t{64} << 10;
 
 /// A program can print without end; what Ghostscript says of it comes last.
 std::string ReadEnd(const std::string& path) {
     const Descriptor file(open(path.c_str(), O_RDONLY | O_CLOEXEC));
     const off_t size = file.IsOpen() ? lseek(file.Get(), 0, SEEK_END) : 0;
-    if (size <= static_cast<off_t>(LongEnough))
+    if (size <= LongEnough)
         return {};
     std::string text(LongEnough, '\0');
     const ssize_t got = pread(file.Get(), text.data(), text.size(), size - LongEnough);

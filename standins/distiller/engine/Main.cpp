@@ -11,17 +11,16 @@
 namespace {
 
 int Run(int argc, char** argv) {
-    constexpr int Given = 3;
-    const standins::Channel bridge =
-        standins::BecomeSupervisor(Given, standins::MostGhostscriptMemory);
     standins::DistillerJob job;
     standins::SupervisorOptions supervisor;
     bool hasProfile = false;
     CLI::App options("Supervises one run of Ghostscript.");
     supervisor.AddTo(options);
     options.add_option("--program", job.program)->required();
-    options.add_flag("--profile", hasProfile);
+    options.add_flag("--profile", hasProfile, "it gets a profile, too");
     CLI11_PARSE(options, argc, argv);
+    const standins::Channel bridge =
+        standins::BecomeSupervisor(hasProfile ? 3 : 2, standins::MostGhostscriptMemory);
     job.folder = supervisor.folder;
     job.limits = supervisor.Limits();
     job.postScript = standins::FirstGivenDescriptor;

@@ -66,7 +66,7 @@ std::string DescribeFailure(const DistillerJob& job, const WorkFolder& folder,
     if (WIFEXITED(ending.status) && !error.empty())
         return EngineName + " found an error in " +
                (IsProfileRead(job, log) ? "it: " : "the profile: ") + error;
-    const std::string failure = DescribeStatus(EngineName, ending.status);
+    std::string failure = DescribeStatus(EngineName, ending.status);
     if (!failure.empty())
         return failure;
     return IsProfileRead(job, log) ? EngineName + " made no whole PDF of it"
