@@ -157,7 +157,7 @@ def notes_page(tag, words, extra=""):
     image = ('<p:sp><p:nvSpPr><p:cNvPr id="2" name="Slide"/><p:cNvSpPr/><p:nvPr>'
              f'<p:ph type="sldImg"/></p:nvPr></p:nvSpPr><p:spPr>{transform((1.9, 2.2, 15.2, 8.55))}'
              "</p:spPr></p:sp>")
-    text = placeholder("body", [words], (1.9, 12.0, 15.2, 12.4), index=1)
+    text = placeholder("body", [words], (1.9, 12.0, 15.2, 12.4), index=1, marks=False)
     return (XML + f"<p:{tag} {NAMESPACES}><p:cSld><p:spTree>{MASTER_TREE}{image}{text}</p:spTree>"
             f"</p:cSld>{extra}</p:{tag}>")
 

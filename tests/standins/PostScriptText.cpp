@@ -5,6 +5,7 @@
 #include <array>
 #include <cstdio>
 #include <memory>
+#include <regex>
 #include <sstream>
 
 namespace {
@@ -48,18 +49,14 @@ std::vector<std::string> PostScriptPageSizes(const std::filesystem::path& file) 
 std::vector<PrintedWord> PostScriptWords(const std::filesystem::path& file) {
     std::istringstream lines(
         OutputOf(Ghostscript + "pdfwrite -o - '" + file.string() + "' | pdftotext -bbox - - 2>&1"));
+    const std::regex wordOf(R"(<word xMin="([^"]+)" yMin="([^"]+)"[^>]*>([^<]*)<)");
     std::vector<PrintedWord> words;
     int page = 0;
     for (std::string line; std::getline(lines, line);) {
-        PrintedWord word{};
-        std::array<char, 200> text{};
         page += line.find("<page ") != std::string::npos ? 1 : 0;
-        word.page = page;
-        if (std::sscanf(line.c_str(), " <word xMin=\"%lf\" yMin=\"%lf\" %*[^>]>%199[^<]", &word.x,
-                        &word.y, text.data()) == 3) {
-            word.text = text.data();
-            words.push_back(word);
-        }
+        std::smatch found;
+        if (std::regex_search(line, found, wordOf))
+            words.push_back({page, std::stod(found[1]), std::stod(found[2]), found[3]});
     }
     return words;
 }

@@ -38,7 +38,8 @@ protected:
 std::vector<int> SlidesByPlace(const fs::path& file, int columns, int rows) {
     const std::vector<PrintedWord> words = PostScriptWords(file);
     const int places = columns * rows;
-    std::vector<int> found(static_cast<std::size_t>((Slides + places - 1) / places * places));
+    const int sheets = (Slides + places - 1) / places;
+    std::vector<int> found(static_cast<std::size_t>(sheets) * static_cast<std::size_t>(places));
     for (const PrintedWord& word : words) {
         const auto slide = std::find(SlideWords.begin(), SlideWords.end(), word.text);
         if (slide == SlideWords.end())

@@ -32,7 +32,9 @@ void RuleLines(const Area& area, cairo_t* sheet) {
     constexpr double Distance = 26;
     cairo_set_source_rgb(sheet, 0, 0, 0);
     cairo_set_line_width(sheet, 0.5);
-    for (double y = area.y + area.height; y > area.y; y -= Distance) {
+    const int lines = static_cast<int>(area.height / Distance);
+    for (int line = 0; line <= lines; ++line) {
+        const double y = area.y + area.height - line * Distance;
         cairo_move_to(sheet, area.x, y);
         cairo_line_to(sheet, area.x + area.width, y);
     }
