@@ -49,7 +49,7 @@ std::vector<std::string> PostScriptPageSizes(const std::filesystem::path& file) 
 std::vector<PrintedWord> PostScriptWords(const std::filesystem::path& file) {
     std::istringstream lines(
         OutputOf(Ghostscript + "pdfwrite -o - '" + file.string() + "' | pdftotext -bbox - - 2>&1"));
-    const std::regex wordOf(R"(<word xMin="([^"]+)" yMin="([^"]+)"[^>]*>([^<]*)<)");
+    const std::regex wordOf(R"re(<word xMin="([^"]+)" yMin="([^"]+)"[^>]*>([^<]*)<)re");
     std::vector<PrintedWord> words;
     int page = 0;
     for (std::string line; std::getline(lines, line);) {

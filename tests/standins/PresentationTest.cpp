@@ -46,7 +46,8 @@ std::vector<int> SlidesByPlace(const fs::path& file, int columns, int rows) {
             continue;
         const int column = static_cast<int>(word.x / (595.0 / columns));
         const int row = static_cast<int>(word.y / (842.0 / rows));
-        found.at(static_cast<std::size_t>((word.page - 1) * places + row * columns + column)) =
+        const int place = (word.page - 1) * places + row * columns + column;
+        found.at(static_cast<std::size_t>(place)) =
             static_cast<int>(slide - SlideWords.begin()) + 1;
     }
     return found;
