@@ -1,4 +1,3 @@
-#include "tests/standins/Documents.h"
 #include "tests/standins/OfficePrints.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/PostScriptText.h"

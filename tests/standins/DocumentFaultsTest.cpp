@@ -135,7 +135,7 @@ TEST_F(DocumentFaultsTest, AnyNameWillDo) {
     for (const auto& [name, title] : titles) {
         const fs::path path = m_files.Write(name, pdf + name); // bytes of its own
         EXPECT_EQ(L"", RaisedBy([&] {
-                      COleDispatchDriver document = word.Open(WidePath(path));
+                      word::Document document = word.Open(WidePath(path));
                       PrintDocument(document, PrintArguments(WidePath(path) + L".ps"));
                   }))
             << name;

@@ -14,10 +14,3 @@ std::string WordPackage(const std::string& body, const std::string& relationship
 
 /// A paragraph of a Word document.
 std::string Paragraph(const std::string& text);
-
-/// A workbook (xlsx) with one filled cell.
-std::string WorkbookPackage(const std::string& text);
-
-/// A presentation (pptx) with one slide.
-/// @param contentType "presentation" or, for a ppsx, "slideshow"
-std::string PresentationPackage(const std::string& text, const std::string& contentType);

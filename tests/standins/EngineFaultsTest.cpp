@@ -189,7 +189,7 @@ TEST_F(EngineFaultsTest, ApplicationsOnSeveralThreadsDoNotMeet) {
                 const auto path = m_files.Write(name + ".docx", name + std::to_string(getpid()));
                 WordClient word;
                 const std::wstring raised = RaisedBy([&] {
-                    COleDispatchDriver document = word.Open(WidePath(path));
+                    word::Document document = word.Open(WidePath(path));
                     PrintDocument(document, PrintArguments(PathOf(name + ".ps")));
                 });
                 EXPECT_EQ(i % 2 == 0, raised.empty()) << name;

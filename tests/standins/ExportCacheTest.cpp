@@ -13,7 +13,7 @@ protected:
     void Open(const fs::path& path) {
         WordClient word; // each its own, as a trial open and a print have it
         EXPECT_EQ(L"", RaisedBy([&] {
-                      COleDispatchDriver document = word.Open(WidePath(path));
+                      word::Document document = word.Open(WidePath(path));
                       PrintDocument(document, PrintArguments(PathOf("out.ps")));
                       CloseDocument(document);
                       word.Quit();

@@ -35,7 +35,7 @@ TEST_F(NetworkTest, NoRequestLeavesTheMachine) {
     const auto document = m_files.Write("links.docx", DocumentWithLinks(listener.Url()));
     WordClient word;
     EXPECT_EQ(L"", RaisedBy([&] {
-                  COleDispatchDriver opened = word.Open(WidePath(document));
+                  word::Document opened = word.Open(WidePath(document));
                   PrintDocument(opened, PrintArguments(PathOf("links.ps")));
               }));
     EXPECT_EQ(0, listener.Connections());

@@ -8,62 +8,26 @@ COleVariant Short(SHORT value) {
     return COleVariant(value);
 }
 
-COleDispatchDriver Get(COleDispatchDriver& object, DISPID member) {
-    LPDISPATCH result = nullptr;
-    object.InvokeHelper(member, DISPATCH_PROPERTYGET, VT_DISPATCH, &result, nullptr);
-    return COleDispatchDriver(result);
-}
-
-const BYTE* Types(const char* types) {
-    return reinterpret_cast<const BYTE*>(types);
-}
-
 } // namespace
 
 WordClient::WordClient() {
     EXPECT_TRUE(application.CreateDispatch(L"Word.Application"));
 }
 
-COleDispatchDriver WordClient::Documents() {
-    return Get(application, 6);
+word::Documents WordClient::Documents() {
+    return application.GetDocuments();
 }
 
-COleDispatchDriver WordClient::AddDocument() {
+word::Document WordClient::AddDocument() {
     COleVariant none = LeftOut();
-    COleDispatchDriver documents = Documents();
-    LPDISPATCH document = nullptr;
-    documents.InvokeHelper(14, DISPATCH_METHOD, VT_DISPATCH, &document,
-                           Types(VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT),
-                           (LPVARIANT)none, (LPVARIANT)none, (LPVARIANT)none, (LPVARIANT)none);
-    return COleDispatchDriver(document);
+    return Documents().Add(none, none, none, none);
 }
 
-COleDispatchDriver WordClient::Open(const std::wstring& path) {
+word::Document WordClient::Open(const std::wstring& path) {
     COleVariant fileName(path.c_str());
     COleVariant readOnly = Short(1);
     COleVariant none = LeftOut();
-    COleDispatchDriver documents = Documents();
-    LPDISPATCH document = nullptr;
-    documents.InvokeHelper(
-        15, DISPATCH_METHOD, VT_DISPATCH, &document,
-        Types(VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT
-                  VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT),
-        (LPVARIANT)fileName, (LPVARIANT)none, (LPVARIANT)readOnly, (LPVARIANT)none, (LPVARIANT)none,
-        (LPVARIANT)none, (LPVARIANT)none, (LPVARIANT)none, (LPVARIANT)none, (LPVARIANT)none,
-        (LPVARIANT)none, (LPVARIANT)none);
-    return COleDispatchDriver(document);
-}
-
-COleDispatchDriver WordClient::Dialog(LONG index) {
-    COleDispatchDriver dialogs = Get(application, 19);
-    LPDISPATCH dialog = nullptr;
-    dialogs.InvokeHelper(0, DISPATCH_METHOD, VT_DISPATCH, &dialog, Types(VTS_I4), index);
-    return COleDispatchDriver(dialog);
-}
-
-void WordClient::PutActivePrinter(const std::wstring& printer) {
-    application.InvokeHelper(66, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr, Types(VTS_BSTR),
-                             printer.c_str());
+    return Documents().OpenReadOnly(fileName, readOnly, none);
 }
 
 std::wstring WordClient::ActivePrinter() {
@@ -75,9 +39,7 @@ std::wstring WordClient::ActivePrinter() {
 void WordClient::Quit() {
     COleVariant no = Short(0);
     COleVariant none = LeftOut();
-    application.InvokeHelper(1105, DISPATCH_METHOD, VT_EMPTY, nullptr,
-                             Types(VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT), (LPVARIANT)no,
-                             (LPVARIANT)none, (LPVARIANT)none);
+    application.Quit(no, none, none);
 }
 
 PrintArguments::PrintArguments(const std::wstring& fileName)
@@ -87,27 +49,17 @@ PrintArguments::PrintArguments(const std::wstring& fileName)
       manualDuplexPrint(Short(0)), zoomColumn(Short(0)), zoomRow(Short(0)),
       zoomPaperWidth(Short(0)), zoomPaperHeight(Short(0)) {}
 
-void PrintDocument(COleDispatchDriver& document, PrintArguments a) {
-    document.InvokeHelper(
-        444, DISPATCH_METHOD, VT_EMPTY, nullptr,
-        Types(
-            VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT
-                VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT
-                    VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT),
-        (LPVARIANT)a.background, (LPVARIANT)a.append, (LPVARIANT)a.range,
-        (LPVARIANT)a.outputFileName, (LPVARIANT)a.from, (LPVARIANT)a.to, (LPVARIANT)a.item,
-        (LPVARIANT)a.copies, (LPVARIANT)a.pages, (LPVARIANT)a.pageType, (LPVARIANT)a.printToFile,
-        (LPVARIANT)a.collate, (LPVARIANT)a.activePrinterMacGX, (LPVARIANT)a.manualDuplexPrint,
-        (LPVARIANT)a.zoomColumn, (LPVARIANT)a.zoomRow, (LPVARIANT)a.zoomPaperWidth,
-        (LPVARIANT)a.zoomPaperHeight);
+void PrintDocument(word::Document& document, PrintArguments a) {
+    document.PrintOut(a.background, a.append, a.range, a.outputFileName, a.from, a.to, a.item,
+                      a.copies, a.pages, a.pageType, a.printToFile, a.collate, a.activePrinterMacGX,
+                      a.manualDuplexPrint, a.zoomColumn, a.zoomRow, a.zoomPaperWidth,
+                      a.zoomPaperHeight);
 }
 
-void CloseDocument(COleDispatchDriver& document) {
+void CloseDocument(word::Document& document) {
     COleVariant no = Short(0);
     COleVariant none = LeftOut();
-    document.InvokeHelper(1105, DISPATCH_METHOD, VT_EMPTY, nullptr,
-                          Types(VTS_PVARIANT VTS_PVARIANT VTS_PVARIANT), (LPVARIANT)no,
-                          (LPVARIANT)none, (LPVARIANT)none);
+    document.Close(no, none, none);
 }
 
 COleVariant LeftOut() {

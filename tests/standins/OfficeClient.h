@@ -1,25 +1,23 @@
 #pragma once
 
-#include <afxdisp.h>
+#include "office/dispatch/WordObjects.h"
 
 #include <functional>
 #include <string>
 
-/// Word as a client of Office drives it: by DISPID, through MFC's dispatch driver.
+/// Word as the driver of the filter drives it.
 class WordClient {
 public:
     /// Starts Word; the test fails when it does not start.
     WordClient();
 
-    COleDispatchDriver Documents();
-    COleDispatchDriver AddDocument();
-    COleDispatchDriver Open(const std::wstring& path);
-    COleDispatchDriver Dialog(LONG index);
-    void PutActivePrinter(const std::wstring& printer);
+    word::Documents Documents();
+    word::Document AddDocument();
+    word::Document Open(const std::wstring& path);
     std::wstring ActivePrinter();
     void Quit();
 
-    COleDispatchDriver application;
+    word::Application application;
 };
 
 /// The arguments of Word's PrintOut, as a print of the whole document into a file has them; a test
@@ -32,8 +30,8 @@ struct PrintArguments {
         zoomPaperWidth, zoomPaperHeight;
 };
 
-void PrintDocument(COleDispatchDriver& document, PrintArguments arguments);
-void CloseDocument(COleDispatchDriver& document);
+void PrintDocument(word::Document& document, PrintArguments arguments);
+void CloseDocument(word::Document& document);
 
 /// The argument marker of an optional argument that is left out.
 COleVariant LeftOut();

@@ -22,7 +22,7 @@ protected:
     std::wstring Print(const fs::path& output) {
         const FakeEngine engine(FakeEngine::MakePdf());
         WordClient word;
-        COleDispatchDriver document =
+        word::Document document =
             word.Open(WidePath(m_files.Write("printed.docx", "A document to print")));
         return RaisedBy([&] { PrintDocument(document, PrintArguments(WidePath(output))); });
     }
@@ -106,7 +106,7 @@ TEST_F(OutputFaultsTest, NoRoomForTheEngineIsTold) {
 TEST_F(OutputFaultsTest, APrintThatTakesTooLongIsEnded) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.Open(SamplePath("report.docx"));
+    word::Document document = word.Open(SamplePath("report.docx"));
     SetLimit(L"TotalSeconds", 1);
     PrintArguments arguments(PathOf("endless.ps"));
     arguments.copies = COleVariant(static_cast<SHORT>(32767));
@@ -118,7 +118,7 @@ TEST_F(OutputFaultsTest, APrintThatTakesTooLongIsEnded) {
 TEST_F(OutputFaultsTest, PagesThatAreNoPdfCannotBePrinted) {
     const FakeEngine engine("echo '%PDF-1.4 and then nothing' > \"$PDF\"");
     WordClient word;
-    COleDispatchDriver document = word.Open(WidePath(m_files.Write("broken.docx", "Broken")));
+    word::Document document = word.Open(WidePath(m_files.Write("broken.docx", "Broken")));
     EXPECT_THAT(RaisedBy([&] { PrintDocument(document, PrintArguments(PathOf("broken.ps"))); }),
                 StartsWith(L"broken.docx cannot be printed to"));
     EXPECT_FALSE(fs::exists(m_files / "broken.ps"));

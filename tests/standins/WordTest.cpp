@@ -1,5 +1,3 @@
-#include "tests/standins/BareLibreOffice.h"
-#include "tests/standins/Documents.h"
 #include "tests/standins/OfficeClient.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/PostScriptText.h"
@@ -25,16 +23,14 @@ std::wstring HexCode(HRESULT code) {
 TEST_F(WordTest, PrintsADocumentAsTheDriverDrivesIt) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.AddDocument();
+    word::Document document = word.AddDocument();
     document = word.Open(SamplePath("letter.docx"));
-    COleDispatchDriver setup = word.Dialog(97);
-    setup.InvokeHelper(4, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr,
-                       reinterpret_cast<const BYTE*>(VTS_BOOL), TRUE);
-    setup.InvokeHelper(1, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr,
-                       reinterpret_cast<const BYTE*>(VTS_BSTR), Printer);
-    setup.InvokeHelper(32001, DISPATCH_METHOD, VT_EMPTY, nullptr, nullptr);
+    word::PrintSetupDialog setup = word.application.GetDialogs().GetPrintSetup();
+    setup.PutDoNotSetAsSysDefault(TRUE);
+    setup.PutPrinter(Printer);
+    setup.Execute();
     EXPECT_EQ(Printer, word.ActivePrinter());
-    word.PutActivePrinter(Printer);
+    word.application.PutActivePrinter(Printer);
     PrintDocument(document, PrintArguments(PathOf("letter.ps")));
     CloseDocument(document);
     word.Quit();
@@ -51,7 +47,7 @@ TEST_F(WordTest, PrintsADocumentAsTheDriverDrivesIt) {
 TEST_F(WordTest, PagesComeOutInTheirSizesAndOrder) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.Open(SamplePath("report.docx"));
+    word::Document document = word.Open(SamplePath("report.docx"));
     PrintDocument(document, PrintArguments(PathOf("report.ps")));
     EXPECT_EQ((std::vector<std::string>{"595x842", "595x842", "842x595", "595x842"}),
               PostScriptPageSizes(m_files / "report.ps"));
@@ -61,7 +57,7 @@ TEST_F(WordTest, PagesComeOutInTheirSizesAndOrder) {
 TEST_F(WordTest, PrintsTheBinaryFormat) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.Open(SamplePath("letter.doc"));
+    word::Document document = word.Open(SamplePath("letter.doc"));
     PrintDocument(document, PrintArguments(PathOf("letter.ps")));
     EXPECT_THAT(PostScriptText(m_files / "letter.ps"), HasSubstr("New opening hours"));
 }
@@ -69,7 +65,7 @@ TEST_F(WordTest, PrintsTheBinaryFormat) {
 TEST_F(WordTest, CopiesComeOneAfterTheOtherOrPageByPage) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.Open(SamplePath("report.docx"));
+    word::Document document = word.Open(SamplePath("report.docx"));
     PrintArguments arguments(PathOf("copies.ps"));
     arguments.copies = COleVariant(static_cast<SHORT>(2));
     PrintDocument(document, arguments);
@@ -86,7 +82,7 @@ TEST_F(WordTest, CopiesComeOneAfterTheOtherOrPageByPage) {
 TEST_F(WordTest, RefusesToPrintOtherwiseThanAsked) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver document = word.Open(SamplePath("letter.docx"));
+    word::Document document = word.Open(SamplePath("letter.docx"));
     const COleVariant yes(static_cast<SHORT>(1));
     const COleVariant no(static_cast<SHORT>(0));
     const std::vector<std::pair<COleVariant PrintArguments::*, COleVariant>> changes = {
@@ -118,22 +114,18 @@ TEST_F(WordTest, RefusesAPrinterThatIsNotThere) {
     WordClient word;
     const std::wstring before = word.ActivePrinter();
     EXPECT_EQ(L"There is no printer named Nowhere.",
-              RaisedBy([&] { word.PutActivePrinter(L"Nowhere"); }));
-    COleDispatchDriver setup = word.Dialog(97);
-    setup.InvokeHelper(1, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr,
-                       reinterpret_cast<const BYTE*>(VTS_BSTR), Printer);
-    const auto execute = [&] {
-        setup.InvokeHelper(32001, DISPATCH_METHOD, VT_EMPTY, nullptr, nullptr);
-    };
+              RaisedBy([&] { word.application.PutActivePrinter(L"Nowhere"); }));
+    word::PrintSetupDialog setup = word.application.GetDialogs().GetPrintSetup();
+    setup.PutPrinter(Printer);
+    const auto execute = [&] { setup.Execute(); };
     EXPECT_THAT(RaisedBy(execute), HasSubstr(L"default printer")); // which would be changed
-    setup.InvokeHelper(4, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr,
-                       reinterpret_cast<const BYTE*>(VTS_BOOL), TRUE);
-    setup.InvokeHelper(1, DISPATCH_PROPERTYPUT, VT_EMPTY, nullptr,
-                       reinterpret_cast<const BYTE*>(VTS_BSTR), L"Nowhere");
+    setup.PutDoNotSetAsSysDefault(TRUE);
+    setup.PutPrinter(L"Nowhere");
     EXPECT_THAT(RaisedBy(execute), HasSubstr(L"Nowhere"));
     EXPECT_EQ(before, word.ActivePrinter());
     try {
-        word.Dialog(96);
+        word.application.GetDialogs().InvokeHelper(0, DISPATCH_METHOD, VT_EMPTY, nullptr,
+                                                   reinterpret_cast<const BYTE*>(VTS_I4), 96);
         ADD_FAILURE() << "there is such a dialog";
     } catch (COleDispatchException* raised) { // NOLINT(misc-throw-by-value-catch-by-reference)
         EXPECT_STREQ(L"Word", raised->m_strSource.GetString());
@@ -145,10 +137,10 @@ TEST_F(WordTest, RefusesAPrinterThatIsNotThere) {
 TEST_F(WordTest, ADocumentIsOpenUntilItIsClosed) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver blank = word.AddDocument();
+    word::Document blank = word.AddDocument();
     EXPECT_THAT(RaisedBy([&] { PrintDocument(blank, PrintArguments(PathOf("blank.ps"))); }),
                 HasSubstr(L"no pages"));
-    COleDispatchDriver document = word.Open(SamplePath("letter.docx"));
+    word::Document document = word.Open(SamplePath("letter.docx"));
     CloseDocument(document);
     EXPECT_EQ(L"letter.docx is closed.", RaisedBy([&] { CloseDocument(document); }));
     EXPECT_EQ(L"letter.docx is closed.",
@@ -159,8 +151,8 @@ TEST_F(WordTest, AfterQuitNothingIsAnswered) {
     NEEDS_LIBREOFFICE();
     WordClient word;
     WordClient other;
-    COleDispatchDriver document = word.Open(SamplePath("letter.docx"));
-    COleDispatchDriver documents = word.Documents();
+    word::Document document = word.Open(SamplePath("letter.docx"));
+    word::Documents documents = word.Documents();
     word.Quit();
     EXPECT_EQ(L"Word has quit.", RaisedBy([&] { word.Documents(); }));
     EXPECT_EQ(L"Word has quit.", RaisedBy([&] { word.Quit(); }));
@@ -172,7 +164,7 @@ TEST_F(WordTest, AfterQuitNothingIsAnswered) {
 TEST_F(WordTest, CallsThatDoNotSuitTheMemberFail) {
     NEEDS_LIBREOFFICE();
     WordClient word;
-    COleDispatchDriver documents = word.Documents();
+    word::Documents documents = word.Documents();
     const auto call = [](COleDispatchDriver& object, DISPID member, WORD kind) {
         return RaisedBy([&] { object.InvokeHelper(member, kind, VT_EMPTY, nullptr, nullptr); });
     };
