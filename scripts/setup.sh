@@ -19,6 +19,12 @@ run_packages=(
     fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
 )
 test_packages=(poppler-utils xvfb xauth)
+# The compiler and the zlib for Windows, Wine, and what builds wxWidgets and expat from source.
+windows_packages=(
+    g++-mingw-w64-x86-64-posix gcc-mingw-w64-x86-64-posix libz-mingw-w64 libz-mingw-w64-dev
+    googletest wine64
+    dpkg-dev autoconf automake libtool make patch xz-utils
+)
 lint_packages=(clang-format clang-tidy)
 bench_packages=(hyperfine python3)
 
@@ -68,6 +74,20 @@ build() {
     fi
     cmake --build "$folder" --target "$target" >"$log" 2>&1 || show_failure "$log"
     flock -u 9
+}
+
+# Where the libraries for Windows lie that Debian has no package of: outside the tree, since they
+# take long and serve every checkout.
+windows_libraries="${XDG_CACHE_HOME:-$HOME/.cache}/quillon/windows-x86_64"
+
+# Builds those libraries where that has not been done.
+build_windows_libraries() {
+    local log="$project/build/windows-libraries.log"
+    mkdir -p "$project/build" "${windows_libraries%/*}"
+    exec 8>"${windows_libraries%/*}/.lock"
+    flock 8
+    "$project/scripts/windows/libraries" "$windows_libraries" >"$log" 2>&1 || show_failure "$log"
+    exec 8>&-
 }
 
 show_failure() {

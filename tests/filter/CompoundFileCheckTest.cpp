@@ -3,6 +3,7 @@
 #include "plugin/ResultCodes.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
+#include "tests/support/Wine.h"
 
 #include <windows.h>
 
@@ -60,6 +61,8 @@ TEST(CompoundFileCheck, RefusesWhatIsNoCompoundFile) {
         for (const Check check : AllChecks)
             EXPECT_EQ(Result::InvalidInputFile, check(path.wstring())) << path;
 
+    if (RunsOnWine()) // which follows a circle for ever
+        return;
     // A directory that runs in circles may be read or refused, as long as it ends.
     const auto hostile = folder.Write("cyclic.doc", cyclic.Bytes());
     for (const Check check : AllChecks) {

@@ -11,6 +11,7 @@
 #include <gtest/gtest.h>
 
 #include <optional>
+#include <thread>
 
 namespace {
 
@@ -65,13 +66,16 @@ TEST_F(PS2PDFTest, PassesTheBridgesFailureOn) {
 
 TEST_F(PS2PDFTest, SurvivesABridgeThatThrows) {
     m_bridge->Throw();
-    EXPECT_FALSE(Convert());
+    std::thread([this] { // the toolkit may have COM in use on the main thread
+        EXPECT_FALSE(Convert());
+        const CLSID unknown{};
+        void* object = nullptr;
+        EXPECT_EQ(CO_E_NOTINITIALIZED,
+                  CoCreateInstance(unknown, nullptr, CLSCTX_ALL, IID_IUnknown, &object));
+    })
+        .join();
     EXPECT_EQ(1, Logged(Before));
     EXPECT_EQ(0, Logged(After));
-    const CLSID unknown{};
-    void* object = nullptr;
-    EXPECT_EQ(CO_E_NOTINITIALIZED,
-              CoCreateInstance(unknown, nullptr, CLSCTX_ALL, IID_IUnknown, &object));
 }
 
 TEST_F(PS2PDFTest, FailsInSilenceWithoutABridge) {

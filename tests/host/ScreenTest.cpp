@@ -1,9 +1,6 @@
-#include "tests/host/Program.h"
-#include "tests/support/TemporaryFolder.h"
+#include "tests/host/ScreenRun.h"
 
 #include <gtest/gtest.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace fs = std::filesystem;
 
@@ -12,28 +9,6 @@ namespace {
 using nlohmann::json;
 using namespace std::string_literals;
 
-class ScreenTest : public testing::Test {
-protected:
-    static json Screen(const fs::path& path, int exitCode) {
-        const RunResult run = RunQuillon({"screen", "--json", path.string()});
-        EXPECT_EQ(run.exitCode, exitCode) << run.out << run.err;
-        const std::vector<json> documents = run.Records("document");
-        EXPECT_EQ(documents.size(), 1U) << path;
-        return documents.empty() ? json{{"code", 0}, {"reason", ""}} : documents[0];
-    }
-
-    void ExpectRefused(const fs::path& path, int code, const std::string& reason) const {
-        const json document = Screen(path, 1);
-        EXPECT_EQ(document["state"], "refused") << path;
-        EXPECT_EQ(document["code"], code) << path;
-        EXPECT_EQ(document["text"], "text of " + std::to_string(code)) << path;
-        EXPECT_NE(document["reason"].get<std::string>().find(reason), std::string::npos)
-            << path << document;
-    }
-
-    TemporaryFolder m_folder;
-};
-
 TEST_F(ScreenTest, TellsWhatIsWrongWithAFile) {
     ExpectRefused(m_folder / "none.doc", -1002, "no such file");
     ExpectRefused(m_folder / std::string(300, 'n').append(".doc"), -1002, "too long");
@@ -41,16 +16,6 @@ TEST_F(ScreenTest, TellsWhatIsWrongWithAFile) {
     ExpectRefused(m_folder.Write("note.txt", "text"), -1005,
                   "no filter takes files ending in .txt");
     ExpectRefused(m_folder.Write("noending", "text"), -1005, "without an ending");
-    ASSERT_EQ(mkfifo((m_folder / "pipe.doc").c_str(), 0600), 0);
-    ExpectRefused(m_folder / "pipe.doc", -1005, "named pipe");
-    fs::create_symlink("/dev/zero", m_folder / "device.doc");
-    ExpectRefused(m_folder / "device.doc", -1005, "device");
-    fs::create_symlink("loop.doc", m_folder / "loop.doc");
-    ExpectRefused(m_folder / "loop.doc", -1002, "cannot be reached");
-    if (geteuid() != 0) { // nothing is unreadable to root
-        fs::permissions(m_folder.Write("secret.doc", "x"), fs::perms::none);
-        ExpectRefused(m_folder / "secret.doc", -1002, "cannot be read");
-    }
 }
 
 TEST_F(ScreenTest, TellsWhatAnInvalidFileIsInstead) {

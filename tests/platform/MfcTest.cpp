@@ -148,10 +148,12 @@ TEST(DispatchDriver, HandsResultsOverInTheTypeAskedFor) {
     EXPECT_EQ(&other, object);
     EXPECT_EQ(2U, other.references);
     object->Release();
+    callee.answer = {};
+    callee.answer.vt = VT_NULL;
     const auto failure = Thrown<COleException>(
         [&] { driver.InvokeHelper(1, DISPATCH_PROPERTYGET, VT_I4, &number, nullptr); });
     ASSERT_TRUE(failure);
-    EXPECT_EQ(DISP_E_TYPEMISMATCH, failure->m_sc); // an object is no number
+    EXPECT_EQ(DISP_E_TYPEMISMATCH, failure->m_sc);
 }
 
 TEST(DispatchDriver, ThrowsWhatTheApplicationRaised) {

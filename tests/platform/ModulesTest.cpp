@@ -82,7 +82,7 @@ TEST(Modules, KnowTheirNames) {
     wchar_t cut[8];
     EXPECT_EQ(8U, GetModuleFileNameW(nullptr, cut, 8));
     EXPECT_EQ(DWORD{ERROR_INSUFFICIENT_BUFFER}, GetLastError());
-    EXPECT_EQ(std::wstring(whole, 7), cut);
+    EXPECT_EQ(std::wstring(whole, 7), std::wstring(cut, 7));
     EXPECT_EQ(length, GetModuleFileNameW(nullptr, whole, length + 1));
 }
 
@@ -104,7 +104,8 @@ TEST(Modules, AreFoundByAnAddressInThem) {
     EXPECT_EQ(module, GetModuleHandleW(TEST_MODULE));
     EXPECT_TRUE(FreeLibrary(module));
     EXPECT_EQ(nullptr, GetModuleHandleW(TEST_MODULE));
-    EXPECT_EQ(nullptr, find(Peek, nullptr));
+    const int onTheStack = 0;
+    EXPECT_EQ(nullptr, find(Peek, &onTheStack));
     EXPECT_EQ(DWORD{ERROR_MOD_NOT_FOUND}, GetLastError());
 }
 

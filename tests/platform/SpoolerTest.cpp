@@ -1,5 +1,6 @@
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"
+#include "tests/support/Wine.h"
 
 #include <windows.h>
 #include <winspool.h>
@@ -134,8 +135,10 @@ TEST_F(Spooler, OpensPrintersByName) {
     HANDLE handle = nullptr;
     EXPECT_EQ(DWORD{ERROR_INVALID_PRINTER_NAME}, OpenError(L"Quillon none", &handle));
     ASSERT_EQ(DWORD{ERROR_SUCCESS}, OpenError(L"QUILLON open", &handle));
-    EXPECT_FALSE(DeletePrinter(handle)); // opened for reading
-    EXPECT_EQ(DWORD{ERROR_ACCESS_DENIED}, GetLastError());
+    if (!RunsOnWine()) { // which asks for no right to delete
+        EXPECT_FALSE(DeletePrinter(handle));
+        EXPECT_EQ(DWORD{ERROR_ACCESS_DENIED}, GetLastError());
+    }
     EXPECT_TRUE(ClosePrinter(handle));
     EXPECT_FALSE(ClosePrinter(handle));
     EXPECT_EQ(DWORD{ERROR_INVALID_HANDLE}, GetLastError());
@@ -163,6 +166,8 @@ TEST_F(Spooler, TellsAPrintersDriver) {
 }
 
 TEST_F(Spooler, RefusesDriversThatAreIncomplete) {
+    if (RunsOnWine())
+        GTEST_SKIP() << "Wine takes a driver's record without looking, addresses of nothing too";
     Driver good;
     good.file = m_ppd;
     EXPECT_EQ(DWORD{ERROR_INVALID_LEVEL}, AddDriverError(good.Record(), 77));

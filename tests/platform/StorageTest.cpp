@@ -1,5 +1,6 @@
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
+#include "tests/support/Wine.h"
 
 #include <ole2.h>
 #include <windows.h>
@@ -138,7 +139,9 @@ TEST_F(Storages, StreamsAreReadFromTheirPosition) {
     stream->Read(bytes, 16, &count);
     EXPECT_EQ(0U, count);
     distance.QuadPart = -1;
-    EXPECT_EQ(STG_E_INVALIDFUNCTION, stream->Seek(distance, STREAM_SEEK_SET, nullptr));
+    if (!RunsOnWine()) { // which goes there
+        EXPECT_EQ(STG_E_INVALIDFUNCTION, stream->Seek(distance, STREAM_SEEK_SET, nullptr));
+    }
     distance.QuadPart = 100000; // beyond the end there is nothing to read
     EXPECT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_CUR, &position));
     EXPECT_EQ(105003U, position.QuadPart);
@@ -151,9 +154,9 @@ TEST_F(Storages, StreamsAreOpenedAloneAndForReading) {
     ASSERT_EQ(S_OK, Open(m_folder.Write("a.doc", Document().Bytes()), storage));
     EXPECT_EQ(STG_E_INVALIDFLAG, StreamError(storage, L"Short", STGM_READ));
     EXPECT_EQ(STG_E_INVALIDFLAG, StreamError(storage, L"Short", Shared));
-    EXPECT_EQ(STG_E_ACCESSDENIED,
+    EXPECT_EQ(RunsOnWine() ? STG_E_INVALIDFLAG : STG_E_ACCESSDENIED,
               StreamError(storage, L"Short", STGM_READWRITE | STGM_SHARE_EXCLUSIVE));
-    EXPECT_EQ(STG_E_INVALIDNAME, StreamError(storage, nullptr));
+    EXPECT_EQ(RunsOnWine() ? E_INVALIDARG : STG_E_INVALIDNAME, StreamError(storage, nullptr));
     Pointer<IStream> first;
     ASSERT_EQ(S_OK, storage->OpenStream(L"Short", nullptr, Alone, 0, &first));
     EXPECT_EQ(STG_E_ACCESSDENIED, StreamError(storage, L"SHORT"));
@@ -182,7 +185,8 @@ TEST_F(Storages, TakePartInTheSharingOfFiles) {
         Pointer<IStorage> storage;
         ASSERT_EQ(S_OK, Open(path, storage));
         EXPECT_EQ(S_OK, OpenError(path));
-        EXPECT_EQ(STG_E_SHAREVIOLATION, OpenError(path, Alone));
+        EXPECT_EQ(RunsOnWine() ? STG_E_LOCKVIOLATION : STG_E_SHAREVIOLATION,
+                  OpenError(path, Alone));
         EXPECT_EQ(INVALID_HANDLE_VALUE, openFile(GENERIC_WRITE, FILE_SHARE_READ));
         EXPECT_EQ(DWORD{ERROR_SHARING_VIOLATION}, GetLastError());
     }
@@ -209,6 +213,8 @@ TEST_F(Storages, FailuresHaveTheirCodes) {
 }
 
 TEST_F(Storages, WithstandFilesMadeToDoHarm) {
+    if (RunsOnWine())
+        GTEST_SKIP() << "Wine follows a circle for ever";
     CompoundFile cyclicDirectory = Document();
     cyclicDirectory.MakeDirectoryCyclic();
     Withstand(m_folder.Write("directory.doc", cyclicDirectory.Bytes()));
@@ -230,6 +236,8 @@ TEST_F(Storages, WithstandFilesMadeToDoHarm) {
 }
 
 TEST_F(Storages, DoNotBelieveInAnAllocationTableLargerThanTheFile) {
+    if (RunsOnWine())
+        GTEST_SKIP() << "Wine believes in it";
     CompoundFile file;
     file.AddStream(u"WordDocument", std::string(5000, '\0'));
     std::string bytes = file.Bytes();

@@ -1,12 +1,11 @@
+#include "tests/support/Utf8Locale.h"
+
 #include <wx/init.h>
 
 #include <gtest/gtest.h>
 
-#include <locale>
-
 int main(int argc, char** argv) {
-    // Names and texts beyond ASCII are UTF-8 here, whatever the machine's language.
-    std::locale::global(std::locale("C.UTF-8"));
+    UseUtf8Locale();
     testing::InitGoogleTest(&argc, argv);
     const wxInitializer toolkit;
     if (!toolkit.IsOk())

@@ -2,6 +2,7 @@
 
 #include <wx/checkbox.h>
 #include <wx/choice.h>
+#include <wx/panel.h>
 #include <wx/radiobut.h>
 #include <wx/sizer.h>
 #include <wx/stattext.h>
@@ -22,7 +23,7 @@ wxString Described(const wxWindow* window) {
         line << ' ' << window->GetId();
     if (const auto* choice = dynamic_cast<const wxChoice*>(window))
         line << " [" << wxJoin(choice->GetStrings(), '|', '\0') << ']';
-    else if (!window->GetLabel().empty())
+    else if (!window->GetLabel().empty() && !dynamic_cast<const wxPanel*>(window))
         line << " \"" << window->GetLabel() << '"';
     if (!window->IsThisEnabled())
         line << " disabled";

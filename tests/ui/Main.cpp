@@ -1,3 +1,5 @@
+#include "tests/support/Utf8Locale.h"
+
 #include <wx/app.h>
 #include <wx/init.h>
 #include <wx/log.h>
@@ -5,10 +7,9 @@
 #include <gtest/gtest.h>
 
 #include <iostream>
-#include <locale>
 
 int main(int argc, char** argv) {
-    std::locale::global(std::locale("C.UTF-8"));
+    UseUtf8Locale();
     testing::InitGoogleTest(&argc, argv);
     wxApp::SetInstance(new wxApp); // belongs to wxWidgets
     if (!wxEntryStart(argc, argv) || !wxTheApp->CallOnInit()) {

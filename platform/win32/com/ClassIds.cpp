@@ -74,13 +74,7 @@ HRESULT WINAPI CLSIDFromProgID(LPCOLESTR progId, LPCLSID clsid) {
     if (!progId || !clsid)
         return E_INVALIDARG;
     *clsid = CLSID{};
-    const std::wstring key(progId);
-    std::optional<std::wstring> text = win32::ReadClassesText(key + L"\\CLSID");
-    if (!text) {
-        // The version-independent name may tell of its current version only.
-        const std::optional<std::wstring> current = win32::ReadClassesText(key + L"\\CurVer");
-        if (current)
-            text = win32::ReadClassesText(*current + L"\\CLSID");
-    }
+    const std::optional<std::wstring> text =
+        win32::ReadClassesText(std::wstring(progId) + L"\\CLSID");
     return text ? CLSIDFromString(text->c_str(), clsid) : CO_E_CLASSSTRING;
 }

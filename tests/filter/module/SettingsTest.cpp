@@ -16,7 +16,7 @@ namespace {
 class Document {
 public:
     explicit Document(const char* text) {
-        wxStringInputStream stream(text);
+        wxStringInputStream stream(wxString::FromUTF8(text));
         EXPECT_TRUE(m_document.Load(stream, "UTF-8"));
     }
     wxXmlNode* Root() const { return m_document.GetRoot(); }

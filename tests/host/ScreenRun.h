@@ -1,0 +1,30 @@
+#pragma once
+
+#include "tests/host/Program.h"
+#include "tests/support/TemporaryFolder.h"
+
+#include <gtest/gtest.h>
+
+/// Screens files with the scripted filter.
+class ScreenTest : public testing::Test {
+protected:
+    static nlohmann::json Screen(const std::filesystem::path& path, int exitCode) {
+        const RunResult run = RunQuillon({"screen", "--json", path.string()});
+        EXPECT_EQ(run.exitCode, exitCode) << run.out << run.err;
+        const std::vector<nlohmann::json> documents = run.Records("document");
+        EXPECT_EQ(documents.size(), 1U) << path;
+        return documents.empty() ? nlohmann::json{{"code", 0}, {"reason", ""}} : documents[0];
+    }
+
+    void ExpectRefused(const std::filesystem::path& path, int code,
+                       const std::string& reason) const {
+        const nlohmann::json document = Screen(path, 1);
+        EXPECT_EQ(document["state"], "refused") << path;
+        EXPECT_EQ(document["code"], code) << path;
+        EXPECT_EQ(document["text"], "text of " + std::to_string(code)) << path;
+        EXPECT_NE(document["reason"].get<std::string>().find(reason), std::string::npos)
+            << path << document;
+    }
+
+    TemporaryFolder m_folder;
+};
