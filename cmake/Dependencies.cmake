@@ -1,5 +1,8 @@
 find_package(wxWidgets 3.2 REQUIRED COMPONENTS core xml base)
 
+# Programs here are for a console unless they say otherwise, whatever wxWidgets expects.
+list(FILTER wxWidgets_LIBRARIES EXCLUDE REGEX "subsystem,windows|-mwindows")
+
 # wxWidgets as one target; its headers are not ours to warn about.
 add_library(wxwidgets INTERFACE)
 separate_arguments(wx_flags NATIVE_COMMAND "${wxWidgets_CXX_FLAGS}")
