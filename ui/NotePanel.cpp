@@ -32,5 +32,6 @@ wxPanel* CreateNotePanel(wxWindow* parent, const wxString& message) {
     row->Add(0, LeastHeight, 0, wxALIGN_CENTER | wxALL, 0);
     panel->SetSizer(row);
     row->SetSizeHints(panel);
+    panel->SetCanFocus(false); // only now: each child has a panel think it over
     return panel;
 }

@@ -84,9 +84,8 @@ void TellPrinters(const MachineStatus& status, Reporter& reporter) {
 void TellDistiller(const MachineStatus& status, Reporter& reporter) {
     reporter.Line("Distiller");
     reporter.Line("  " + (status.pdfEngine.empty() ? wxString("none") : OneLine(status.pdfEngine)));
-    Json record = {{"type", "distiller"},
-                   {"engine", JsonText(status.pdfEngine)},
-                   {"profiles", Json::array()}};
+    Json record = {
+        {"type", "distiller"}, {"engine", JsonText(status.pdfEngine)}, {"profiles", Json::array()}};
     for (const wxString& profile : status.profiles) {
         reporter.Line("  profile " + OneLine(profile));
         record["profiles"].push_back(JsonText(profile));
@@ -98,9 +97,8 @@ void TellPanel(const MachineStatus& status, Reporter& reporter) {
     reporter.Line("Settings panel");
     const wxString& obstacle = status.panelObstacle;
     reporter.Line("  " + (obstacle.empty() ? wxString("can be used") : "disabled: " + obstacle));
-    reporter.Record({{"type", "panel"},
-                     {"enabled", obstacle.empty()},
-                     {"reason", JsonText(obstacle)}});
+    reporter.Record(
+        {{"type", "panel"}, {"enabled", obstacle.empty()}, {"reason", JsonText(obstacle)}});
 }
 
 ExitCode TellMissing(std::vector<MissingPart> missing, bool hasFilter, Reporter& reporter) {

@@ -66,7 +66,8 @@ private:
         m_channel.Write(line);
     }
 
-    /// Whoever waits for a document cannot tell a process that takes long from one that was stopped.
+    /// Whoever waits for a document cannot tell a process that takes long from one that was
+    /// stopped.
     void Beat() {
         std::unique_lock lock(m_mutex);
         while (!m_end.wait_for(lock, BetweenSignsOfLife, [this] { return m_closed; })) {

@@ -181,7 +181,8 @@ void Settings::Set(const wxString& key, const wxString& value) {
     if (!place)
         Append(place = new wxXmlNode(wxXML_ELEMENT_NODE, key));
     RemoveChildren(place);
-    place->AddChild(NewText(value));
+    if (!value.empty())
+        place->AddChild(NewText(value));
 }
 
 /// Puts a new setting behind the others, laid out as they are.

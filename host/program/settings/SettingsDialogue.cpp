@@ -49,6 +49,7 @@ wxScrolledWindow* SettingsDialogue::NewPanels(const Settings& settings) {
             m_hasPanel = true;
         }
     area->SetSizer(panels);
+    area->SetCanFocus(false); // only what is in it has a use for keys
     const int step = FromDIP(ScrollStep);
     area->SetScrollRate(step, step);
     const wxSize wanted = panels->ComputeFittingClientSize(area);

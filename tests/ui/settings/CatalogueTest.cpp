@@ -1,0 +1,88 @@
+#include "host/services/CatalogueLoader.h"
+#include "tests/ui/settings/SettingsWindow.h"
+#include "ui/ControlIds.h"
+
+#include <wx/button.h>
+#include <wx/choice.h>
+#include <wx/control.h>
+
+#include <fstream>
+#include <set>
+
+namespace {
+
+const char* const Languages[] = {"de", "es", "fr", "ja"};
+
+class CatalogueTest : public SettingsWindow {
+protected:
+    /// Collects what the window shows and what is no name of this machine's.
+    void CollectFromWindow() {
+        Open([this] {
+            Add(m_window->GetTitle());
+            ForEachBelow(m_window, [this](wxWindow* each) {
+                const auto* choice = wxDynamicCast(each, wxChoice);
+                const bool holdsNames = each->GetId() == ControlId::Printer ||
+                                        each->GetId() == ControlId::DistillerProfile ||
+                                        each->GetId() == ControlId::InputTypes;
+                if (holdsNames)
+                    return;
+                if (choice)
+                    for (const wxString& entry : choice->GetStrings())
+                        Add(entry);
+                else if (wxDynamicCast(each, wxControl))
+                    Add(each->GetLabel());
+            });
+        });
+    }
+
+    void Add(wxString text) {
+        text.Replace("\n", " "); // where the toolkit wraps it
+        if (!text.empty() && !text.IsNumber())
+            m_keys.insert(text);
+    }
+
+    std::set<wxString> m_keys;
+};
+
+TEST_F(CatalogueTest, HasEveryTextThatTheProgramShows) {
+    CollectFromWindow();
+    for (auto& printer : m_printers)
+        printer.reset();
+    CollectFromWindow();
+    m_office.reset();
+    CollectFromWindow();
+    EXPECT_GT(m_keys.size(), 30U) << "labels, entries, notes and buttons";
+    const FilterSet filters(TEST_FILTERS);
+    for (int code = -2000; code < 2000; ++code)
+        Add(filters.ErrorText(code));
+    EXPECT_GT(m_keys.size(), 60U) << "and result codes";
+    for (const char* said : {"The settings are not saved. %s cannot be written: %s.",
+                             "its folder does not exist", "it is write-protected"})
+        m_keys.insert(said);
+    for (const char* language : Languages) {
+        Speak(language);
+        for (const wxString& key : m_keys)
+            EXPECT_TRUE(wxTranslations::Get()->GetTranslatedString(key)) << language << ": " << key;
+        std::set<wxString> entries;
+        for (const char* entry : {"Slides", "Handouts", "Notes Pages", "Outline View", "Color",
+                                  "Grayscale", "Pure Black and White"})
+            entries.insert(wxGetTranslation(entry));
+        EXPECT_EQ(entries.size(), 7U) << language << ": a stored entry must say which it is";
+    }
+}
+
+TEST_F(CatalogueTest, HasTheSameKeysInEachLanguageAndNoTextInWork) {
+    std::set<std::string> keys[std::size(Languages)];
+    for (std::size_t i = 0; i < std::size(Languages); ++i) {
+        std::ifstream file(std::string(CATALOGUES "/") + Languages[i] + ".po");
+        for (std::string line; std::getline(file, line);) {
+            EXPECT_EQ(line.find("fuzzy"), std::string::npos) << Languages[i];
+            const bool isKey = line.rfind("msgid ", 0) == 0;
+            EXPECT_TRUE(!isKey || keys[i].insert(line).second) << line;
+        }
+        EXPECT_EQ(keys[i], keys[0]) << Languages[i];
+    }
+    EXPECT_GT(keys[0].size(), 60U);
+}
+
+} // namespace

@@ -1,0 +1,117 @@
+#include "common/Themer.h"
+#include "tests/ui/settings/SettingsWindow.h"
+#include "ui/ControlIds.h"
+
+#include <wx/bitmap.h>
+#include <wx/button.h>
+#include <wx/checkbox.h>
+#include <wx/choice.h>
+#include <wx/dcmemory.h>
+#include <wx/dcscreen.h>
+#include <wx/image.h>
+#include <wx/radiobut.h>
+#include <wx/stattext.h>
+#include <wx/utils.h>
+
+#include <cairo.h>
+
+#include <set>
+
+namespace {
+
+/// Pictures of the window, for people to look at; and what can be said of them without one.
+class PictureTest : public SettingsWindow {
+protected:
+    wxImage Photograph() const {
+        const wxRect place = Place(m_window);
+        wxBitmap bitmap(place.GetSize());
+        wxMemoryDC picture(bitmap);
+        wxScreenDC screen;
+        // What was read of the screen before is not believed any more.
+        cairo_surface_mark_dirty(cairo_get_target(static_cast<cairo_t*>(screen.GetHandle())));
+        picture.Blit(wxPoint(), place.GetSize(), &screen, place.GetPosition());
+        picture.SelectObject(wxNullBitmap);
+        return bitmap.ConvertToImage();
+    }
+
+    static wxColour ColourAt(const wxImage& picture, wxPoint at) {
+        return {picture.GetRed(at.x, at.y), picture.GetGreen(at.x, at.y),
+                picture.GetBlue(at.x, at.y)};
+    }
+
+    static void Keep(const wxImage& picture, const wxString& language) {
+        wxString scale;
+        const bool large = wxGetEnv("GDK_DPI_SCALE", &scale);
+        std::filesystem::create_directories(SCREENSHOTS);
+        if (!wxImage::FindHandler(wxBITMAP_TYPE_PNG))
+            wxImage::AddHandler(new wxPNGHandler); // the toolkit's
+        EXPECT_TRUE(picture.SaveFile(SCREENSHOTS "/settings-" + language +
+                                         (large ? "-text-times-" + scale : wxString()) + ".png",
+                                     wxBITMAP_TYPE_PNG));
+    }
+};
+
+bool HasText(const wxWindow* window) {
+    return wxDynamicCast(window, wxStaticText) || wxDynamicCast(window, wxCheckBox) ||
+           wxDynamicCast(window, wxRadioButton) || wxDynamicCast(window, wxButton);
+}
+
+/// Nothing is cut off: each control is as large as it needs to be, and inside its parent.
+void ExpectWhole(wxWindow* window) {
+    const wxSize size = window->GetSize();
+    if (HasText(window)) {
+        const wxSize needed = window->GetBestSize();
+        EXPECT_TRUE(needed.x <= size.x && needed.y <= size.y) << window->GetLabel();
+    }
+    if (const auto* choice = wxDynamicCast(window, wxChoice)) {
+        for (const wxString& entry : choice->GetStrings())
+            EXPECT_LE(choice->GetSizeFromTextSize(choice->GetTextExtent(entry).x).x, size.x)
+                << entry;
+        EXPECT_LE(choice->GetBestSize().y, size.y) << choice->GetStringSelection();
+    }
+    const wxSize room = window->GetParent()->GetVirtualSize();
+    if (window->IsShown()) {
+        EXPECT_LE(window->GetRect().GetRight(), room.x) << window->GetLabel();
+        EXPECT_LE(window->GetRect().GetBottom(), room.y) << window->GetLabel();
+    }
+}
+
+void ExpectOneColumn(const wxWindow* window, std::initializer_list<int> ids) {
+    std::set<int> edges;
+    for (const int id : ids)
+        edges.insert(window->FindWindow(id)->GetScreenPosition().x);
+    EXPECT_EQ(edges.size(), 1U);
+}
+
+TEST_F(PictureTest, TheWindowIsWholeInEveryLanguage) {
+    for (const char* language : {"en", "de", "fr", "es", "ja"}) {
+        SCOPED_TRACE(language);
+        Speak(language);
+        Open([this, language] {
+            const wxPoint strip(m_window->GetClientSize().x / 2, 10);
+            const wxColour stripColour =
+                Themer::GetThemeService()->GetTheme("HeaderView").backgroundColour;
+            wxImage picture;
+            EXPECT_TRUE(Until([&] {
+                picture = Photograph();
+                return ColourAt(picture, strip) == stripColour;
+            })) << ColourAt(picture, strip).GetAsString();
+            Keep(picture, language);
+            EXPECT_GT(picture.CountColours(), 50UL) << "letters, frames, boxes";
+            ForEachBelow(m_window, ExpectWhole);
+            ExpectOneColumn(m_window, {ControlId::Printer, ControlId::Print, ControlId::Colour,
+                                       ControlId::SlidesPerPage, ControlId::OrderHorizontal,
+                                       ControlId::DistillerProfile});
+            const wxRect screen = wxGetClientDisplayRect();
+            EXPECT_TRUE(screen.Contains(Place(m_window)));
+        });
+    }
+}
+
+TEST_F(PictureTest, TheHeadersLettersFitIntoItsStrip) {
+    wxScreenDC screen;
+    screen.SetFont(Themer::GetThemeService()->GetTheme("HeaderView").font);
+    EXPECT_LE(4 + screen.GetTextExtent("Microsoft, ygj").y, 22);
+}
+
+} // namespace

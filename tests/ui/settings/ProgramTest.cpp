@@ -1,0 +1,114 @@
+#include "tests/host/Program.h"
+
+#include "tests/ui/settings/SettingsWindow.h"
+#include "ui/ControlIds.h"
+
+#include <wx/frame.h>
+#include <wx/utils.h>
+
+#include <regex>
+
+namespace {
+
+/// The whole program, as its user meets it.
+class ProgramTest : public SettingsWindow {
+protected:
+    /// An environment variable for the length of an object's life.
+    class Variable {
+    public:
+        Variable(const char* name, const char* value) : m_name(name) {
+            m_was = wxGetEnv(m_name, &m_before);
+            value ? wxSetEnv(m_name, value) : wxUnsetEnv(m_name);
+        }
+        ~Variable() { m_was ? wxSetEnv(m_name, m_before) : wxUnsetEnv(m_name); }
+        Variable(const Variable&) = delete;
+        Variable& operator=(const Variable&) = delete;
+
+    private:
+        wxString m_name;
+        wxString m_before;
+        bool m_was = false;
+    };
+
+    /// Converts the deck with the stored settings, and counts the pages.
+    std::size_t PagesOfDeck() const {
+        const RunResult run =
+            RunQuillon({"convert", SAMPLES "/deck.pptx", "--out", (m_folder / "out").string(),
+                        "--settings", m_file.string(), "--printer",
+                        "Quillon PostScript File Printer", "--ps", "--lang", "en"});
+        EXPECT_EQ(run.exitCode, 0) << run.out << run.err;
+        const std::string output = ReadBytes(m_folder / "out" / "deck.ps");
+        const std::regex page("\n%%Page: ");
+        return static_cast<std::size_t>(
+            std::distance(std::sregex_iterator(output.begin(), output.end(), page), {}));
+    }
+};
+
+TEST_F(ProgramTest, APanelSavedInGermanPrintsHandoutsInEnglish) {
+    m_folder.Write("job.xml", "<UI><PRINTHIDDENSLIDES>1</PRINTHIDDENSLIDES>"
+                              "<PRINTCOMMENTSANDINKMARKUP>0</PRINTCOMMENTSANDINKMARKUP></UI>");
+    const std::size_t slides = PagesOfDeck();
+    Speak("de");
+    EXPECT_EQ(Open([this] {
+                  Choose(ControlId::Print, "Handzettel");
+                  Choose(ControlId::SlidesPerPage, "4");
+                  Press(WXK_RETURN);
+                  Until([this] { return !m_window->IsModal(); });
+              }),
+              wxID_SAVE);
+    EXPECT_NE(Stored().find("<PRINTOUTPUTTYPE>Handzettel</PRINTOUTPUTTYPE>"), std::string::npos);
+    Speak("en");
+    EXPECT_GT(slides, 4U);
+    EXPECT_EQ(PagesOfDeck(), (slides + 3) / 4);
+}
+
+TEST_F(ProgramTest, TheWindowOpensAndSaves) {
+    const Variable language("LC_ALL", "C.UTF-8");
+    RunningProgram program(QuillonCommand({"settings", "--settings", m_file.string()}));
+    auto* const ours = new wxFrame(nullptr, wxID_ANY, "Ours"); // the simulated user needs one
+    const wxSize screen = wxGetDisplaySize();
+    wxUIActionSimulator().MouseMove(screen.x / 2, screen.y / 2);
+    Await("the file", [this] { // the first keys may come before the window does
+        Press(WXK_RETURN);
+        return std::filesystem::exists(m_file);
+    });
+    ours->Destroy();
+    const RunResult run = program.Wait();
+    EXPECT_EQ(run.exitCode, 0) << run.err;
+    EXPECT_NE(run.out.find("saved in " + m_file.string()), std::string::npos) << run.out;
+    EXPECT_NE(Stored().find("<OUTPUTFILETYPEPDF>1</OUTPUTFILETYPEPDF>"), std::string::npos);
+}
+
+TEST_F(ProgramTest, SaysWhenThereIsNoDisplay) {
+    const Variable display("DISPLAY", nullptr);
+    const Variable wayland("WAYLAND_DISPLAY", nullptr);
+    const RunResult run = RunQuillon({"settings", "--settings", m_file.string(), "--json"});
+    EXPECT_EQ(run.exitCode, 2);
+    ASSERT_EQ(run.Records("error").size(), 1U) << run.out;
+    EXPECT_NE(run.err.find("no display"), std::string::npos) << run.err;
+    EXPECT_FALSE(std::filesystem::exists(m_file));
+}
+
+TEST_F(ProgramTest, SpeaksTheDesktopsLanguageOrTheOneItIsTold) {
+    struct Case {
+        const char* environment;
+        std::vector<std::string> options;
+        const char* text;
+    };
+    const Case cases[] = {
+        {"C.UTF-8", {}, "Input file not found"},
+        {"de_AT.UTF-8", {}, "Eingabedatei nicht gefunden"},
+        {"nl_NL.UTF-8", {}, "Input file not found"},
+        {"de_DE.UTF-8", {"--lang", "en"}, "Input file not found"},
+        {"C.UTF-8", {"--lang", "es_MX"}, "No se encuentra el archivo de entrada"},
+    };
+    for (const Case& each : cases) {
+        const Variable language("LC_ALL", each.environment);
+        std::vector<std::string> arguments = {"screen", (m_folder / "none.doc").string()};
+        arguments.insert(arguments.end(), each.options.begin(), each.options.end());
+        const RunResult run = RunQuillon(arguments);
+        EXPECT_NE(run.out.find(each.text), std::string::npos) << each.environment << run.out;
+    }
+}
+
+} // namespace

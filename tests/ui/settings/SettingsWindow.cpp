@@ -1,0 +1,133 @@
+#include "tests/ui/settings/SettingsWindow.h"
+
+#include "host/program/settings/RunSettings.h"
+#include "host/services/CatalogueLoader.h"
+#include "tests/support/RegistryText.h"
+
+#include <wx/app.h>
+#include <wx/choice.h>
+#include <wx/utils.h>
+
+#include <dlfcn.h>
+
+#include <chrono>
+
+namespace {
+
+constexpr wchar_t DistillerKey[] = L"SOFTWARE\\Adobe\\Acrobat Distiller\\9.0";
+
+} // namespace
+
+SettingsWindow::SettingsWindow() {
+    Speak("en");
+    m_office.emplace(std::vector<std::wstring>{L"Word.Application", L"PowerPoint.Application"});
+    const std::wstring ppd = m_folder.Write("a.ppd", "x").wstring();
+    m_printers[0].emplace(L"Quillon PostScript File Printer", L"Test driver", ppd);
+    m_printers[1].emplace(L"Proofer", L"Test driver", ppd);
+    std::filesystem::create_directory(m_folder / "profiles");
+    m_folder.Write("profiles/Press Quality.joboptions", "x");
+    m_folder.Write("profiles/Print.joboptions", "x");
+    WriteRegistryText(HKEY_LOCAL_MACHINE, DistillerKey, L"JobOptionsFolder",
+                      (m_folder / "profiles").wstring());
+}
+
+SettingsWindow::~SettingsWindow() {
+    RegDeleteTreeW(HKEY_LOCAL_MACHINE, DistillerKey);
+    Speak("en");
+}
+
+void SettingsWindow::Speak(const wxString& language) {
+    auto* translations = new wxTranslations;
+    wxTranslations::Set(translations); // owns it
+    translations->SetLoader(new CatalogueLoader(QUILLON_BIN "/locale"));
+    translations->SetLanguage(language);
+    translations->AddCatalog(CatalogueDomain);
+}
+
+int SettingsWindow::Open(const std::function<void()>& user) {
+    const FilterSet filters(TEST_FILTERS);
+    wxString fault;
+    std::optional<Settings> settings = Settings::LoadForEditing(m_file, fault);
+    EXPECT_TRUE(settings) << fault;
+    if (!settings)
+        return wxID_NONE;
+    FillIn(*settings);
+    SettingsDialogue window(filters, *settings, m_file);
+    m_window = &window;
+    window.CallAfter([this, &user] {
+        EXPECT_TRUE(Until([this] { return m_window->IsShownOnScreen(); }));
+        // Without a window manager, the keys go to the window under the mouse.
+        wxUIActionSimulator().MouseMove(m_window->GetScreenPosition() + wxPoint(30, 12));
+        EXPECT_TRUE(Until([this] { return m_window->IsActive() && Focused(); }));
+        user();
+        if (m_window->IsModal())
+            m_window->EndModal(wxID_NONE);
+    });
+    const int end = window.ShowModal();
+    m_window = nullptr;
+    return end;
+}
+
+wxWindow* SettingsWindow::Find(int id) const {
+    wxWindow* const window = m_window->FindWindow(id);
+    EXPECT_TRUE(window) << id;
+    return window;
+}
+
+wxWindow* SettingsWindow::Focused() const {
+    // wxWidgets loses sight of the focus within a choice. The toolkit has it, but not its headers.
+    using GetPart = void* (*)(void*);
+    static const auto s_getFocus =
+        reinterpret_cast<GetPart>(dlsym(RTLD_DEFAULT, "gtk_window_get_focus"));
+    static const auto s_getParent =
+        reinterpret_cast<GetPart>(dlsym(RTLD_DEFAULT, "gtk_widget_get_parent"));
+    for (void* widget = s_getFocus(m_window->GetHandle()); widget; widget = s_getParent(widget)) {
+        wxWindow* found = nullptr;
+        ForEachBelow(m_window, [&](wxWindow* each) {
+            found = each->GetHandle() == static_cast<WXWidget>(widget) ? each : found;
+        });
+        if (found)
+            return found;
+    }
+    return nullptr;
+}
+
+wxRect SettingsWindow::Place(const wxWindow* window) const {
+    return {window->GetScreenPosition(), window->GetSize()};
+}
+
+void SettingsWindow::Click(int id) {
+    const wxRect place = Place(Find(id));
+    wxUIActionSimulator user;
+    user.MouseMove(place.x + 10, place.y + place.height / 2); // on the box of a check box
+    user.MouseClick();
+}
+
+void SettingsWindow::Press(int key) {
+    wxUIActionSimulator().Char(key);
+}
+
+void SettingsWindow::Choose(int id, const wxString& entry) {
+    auto* choice = wxDynamicCast(Find(id), wxChoice);
+    ASSERT_TRUE(choice->SetStringSelection(entry)) << entry;
+    wxCommandEvent event(wxEVT_CHOICE, id);
+    event.SetEventObject(choice);
+    event.SetInt(choice->GetSelection());
+    choice->ProcessWindowEvent(event);
+}
+
+bool SettingsWindow::Until(const std::function<bool()>& condition) {
+    const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(10);
+    while (!condition() && std::chrono::steady_clock::now() < end) {
+        wxTheApp->Yield(true);
+        wxMilliSleep(1);
+    }
+    return condition();
+}
+
+void ForEachBelow(wxWindow* window, const std::function<void(wxWindow*)>& visit) {
+    for (wxWindow* child : window->GetChildren()) {
+        visit(child);
+        ForEachBelow(child, visit);
+    }
+}
