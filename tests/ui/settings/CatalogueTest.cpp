@@ -52,7 +52,7 @@ TEST_F(CatalogueTest, HasEveryTextThatTheProgramShows) {
     m_office.reset();
     CollectFromWindow();
     EXPECT_GT(m_keys.size(), 30U) << "labels, entries, notes and buttons";
-    const FilterSet filters(TEST_FILTERS);
+    const FilterSet filters(QUILLON_FILTERS);
     for (int code = -2000; code < 2000; ++code)
         Add(filters.ErrorText(code));
     EXPECT_GT(m_keys.size(), 60U) << "and result codes";

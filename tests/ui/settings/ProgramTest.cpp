@@ -10,6 +10,12 @@
 
 namespace {
 
+/// The program with the filter and the stand-ins that are installed with it.
+std::vector<std::string> Command(std::vector<std::string> arguments) {
+    arguments.insert(arguments.begin(), QUILLON_PROGRAM);
+    return arguments;
+}
+
 /// The whole program, as its user meets it.
 class ProgramTest : public SettingsWindow {
 protected:
@@ -32,10 +38,10 @@ protected:
 
     /// Converts the deck with the stored settings, and counts the pages.
     std::size_t PagesOfDeck() const {
-        const RunResult run =
-            RunQuillon({"convert", SAMPLES "/deck.pptx", "--out", (m_folder / "out").string(),
-                        "--settings", m_file.string(), "--printer",
-                        "Quillon PostScript File Printer", "--ps", "--lang", "en"});
+        const RunResult run = RunProgram(
+            Command({"convert", SAMPLES "/deck.pptx", "--out", (m_folder / "out").string(),
+                     "--settings", m_file.string(), "--printer", "Quillon PostScript File Printer",
+                     "--ps", "--lang", "en"}));
         EXPECT_EQ(run.exitCode, 0) << run.out << run.err;
         const std::string output = ReadBytes(m_folder / "out" / "deck.ps");
         const std::regex page("\n%%Page: ");
@@ -64,7 +70,7 @@ TEST_F(ProgramTest, APanelSavedInGermanPrintsHandoutsInEnglish) {
 
 TEST_F(ProgramTest, TheWindowOpensAndSaves) {
     const Variable language("LC_ALL", "C.UTF-8");
-    RunningProgram program(QuillonCommand({"settings", "--settings", m_file.string()}));
+    RunningProgram program(Command({"settings", "--settings", m_file.string()}));
     auto* const ours = new wxFrame(nullptr, wxID_ANY, "Ours"); // the simulated user needs one
     const wxSize screen = wxGetDisplaySize();
     wxUIActionSimulator().MouseMove(screen.x / 2, screen.y / 2);
@@ -82,7 +88,8 @@ TEST_F(ProgramTest, TheWindowOpensAndSaves) {
 TEST_F(ProgramTest, SaysWhenThereIsNoDisplay) {
     const Variable display("DISPLAY", nullptr);
     const Variable wayland("WAYLAND_DISPLAY", nullptr);
-    const RunResult run = RunQuillon({"settings", "--settings", m_file.string(), "--json"});
+    const RunResult run =
+        RunProgram(Command({"settings", "--settings", m_file.string(), "--json"}));
     EXPECT_EQ(run.exitCode, 2);
     ASSERT_EQ(run.Records("error").size(), 1U) << run.out;
     EXPECT_NE(run.err.find("no display"), std::string::npos) << run.err;
@@ -106,7 +113,7 @@ TEST_F(ProgramTest, SpeaksTheDesktopsLanguageOrTheOneItIsTold) {
         const Variable language("LC_ALL", each.environment);
         std::vector<std::string> arguments = {"screen", (m_folder / "none.doc").string()};
         arguments.insert(arguments.end(), each.options.begin(), each.options.end());
-        const RunResult run = RunQuillon(arguments);
+        const RunResult run = RunProgram(Command(arguments));
         EXPECT_NE(run.out.find(each.text), std::string::npos) << each.environment << run.out;
     }
 }

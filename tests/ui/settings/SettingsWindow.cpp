@@ -45,7 +45,7 @@ void SettingsWindow::Speak(const wxString& language) {
 }
 
 int SettingsWindow::Open(const std::function<void()>& user) {
-    const FilterSet filters(TEST_FILTERS);
+    const FilterSet filters(QUILLON_FILTERS);
     wxString fault;
     std::optional<Settings> settings = Settings::LoadForEditing(m_file, fault);
     EXPECT_TRUE(settings) << fault;
