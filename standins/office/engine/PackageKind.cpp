@@ -1,5 +1,7 @@
 #include "standins/office/engine/PackageKind.h"
 
+#include "standins/office/GObjectReference.h"
+
 #include <glib.h>
 #include <gsf/gsf-infile-zip.h>
 #include <gsf/gsf-input-stdio.h>
@@ -13,12 +15,6 @@
 namespace standins {
 
 namespace {
-
-struct ObjectDeleter {
-    void operator()(gpointer object) const { g_object_unref(object); }
-};
-template <typename Object>
-using Reference = std::unique_ptr<Object, ObjectDeleter>;
 
 /// The main part of a document has a content type with the application's mark in it.
 struct Kind {
@@ -51,9 +47,10 @@ const Kind* KindOfPart(std::string_view contentType) {
 /// @return empty when there is none
 std::string ReadContentTypes(const std::string& path) {
     constexpr gsf_off_t Longest = 1 << 20;
-    const Reference<GsfInput> file(gsf_input_stdio_new(path.c_str(), nullptr));
-    const Reference<GsfInfile> package(file ? gsf_infile_zip_new(file.get(), nullptr) : nullptr);
-    const Reference<GsfInput> list(
+    const GObjectReference<GsfInput> file(gsf_input_stdio_new(path.c_str(), nullptr));
+    const GObjectReference<GsfInfile> package(file ? gsf_infile_zip_new(file.get(), nullptr)
+                                                   : nullptr);
+    const GObjectReference<GsfInput> list(
         package ? gsf_infile_child_by_name(package.get(), "[Content_Types].xml") : nullptr);
     if (!list)
         return {};

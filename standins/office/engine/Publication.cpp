@@ -1,5 +1,7 @@
 #include "standins/office/engine/Publication.h"
 
+#include "standins/office/GObjectReference.h"
+
 #include <gsf/gsf-infile-msole.h>
 #include <gsf/gsf-input-stdio.h>
 #include <gsf/gsf-utils.h>
@@ -8,22 +10,13 @@
 
 namespace standins {
 
-namespace {
-
-struct ObjectDeleter {
-    void operator()(gpointer object) const { g_object_unref(object); }
-};
-template <typename Object>
-using Reference = std::unique_ptr<Object, ObjectDeleter>;
-
-} // namespace
-
 bool IsPublication(const std::string& path) {
     gsf_init();
-    const Reference<GsfInput> file(gsf_input_stdio_new(path.c_str(), nullptr));
-    const Reference<GsfInfile> storage(file ? gsf_infile_msole_new(file.get(), nullptr) : nullptr);
-    const Reference<GsfInput> contents(storage ? gsf_infile_child_by_name(storage.get(), "Contents")
-                                               : nullptr);
+    const GObjectReference<GsfInput> file(gsf_input_stdio_new(path.c_str(), nullptr));
+    const GObjectReference<GsfInfile> storage(file ? gsf_infile_msole_new(file.get(), nullptr)
+                                                   : nullptr);
+    const GObjectReference<GsfInput> contents(
+        storage ? gsf_infile_child_by_name(storage.get(), "Contents") : nullptr);
     return contents != nullptr;
 }
 

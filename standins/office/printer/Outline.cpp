@@ -1,5 +1,7 @@
 #include "standins/office/printer/Outline.h"
 
+#include "standins/office/GObjectReference.h"
+
 #include <glib.h>
 #include <gsf/gsf-infile-zip.h>
 #include <gsf/gsf-input-stdio.h>
@@ -14,12 +16,6 @@
 namespace standins {
 
 namespace {
-
-struct ObjectDeleter {
-    void operator()(gpointer object) const { g_object_unref(object); }
-};
-template <typename Object>
-using Reference = std::unique_ptr<Object, ObjectDeleter>;
 
 /// The attributes of an element, as GLib's parser has them.
 class Attributes {
@@ -187,14 +183,15 @@ void AddText(GMarkupParseContext* /*context*/, const gchar* text, gsize size, gp
     static_cast<OutlineReader*>(reader)->Text({text, size});
 }
 
-Reference<GsfInput> OpenContent(int presentation) {
+GObjectReference<GsfInput> OpenContent(int presentation) {
     gsf_init();
     std::FILE* stream = fdopen(dup(presentation), "rb");
-    const Reference<GsfInput> file(stream ? gsf_input_stdio_new_FILE("presentation", stream, FALSE)
-                                          : nullptr);
-    const Reference<GsfInfile> package(file ? gsf_infile_zip_new(file.get(), nullptr) : nullptr);
-    Reference<GsfInput> content(package ? gsf_infile_child_by_name(package.get(), "content.xml")
-                                        : nullptr);
+    const GObjectReference<GsfInput> file(
+        stream ? gsf_input_stdio_new_FILE("presentation", stream, FALSE) : nullptr);
+    const GObjectReference<GsfInfile> package(file ? gsf_infile_zip_new(file.get(), nullptr)
+                                                   : nullptr);
+    GObjectReference<GsfInput> content(
+        package ? gsf_infile_child_by_name(package.get(), "content.xml") : nullptr);
     if (!content)
         throw std::runtime_error("its outline cannot be read");
     return content;
@@ -205,7 +202,7 @@ Reference<GsfInput> OpenContent(int presentation) {
 std::vector<Paragraph> ReadOutline(int presentation, bool withHidden) {
     constexpr gsf_off_t ChunkSize = 64 << 10;
     constexpr GMarkupParser Parser = {StartElement, EndElement, AddText, nullptr, nullptr};
-    const Reference<GsfInput> content = OpenContent(presentation);
+    const GObjectReference<GsfInput> content = OpenContent(presentation);
     OutlineReader reader(withHidden);
     const std::unique_ptr<GMarkupParseContext, decltype(&g_markup_parse_context_unref)> context(
         g_markup_parse_context_new(&Parser, {}, &reader, nullptr), g_markup_parse_context_unref);
