@@ -84,6 +84,8 @@ wxString DescribeInvalid(const fs::path& file) {
     const std::string beginning = FirstBytes(file);
     const wxString extension = wxFileName(ToText(file).value_or(wxString())).GetExt().Lower();
     const bool openXml = extension.EndsWith("x");
+    if (BeginsWith(beginning, Zip) && extension == "pub")
+        return "it is a ZIP package, not a publication";
     if (BeginsWith(beginning, Zip))
         return openXml ? "it is damaged, or no ." + extension + " document inside"
                        : wxString::Format("it is a ZIP package: probably a .%sx renamed to .%s",
