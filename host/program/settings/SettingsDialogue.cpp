@@ -26,6 +26,7 @@ SettingsDialogue::SettingsDialogue(const FilterSet& filters, const Settings& set
                wxDEFAULT_DIALOG_STYLE | wxRESIZE_BORDER),
       m_filters(filters), m_file(file) {
     m_fault = new wxInfoBar(this);
+    m_fault->AddButton(ButtonId::Understood, "OK");
     auto* const top = new wxBoxSizer(wxVERTICAL);
     top->Add(NewPanels(settings), 1, wxEXPAND);
     top->Add(m_fault, 0, wxEXPAND);

@@ -12,7 +12,7 @@ class wxScrolledWindow;
 /// The identifiers of the window's buttons.
 namespace ButtonId {
 
-enum : int { Save = wxID_HIGHEST + 1, Cancel };
+enum : int { Save = wxID_HIGHEST + 1, Cancel, Understood };
 
 } // namespace ButtonId
 

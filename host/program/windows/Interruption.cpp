@@ -15,19 +15,30 @@ void WriteNote() {
     WriteFile(GetStdHandle(STD_ERROR_HANDLE), Note, sizeof Note - 1, &written, nullptr);
 }
 
-/// Runs on a thread of the system's.
-BOOL WINAPI OnRequest(DWORD kind) {
-    const bool again = g_requested.exchange(true);
-    if (kind == CTRL_C_EVENT || kind == CTRL_BREAK_EVENT) {
-        if (again)
-            return FALSE; // the system's own answer: the process ends
-        WriteNote();
-        return TRUE;
-    }
-    // The window closes or the user logs off: the process ends when this returns, and by force a
-    // few seconds later. Until then the document under way may be finished.
+bool IsKey(DWORD kind) {
+    return kind == CTRL_C_EVENT || kind == CTRL_BREAK_EVENT;
+}
+
+/// The window closes or the user logs off: the process ends when the handler returns, and by force
+/// a few seconds later. Until then the document under way may be finished.
+BOOL AwaitForce() {
     Sleep(INFINITE);
     return TRUE;
+}
+
+/// Runs on a thread of the system's, like the next.
+BOOL WINAPI OnRequest(DWORD kind) {
+    const bool again = g_requested.exchange(true);
+    if (!IsKey(kind))
+        return AwaitForce();
+    if (again)
+        return FALSE; // the system's own answer: the process ends
+    WriteNote();
+    return TRUE;
+}
+
+BOOL WINAPI LeaveRequest(DWORD kind) {
+    return IsKey(kind) || AwaitForce();
 }
 
 } // namespace
@@ -37,7 +48,8 @@ void Interruption::Install() {
 }
 
 void Interruption::LeaveToParent() {
-    SetConsoleCtrlHandler(nullptr, TRUE); // nor for the processes started from here
+    SetConsoleCtrlHandler(LeaveRequest, TRUE);
+    SetConsoleCtrlHandler(nullptr, TRUE); // nor is Ctrl-C for the processes started from here
 }
 
 bool Interruption::Requested() {
