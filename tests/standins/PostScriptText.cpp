@@ -5,7 +5,6 @@
 #include <array>
 #include <cstdio>
 #include <memory>
-#include <regex>
 #include <sstream>
 
 namespace {
@@ -49,14 +48,16 @@ std::vector<std::string> PostScriptPageSizes(const std::filesystem::path& file) 
 std::vector<PrintedWord> PostScriptWords(const std::filesystem::path& file) {
     std::istringstream lines(
         OutputOf(Ghostscript + "pdfwrite -o - '" + file.string() + "' | pdftotext -bbox - - 2>&1"));
-    const std::regex wordOf(R"re(<word xMin="([^"]+)" yMin="([^"]+)"[^>]*>([^<]*)<)re");
     std::vector<PrintedWord> words;
     int page = 0;
     for (std::string line; std::getline(lines, line);) {
         page += line.find("<page ") != std::string::npos ? 1 : 0;
-        std::smatch found;
-        if (std::regex_search(line, found, wordOf))
-            words.push_back({page, std::stod(found[1]), std::stod(found[2]), found[3]});
+        double x = 0;
+        double y = 0;
+        std::array<char, 256> text{};
+        if (std::sscanf(line.c_str(), R"( <word xMin="%lf" yMin="%lf" %*[^>]>%255[^<])", &x, &y,
+                        text.data()) == 3)
+            words.push_back({page, x, y, text.data()});
     }
     return words;
 }

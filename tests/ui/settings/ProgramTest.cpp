@@ -6,8 +6,6 @@
 #include <wx/frame.h>
 #include <wx/utils.h>
 
-#include <regex>
-
 namespace {
 
 /// The program with the filter and the stand-ins that are installed with it.
@@ -44,9 +42,12 @@ protected:
                      "--ps", "--lang", "en"}));
         EXPECT_EQ(run.exitCode, 0) << run.out << run.err;
         const std::string output = ReadBytes(m_folder / "out" / "deck.ps");
-        const std::regex page("\n%%Page: ");
-        return static_cast<std::size_t>(
-            std::distance(std::sregex_iterator(output.begin(), output.end(), page), {}));
+        const std::string page = "\n%%Page: ";
+        std::size_t pages = 0;
+        for (std::size_t at = output.find(page); at != std::string::npos;
+             at = output.find(page, at + 1))
+            ++pages;
+        return pages;
     }
 };
 
