@@ -20,7 +20,7 @@ const Theme& HeaderTheme() {
 wxBEGIN_EVENT_TABLE(CWndDCPluginNamePanel, wxPanel)
     EVT_PAINT(CWndDCPluginNamePanel::OnPaint)
     EVT_SIZE(CWndDCPluginNamePanel::OnSize)
-wxEND_EVENT_TABLE();
+wxEND_EVENT_TABLE()
 // clang-format on
 
 CWndDCPluginNamePanel::CWndDCPluginNamePanel(wxWindow* parent, int id)
@@ -31,7 +31,7 @@ CWndDCPluginNamePanel::CWndDCPluginNamePanel(wxWindow* parent, int id)
 }
 
 void CWndDCPluginNamePanel::SetPluginName(wxString name) {
-    m_pluginName = std::move(name);
+    m_pluginName.swap(name);
 }
 
 void CWndDCPluginNamePanel::OnPaint(wxPaintEvent& /*event*/) {

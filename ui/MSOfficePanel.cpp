@@ -32,7 +32,7 @@ wxBEGIN_EVENT_TABLE(MSOfficePanel, OutputFileTypePanelMSO)
     EVT_CHOICE(ControlId::Print, MSOfficePanel::OnPrintOutputType)
     EVT_CHOICE(ControlId::Colour, MSOfficePanel::OnColor)
     EVT_CHOICE(ControlId::SlidesPerPage, MSOfficePanel::OnSlidesPerPage)
-wxEND_EVENT_TABLE();
+wxEND_EVENT_TABLE()
 // clang-format on
 
 MSOfficePanel::MSOfficePanel(wxWindow* parent, bool controlsEnabled)

@@ -25,7 +25,7 @@ constexpr std::initializer_list<int> OutputGroup = {ControlId::OutputPDF, Contro
 wxBEGIN_EVENT_TABLE(OutputFileTypePanelMSO, wxPanel)
     EVT_RADIOBUTTON(ControlId::OutputPS, OutputFileTypePanelMSO::OnPSChosen)
     EVT_RADIOBUTTON(ControlId::OutputPDF, OutputFileTypePanelMSO::OnPDFChosen)
-wxEND_EVENT_TABLE();
+wxEND_EVENT_TABLE()
 // clang-format on
 
 OutputFileTypePanelMSO::OutputFileTypePanelMSO(wxWindow* parent, bool controlsEnabled)

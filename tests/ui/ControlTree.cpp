@@ -34,9 +34,9 @@ wxString Described(const wxWindow* window) {
     return line;
 }
 
-void Append(const wxWindow* window, int depth, std::vector<std::string>& lines) {
+void Append(const wxWindow* window, std::size_t depth, std::vector<std::string>& lines) {
     for (const wxWindow* child : window->GetChildren()) {
-        lines.push_back(std::string(2 * depth, ' ') + Described(child).utf8_string());
+        lines.push_back(std::string(std::size_t{2} * depth, ' ') + Described(child).utf8_string());
         Append(child, depth + 1, lines);
     }
 }

@@ -54,8 +54,9 @@ const char* const WholeTree[] = {
     "    wxChoice 13005 [Press.joboptions|Print.joboptions] disabled",
     "wxPanel 19020",
     "  wxStaticText \"Note:\"",
-    "  wxStaticText \"Uncheck 'Rely on system fonts only' in the Adobe PDF Settings for successful "
-    "printing.\"",
+    ("  wxStaticText \"Uncheck 'Rely on system fonts only' in the Adobe PDF Settings for "
+     "successful "
+     "printing.\""),
 };
 
 TEST_F(PanelLayoutTest, HoldsItsControlsInTheirOrder) {

@@ -36,10 +36,10 @@ protected:
 
     /// Converts the deck with the stored settings, and counts the pages.
     std::size_t PagesOfDeck() const {
-        const RunResult run = RunProgram(
-            Command({"convert", SAMPLES "/deck.pptx", "--out", (m_folder / "out").string(),
-                     "--settings", m_file.string(), "--printer", "Quillon PostScript File Printer",
-                     "--ps", "--lang", "en"}));
+        const std::string deck = SAMPLES "/deck.pptx";
+        const RunResult run = RunProgram(Command(
+            {"convert", deck, "--out", (m_folder / "out").string(), "--settings", m_file.string(),
+             "--printer", "Quillon PostScript File Printer", "--ps", "--lang", "en"}));
         EXPECT_EQ(run.exitCode, 0) << run.out << run.err;
         const std::string output = ReadBytes(m_folder / "out" / "deck.ps");
         const std::string page = "\n%%Page: ";
