@@ -20,17 +20,22 @@ protected:
         Arguments arguments = {"convert", "--json", "--out", Out()};
         arguments.insert(arguments.end(), options.begin(), options.end());
         for (const std::string& path : paths)
-            arguments.push_back((m_folder / path).string());
+            arguments.push_back((m_folder / path).u8string());
         return arguments;
     }
 
-    std::string Out() const { return (m_folder / "out").string(); }
+    std::string Out() const { return (m_folder / "out").u8string(); }
+
+    /// The path of an output, as it is reported.
+    std::string OutputPath(const std::string& name) const {
+        return (m_folder / "out" / name).u8string();
+    }
 
     /// The names in the output folder, hidden ones too.
     Names Outputs() const {
         Names names;
         for (const auto& entry : std::filesystem::directory_iterator(Out()))
-            names.push_back(entry.path().filename().string());
+            names.push_back(entry.path().filename().u8string());
         std::sort(names.begin(), names.end());
         return names;
     }

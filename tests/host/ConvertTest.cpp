@@ -16,7 +16,7 @@ TEST_F(ConvertTest, DrivesTheFilterInItsOrderAndReportsTheOutput) {
     ASSERT_EQ(run.exitCode, 0) << run.err;
     const json document = run.Records("document").at(0);
     EXPECT_EQ(document["state"], "converted");
-    EXPECT_EQ(document["output"], Out() + "/a.ps");
+    EXPECT_EQ(document["output"], OutputPath("a.ps"));
     EXPECT_EQ(document["code"], 0);
     EXPECT_TRUE(document["seconds"].is_number());
     EXPECT_NE(run.err.find("a.doc: 50 %  Printing"), std::string::npos) << run.err;
@@ -93,7 +93,7 @@ TEST_F(ConvertTest, DocumentsOfOneNameAllGetAnOutput) {
     const RunResult run =
         Convert({"budget.txt", "budget.doc", "budget.xls", "sub/budget.xls", "Budget.docx"});
     EXPECT_EQ(run.exitCode, 1) << "the text";
-    EXPECT_EQ(run.Records("document").at(3)["output"], Out() + "/budget.xls (2).ps");
+    EXPECT_EQ(run.Records("document").at(3)["output"], OutputPath("budget.xls (2).ps"));
     EXPECT_EQ(Outputs(), (Names{"Budget.docx.log", "Budget.docx.ps", "budget.log", "budget.ps",
                                 "budget.xls (2).log", "budget.xls (2).ps", "budget.xls.log",
                                 "budget.xls.ps"}));
@@ -149,7 +149,7 @@ TEST_F(ConvertTest, TheOutputFolderIsMadeAndMayBeWrittenAnyWay) {
         const RunResult run = RunQuillon({"convert", (m_folder / "a.doc").string(), "--out",
                                           m_folder.Path().string() + '/' + out});
         EXPECT_EQ(run.exitCode, 0) << run.err;
-        EXPECT_TRUE(fs::is_regular_file(m_folder / out / "a.ps")) << out;
+        EXPECT_TRUE(fs::is_regular_file(m_folder / fs::u8path(out) / "a.ps")) << out;
     }
 }
 
@@ -177,8 +177,7 @@ TEST_F(ConvertTest, ASecondInterruptionEndsTheProgramAndTheNextRunCleansUp) {
     m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "never").string());
     RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc"})));
     AwaitFile(started);
-    program.Interrupt();
-    program.Terminate(); // two of a kind may arrive as one
+    program.InterruptTwice();
     EXPECT_TRUE(program.Wait().Records("summary").empty()) << "ended by one of the two";
     EXPECT_EQ(Outputs().size(), 1U) << "the hidden folder only";
     m_folder.Write("b.doc", "script");

@@ -1,5 +1,13 @@
 #include "tests/host/Program.h"
 
+#include "tests/host/System.h"
+
+#include <windows.h>
+// After it, which it takes for granted.
+#include <objbase.h>
+
+#include <wx/string.h>
+
 #include <gtest/gtest.h>
 
 #include <chrono>
@@ -7,6 +15,18 @@
 #include <thread>
 
 namespace fs = std::filesystem;
+
+namespace {
+
+/// Leaves the machine to the next program as it was.
+class StandInRegistration : public testing::Environment {
+    void TearDown() override { UnregisterStandIn(); }
+};
+
+[[maybe_unused]] testing::Environment* const g_registration =
+    testing::AddGlobalTestEnvironment(new StandInRegistration);
+
+} // namespace
 
 std::vector<nlohmann::json> RunResult::Records() const {
     std::vector<nlohmann::json> records;
@@ -29,6 +49,12 @@ std::vector<nlohmann::json> RunResult::Records(const std::string& type) const {
 RunningProgram::RunningProgram(const std::vector<std::string>& command)
     : m_process(command, m_folder / "out", m_folder / "err") {}
 
+void RunningProgram::InterruptTwice() const {
+    Interrupt();
+    Await("the note", [this] { return Err().find("finishing") != std::string::npos; });
+    Terminate();
+}
+
 RunResult RunningProgram::Wait() {
     const int exitCode = m_process.Wait();
     return {exitCode, ReadBytes(m_folder / "out"), ReadBytes(m_folder / "err")};
@@ -48,6 +74,16 @@ RunResult RunQuillon(std::vector<std::string> arguments) {
     return RunProgram(QuillonCommand(std::move(arguments)));
 }
 
+void UnregisterStandIn(const std::string& file) {
+    const HMODULE module = LoadLibraryW(wxString::FromUTF8(file + System::ModuleSuffix).wc_str());
+    using Unregister = HRESULT(STDMETHODCALLTYPE*)();
+    const auto unregister = reinterpret_cast<Unregister>(reinterpret_cast<void (*)()>(
+        module ? GetProcAddress(module, "DllUnregisterServer") : nullptr));
+    ASSERT_TRUE(unregister) << file;
+    EXPECT_EQ(unregister(), S_OK);
+    FreeLibrary(module);
+}
+
 void Await(const std::string& what, const std::function<bool()>& condition) {
     using namespace std::chrono;
     const auto end = steady_clock::now() + seconds(20);
@@ -57,5 +93,5 @@ void Await(const std::string& what, const std::function<bool()>& condition) {
 }
 
 void AwaitFile(const fs::path& file) {
-    Await(file.string(), [&file] { return fs::exists(file); });
+    Await(file.u8string(), [&file] { return fs::exists(file); });
 }

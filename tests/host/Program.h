@@ -31,6 +31,8 @@ public:
     void Interrupt() const { m_process.Interrupt(); }
     /// Asks it to end in the other way that the system has, if it has one.
     void Terminate() const { m_process.Terminate(); }
+    /// Asks it to end, and when it has said that it will finish what is under way, once more.
+    void InterruptTwice() const;
     RunResult Wait();
 
     /// What it has said so far on stderr.
@@ -45,6 +47,10 @@ RunResult RunProgram(const std::vector<std::string>& command);
 
 /// Runs `quillon` with the scripted filter and stand-in.
 RunResult RunQuillon(std::vector<std::string> arguments);
+
+/// Takes what a stand-in entered out of the registry, where that outlives the program.
+/// @param file the module without its suffix
+void UnregisterStandIn(const std::string& file = TEST_STAND_INS "/ScriptedStandIn");
 
 /// The command that RunQuillon runs.
 std::vector<std::string> QuillonCommand(std::vector<std::string> arguments);

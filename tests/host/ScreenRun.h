@@ -9,7 +9,7 @@
 class ScreenTest : public testing::Test {
 protected:
     static nlohmann::json Screen(const std::filesystem::path& path, int exitCode) {
-        const RunResult run = RunQuillon({"screen", "--json", path.string()});
+        const RunResult run = RunQuillon({"screen", "--json", path.u8string()});
         EXPECT_EQ(run.exitCode, exitCode) << run.out << run.err;
         const std::vector<nlohmann::json> documents = run.Records("document");
         EXPECT_EQ(documents.size(), 1U) << path;
@@ -24,6 +24,17 @@ protected:
         EXPECT_EQ(document["text"], "text of " + std::to_string(code)) << path;
         EXPECT_NE(document["reason"].get<std::string>().find(reason), std::string::npos)
             << path << document;
+    }
+
+    /// @param name of a file, UTF-8
+    /// @param shown the name as people see it
+    void ExpectShown(const std::string& name, const std::string& shown) const {
+        const std::filesystem::path path = m_folder.Write(std::filesystem::u8path(name), "script");
+        const RunResult run = RunQuillon({"screen", "--json", path.u8string()});
+        ASSERT_EQ(run.Records("document").size(), 1U) << run.err;
+        EXPECT_EQ(run.Records("document")[0]["input"], path.u8string());
+        const auto separator = static_cast<char>(std::filesystem::path::preferred_separator);
+        EXPECT_NE(run.err.find(separator + shown + ": accepted"), std::string::npos) << run.err;
     }
 
     TemporaryFolder m_folder;

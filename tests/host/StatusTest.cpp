@@ -1,4 +1,5 @@
 #include "tests/host/Program.h"
+#include "tests/host/System.h"
 #include "tests/support/TemporaryFolder.h"
 
 #include <gtest/gtest.h>
@@ -26,7 +27,7 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(applications[0]["name"], "Word");
     EXPECT_EQ(applications[0]["version"], "16");
     EXPECT_EQ(applications[1]["installed"], false);
-    EXPECT_TRUE(Contains(applications[1]["advice"], "libreoffice-calc-nogui"));
+    EXPECT_TRUE(Contains(applications[1]["advice"], System::ExcelAdvice));
 
     std::vector<json> preferred;
     for (const json& printer : run.Records("printer"))
@@ -48,12 +49,13 @@ TEST(Status, HandsTheClocksToTheEngines) {
 
 TEST(Status, TellsWhatIsMissingAndWhatToDo) {
     const TemporaryFolder empty;
-    const std::string folder = empty.Path().string();
+    const std::string folder = empty.Path().u8string();
+    UnregisterStandIn(); // where a registry outlives the process, it is there from another test
     const RunResult noOffice =
         RunProgram({QUILLON_PROGRAM, "status", "--filters", TEST_FILTERS, "--stand-ins", folder});
     EXPECT_EQ(noOffice.exitCode, 2);
     EXPECT_TRUE(Contains(noOffice.out, "No Office application is installed")) << noOffice.out;
-    EXPECT_TRUE(Contains(noOffice.out, "apt-get install libreoffice-writer-nogui")) << noOffice.out;
+    EXPECT_TRUE(Contains(noOffice.out, System::OfficeAdvice)) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, "not ready")) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, "disabled: no Office application is installed"));
     EXPECT_TRUE(Contains(noOffice.out, "nothing to make PDF files with")) << noOffice.out;
@@ -66,18 +68,19 @@ TEST(Status, TellsWhatIsMissingAndWhatToDo) {
 
 TEST(Status, PassesOverWhatIsNoFilter) {
     const TemporaryFolder folder;
-    std::filesystem::copy_file(std::filesystem::path(TEST_MODULES) / "NoFilter.so",
-                               folder / "Other.so");
-    folder.Write("Broken.so", "no module");
+    const std::string suffix = System::ModuleSuffix;
+    std::filesystem::copy_file(std::filesystem::path(TEST_MODULES) / ("NoFilter" + suffix),
+                               folder / ("Other" + suffix));
+    folder.Write("Broken" + suffix, "no module");
     folder.Write("readme.txt", "");
-    const std::string log = (folder / "log").string();
+    const std::string log = (folder / "log").u8string();
     const RunResult run =
-        RunProgram({QUILLON_PROGRAM, "status", "--filters", folder.Path().string(), "--stand-ins",
+        RunProgram({QUILLON_PROGRAM, "status", "--filters", folder.Path().u8string(), "--stand-ins",
                     TEST_STAND_INS, "--log", log});
     EXPECT_EQ(run.exitCode, 2);
     const std::string records = ReadBytes(log);
-    EXPECT_TRUE(Contains(records, "INFO ") && Contains(records, "Other.so")) << records;
-    EXPECT_TRUE(Contains(records, "WARN ") && Contains(records, "Broken.so")) << records;
+    EXPECT_TRUE(Contains(records, "INFO ") && Contains(records, "Other" + suffix)) << records;
+    EXPECT_TRUE(Contains(records, "WARN ") && Contains(records, "Broken" + suffix)) << records;
     EXPECT_FALSE(Contains(records, "readme.txt")) << records;
 }
 

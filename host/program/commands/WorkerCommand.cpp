@@ -5,7 +5,6 @@
 #include "host/program/workers/Messages.h"
 
 #include <condition_variable>
-#include <cstdlib>
 #include <deque>
 #include <mutex>
 #include <thread>
@@ -13,7 +12,7 @@
 namespace {
 
 [[noreturn]] void EndAtOnce(ExitCode exitCode) {
-    std::_Exit(static_cast<int>(exitCode));
+    EndThisProcess(static_cast<int>(exitCode));
 }
 
 /// The run that this process works for. When it is gone with work under way, nobody waits for that

@@ -45,3 +45,6 @@ private:
 /// In such a process: takes over its stdin and stdout. What anything else writes to stdout goes to
 /// stderr from then on, and processes that are started do not have the channel.
 LineChannel TakeStandardStreams();
+
+/// Ends this process as it is, whatever its threads are doing; nothing is tidied up.
+[[noreturn]] void EndThisProcess(int exitCode);

@@ -9,6 +9,7 @@
 #include <io.h>
 
 #include <array>
+#include <cstdlib>
 
 namespace {
 
@@ -160,4 +161,10 @@ LineChannel TakeStandardStreams() {
     SetStdHandle(STD_INPUT_HANDLE, reinterpret_cast<HANDLE>(_get_osfhandle(_fileno(stdin))));
     SetStdHandle(STD_OUTPUT_HANDLE, reinterpret_cast<HANDLE>(_get_osfhandle(_fileno(stdout))));
     return {_fdopen(in, "rb"), _fdopen(out, "wb")};
+}
+
+void EndThisProcess(int exitCode) {
+    // ExitProcess, which _Exit calls, may wait for ever for a lock of a thread that it has ended.
+    TerminateProcess(GetCurrentProcess(), static_cast<UINT>(exitCode));
+    std::abort(); // never reached
 }

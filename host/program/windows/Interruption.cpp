@@ -1,5 +1,7 @@
 #include "host/program/system/Interruption.h"
 
+#include "host/program/system/ChildProcess.h"
+
 #include <windows.h>
 
 #include <atomic>
@@ -32,7 +34,7 @@ BOOL WINAPI OnRequest(DWORD kind) {
     if (!IsKey(kind))
         return AwaitForce();
     if (again)
-        return FALSE; // the system's own answer: the process ends
+        EndThisProcess(static_cast<int>(STATUS_CONTROL_C_EXIT)); // as the system says it
     WriteNote();
     return TRUE;
 }

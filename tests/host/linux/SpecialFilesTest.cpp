@@ -9,6 +9,8 @@ namespace fs = std::filesystem;
 
 namespace {
 
+using namespace std::string_literals;
+
 class SpecialFilesTest : public ScreenTest {};
 
 TEST_F(SpecialFilesTest, AreToldByTheirKind) {
@@ -22,6 +24,37 @@ TEST_F(SpecialFilesTest, AreToldByTheirKind) {
         fs::permissions(m_folder.Write("secret.doc", "x"), fs::perms::none);
         ExpectRefused(m_folder / "secret.doc", -1002, "cannot be read");
     }
+}
+
+TEST_F(SpecialFilesTest, ThatAreNamedOutOfTheOrdinaryAreShownOnOneLine) {
+    ExpectShown("\"quotes\".doc", "\"quotes\".doc");
+    ExpectShown("two\nlines\t.doc", "two\\nlines\\t.doc");
+    ExpectShown("\x1b[31mred.doc", "\\x1b[31mred.doc");
+    ExpectShown(std::string(250, 'l') + ".doc", std::string(250, 'l') + ".doc");
+    ExpectRefused(m_folder / std::string(300, 'n').append(".doc"), -1002, "too long");
+}
+
+TEST_F(SpecialFilesTest, ThatAreNotNamedByTextAreRefusedAndNotLost) {
+    for (const char* name : {"br\xFC"
+                             "cke.doc",
+                             "half\xED\xA0\x80.doc", "over\xC0\xAF.doc"}) {
+        const fs::path path = m_folder.Write(name, "script");
+        ExpectRefused(path, -1005, "not valid UTF-8");
+        std::string hex;
+        for (const char byte : path.string())
+            hex += "0123456789abcdef"s[static_cast<unsigned char>(byte) >> 4U],
+                hex += "0123456789abcdef"s[static_cast<unsigned char>(byte) & 15U];
+        EXPECT_EQ(Screen(path, 1)["inputBytes"], hex);
+    }
+    const RunResult run = RunQuillon({"screen", (m_folder / "br\xFC"
+                                                            "cke.doc")
+                                                    .string()});
+    EXPECT_NE(run.out.find("/br\\xfccke.doc: refused"), std::string::npos) << run.out;
+    const RunResult into = RunQuillon({"convert", m_folder.Write("a.doc", "script").string(),
+                                       "--out", (m_folder / "\xE4").string()});
+    EXPECT_EQ(into.exitCode, 3);
+    EXPECT_NE(into.err.find("UTF-8"), std::string::npos) << into.err;
+    EXPECT_FALSE(fs::exists(m_folder / "\xE4"));
 }
 
 } // namespace

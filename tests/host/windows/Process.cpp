@@ -1,5 +1,7 @@
 #include "tests/host/Process.h"
 
+#include "tests/support/Wine.h"
+
 #include <windows.h>
 // After it, which it takes for granted.
 #include <wx/string.h>
@@ -39,6 +41,22 @@ BOOL Start(std::wstring commandLine, STARTUPINFOW& startup, PROCESS_INFORMATION&
                           nullptr, nullptr, &startup, &process);
 }
 
+BOOL WINAPI NotMeant(DWORD /*event*/) {
+    return TRUE;
+}
+
+/// Sends an event to the process, and to whatever shares its console.
+void Send(DWORD event, std::intptr_t process) {
+    // Not the switch that ignores Ctrl-C, which processes started from here would inherit.
+    static const BOOL isSafe = SetConsoleCtrlHandler(NotMeant, TRUE);
+    ASSERT_TRUE(isSafe);
+    FreeConsole();
+    ASSERT_TRUE(AttachConsole(GetProcessId(HandleOf(process)))) << "error " << GetLastError();
+    EXPECT_TRUE(GenerateConsoleCtrlEvent(event, 0)) << "error " << GetLastError();
+    FreeConsole();
+    AttachConsole(ATTACH_PARENT_PROCESS);
+}
+
 } // namespace
 
 Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
@@ -73,16 +91,11 @@ Process::~Process() {
 }
 
 void Process::Interrupt() const {
-    FreeConsole();
-    ASSERT_TRUE(AttachConsole(GetProcessId(HandleOf(m_process)))) << "error " << GetLastError();
-    SetConsoleCtrlHandler(nullptr, TRUE); // this process is not meant
-    EXPECT_TRUE(GenerateConsoleCtrlEvent(CTRL_C_EVENT, 0)) << "error " << GetLastError();
-    FreeConsole();
-    AttachConsole(ATTACH_PARENT_PROCESS);
+    Send(CTRL_C_EVENT, m_process);
 }
 
 void Process::Terminate() const {
-    Interrupt();
+    Send(RunsOnWine() ? CTRL_C_EVENT : CTRL_BREAK_EVENT, m_process); // Wine lacks the other
 }
 
 int Process::Wait() {

@@ -1,0 +1,21 @@
+#pragma once
+
+/// What the tests have to know of the system that the program runs on.
+namespace System {
+
+#ifdef _WIN32
+/// Whether documents are converted side by side: not where all of a user's processes share one
+/// registry.
+constexpr bool ConvertsSideBySide = false;
+constexpr char ModuleSuffix[] = ".dll";
+/// What is said to install where Office, Word or Excel is missing.
+constexpr char OfficeAdvice[] = "Install Microsoft Office";
+constexpr char ExcelAdvice[] = "Install Microsoft Excel";
+#else
+constexpr bool ConvertsSideBySide = true;
+constexpr char ModuleSuffix[] = ".so";
+constexpr char OfficeAdvice[] = "apt-get install libreoffice-writer-nogui";
+constexpr char ExcelAdvice[] = "libreoffice-calc-nogui";
+#endif
+
+} // namespace System
