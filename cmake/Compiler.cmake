@@ -16,6 +16,8 @@ if(QUILLON_SANITIZE)
     add_compile_options(-fsanitize=${QUILLON_SANITIZE} -fno-omit-frame-pointer
                         -fno-sanitize-recover=all)
     add_link_options(-fsanitize=${QUILLON_SANITIZE})
+    target_sources(project_options INTERFACE
+        $<$<STREQUAL:$<TARGET_PROPERTY:TYPE>,EXECUTABLE>:${PROJECT_SOURCE_DIR}/cmake/LeakSanitizer.cpp>)
 endif()
 
 find_program(CCACHE ccache)

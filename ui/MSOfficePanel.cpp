@@ -46,7 +46,7 @@ void MSOfficePanel::SetPrinters(const wxArrayString& printers) {
 
 bool MSOfficePanel::SetupControls() {
     OutputFileTypePanelMSO::SetupControls();
-    wxDynamicCast(FindWindow(ControlId::Printer), wxChoice)->Append(m_printers);
+    dynamic_cast<wxChoice*>(FindWindow(ControlId::Printer))->Append(m_printers);
 
     const auto bind = [this](int id, auto* member) {
         FindWindow(id)->SetValidator(wxGenericValidator(member));
@@ -114,7 +114,7 @@ void MSOfficePanel::EnableHandouts(bool enable) {
 }
 
 wxString MSOfficePanel::Selected(int choice) const {
-    return wxDynamicCast(FindWindow(choice), wxChoice)->GetStringSelection();
+    return dynamic_cast<wxChoice*>(FindWindow(choice))->GetStringSelection();
 }
 
 void MSOfficePanel::OnHorizontalOrder(wxCommandEvent& event) {

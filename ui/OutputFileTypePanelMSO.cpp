@@ -44,7 +44,7 @@ void OutputFileTypePanelMSO::SetDistillerProfiles(const wxArrayString& profiles)
 bool OutputFileTypePanelMSO::SetupControls() {
     FindWindow(ControlId::OutputPS)->SetValidator(wxGenericValidator(&m_outputPS));
     FindWindow(ControlId::OutputPDF)->SetValidator(wxGenericValidator(&m_outputPDF));
-    auto* profile = wxDynamicCast(FindWindow(ControlId::DistillerProfile), wxChoice);
+    auto* profile = dynamic_cast<wxChoice*>(FindWindow(ControlId::DistillerProfile));
     profile->Append(m_distillerProfiles);
     profile->SetValidator(wxGenericValidator(&m_selectedProfile));
     return true;
@@ -74,7 +74,7 @@ bool OutputFileTypePanelMSO::WriteSettings(SettingsMap& settings) {
     WriteFlag(settings, "OUTPUTFILETYPEPDF", m_outputPDF);
     if (!m_outputPDF)
         return true;
-    const auto* profile = wxDynamicCast(FindWindow(ControlId::DistillerProfile), wxChoice);
+    const auto* profile = dynamic_cast<const wxChoice*>(FindWindow(ControlId::DistillerProfile));
     // The entries are the profiles, in their order. Without a selection the profile stored before
     // is one that is not installed now; it stays.
     const int selected = profile->GetCurrentSelection();

@@ -49,7 +49,7 @@ void GiveRoom(wxWindow* panel) {
     std::map<int, int> widths; // by column
     int height = 0;
     for (const auto& [id, column] : Choices) {
-        const auto* choice = wxDynamicCast(panel->FindWindow(id), wxChoice);
+        const auto* choice = dynamic_cast<const wxChoice*>(panel->FindWindow(id));
         widths[column] = std::max(widths[column], WidthFor(choice));
         height = std::max(height, choice->GetBestSize().y);
     }

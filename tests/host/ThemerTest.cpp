@@ -6,12 +6,6 @@
 
 #include <cmath>
 
-/// Read by LeakSanitizer: fontconfig keeps what it has learnt of fonts to the process's end.
-extern "C" const char* __lsan_default_suppressions();
-extern "C" const char* __lsan_default_suppressions() {
-    return "leak:libfontconfig";
-}
-
 namespace {
 
 /// The relative luminance of the Web Content Accessibility Guidelines.

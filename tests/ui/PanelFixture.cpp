@@ -70,13 +70,13 @@ wxWindow* PanelFixture::Find(int id) const {
 }
 
 wxChoice* PanelFixture::Choice(int id) const {
-    return wxDynamicCast(Find(id), wxChoice);
+    return dynamic_cast<wxChoice*>(Find(id));
 }
 
 bool PanelFixture::IsTicked(int id) const {
-    if (const auto* box = wxDynamicCast(Find(id), wxCheckBox))
+    if (const auto* box = dynamic_cast<const wxCheckBox*>(Find(id)))
         return box->GetValue();
-    return wxDynamicCast(Find(id), wxRadioButton)->GetValue();
+    return dynamic_cast<wxRadioButton*>(Find(id))->GetValue();
 }
 
 std::string PanelFixture::Selection(int id) const {
@@ -100,7 +100,7 @@ void PanelFixture::Choose(int id, const char* entry) {
 }
 
 void PanelFixture::Tick(int id, bool ticked) {
-    auto* box = wxDynamicCast(Find(id), wxCheckBox);
+    auto* box = dynamic_cast<wxCheckBox*>(Find(id));
     box->SetValue(ticked);
     wxCommandEvent event(wxEVT_CHECKBOX, id);
     event.SetEventObject(box);
@@ -109,7 +109,7 @@ void PanelFixture::Tick(int id, bool ticked) {
 }
 
 void PanelFixture::Press(int id) {
-    auto* button = wxDynamicCast(Find(id), wxRadioButton);
+    auto* button = dynamic_cast<wxRadioButton*>(Find(id));
     button->SetValue(true);
     wxCommandEvent event(wxEVT_RADIOBUTTON, id);
     event.SetEventObject(button);

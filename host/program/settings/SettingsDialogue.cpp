@@ -94,7 +94,7 @@ void SettingsDialogue::OnSave(wxCommandEvent& /*event*/) {
 void SettingsDialogue::OnKey(wxKeyEvent& event) {
     const bool isReturn =
         event.GetKeyCode() == WXK_RETURN || event.GetKeyCode() == WXK_NUMPAD_ENTER;
-    if (!isReturn || event.HasAnyModifiers() || wxDynamicCast(FindFocus(), wxButton))
+    if (!isReturn || event.HasAnyModifiers() || dynamic_cast<const wxButton*>(FindFocus()))
         return event.Skip();
     wxCommandEvent save(wxEVT_BUTTON, ButtonId::Save);
     OnSave(save);

@@ -20,7 +20,7 @@ protected:
         Open([this] {
             Add(m_window->GetTitle());
             ForEachBelow(m_window, [this](wxWindow* each) {
-                const auto* choice = wxDynamicCast(each, wxChoice);
+                const auto* choice = dynamic_cast<const wxChoice*>(each);
                 const bool holdsNames = each->GetId() == ControlId::Printer ||
                                         each->GetId() == ControlId::DistillerProfile ||
                                         each->GetId() == ControlId::InputTypes;
@@ -29,7 +29,7 @@ protected:
                 if (choice)
                     for (const wxString& entry : choice->GetStrings())
                         Add(entry);
-                else if (wxDynamicCast(each, wxControl))
+                else if (dynamic_cast<const wxControl*>(each))
                     Add(each->GetLabel());
             });
         });

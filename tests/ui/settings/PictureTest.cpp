@@ -52,8 +52,8 @@ protected:
 };
 
 bool HasText(const wxWindow* window) {
-    return wxDynamicCast(window, wxStaticText) || wxDynamicCast(window, wxCheckBox) ||
-           wxDynamicCast(window, wxRadioButton) || wxDynamicCast(window, wxButton);
+    return dynamic_cast<const wxStaticText*>(window) || dynamic_cast<const wxCheckBox*>(window) ||
+           dynamic_cast<const wxRadioButton*>(window) || dynamic_cast<const wxButton*>(window);
 }
 
 /// Nothing is cut off: each control is as large as it needs to be, and inside its parent.
@@ -63,7 +63,7 @@ void ExpectWhole(wxWindow* window) {
         const wxSize needed = window->GetBestSize();
         EXPECT_TRUE(needed.x <= size.x && needed.y <= size.y) << window->GetLabel();
     }
-    if (const auto* choice = wxDynamicCast(window, wxChoice)) {
+    if (const auto* choice = dynamic_cast<const wxChoice*>(window)) {
         for (const wxString& entry : choice->GetStrings())
             EXPECT_LE(choice->GetSizeFromTextSize(choice->GetTextExtent(entry).x).x, size.x)
                 << entry;

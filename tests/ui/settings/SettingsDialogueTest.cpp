@@ -18,7 +18,7 @@ protected:
         return settings ? settings->Value(key).utf8_string() : "";
     }
 
-    bool IsTicked(int id) const { return wxDynamicCast(Find(id), wxCheckBox)->GetValue(); }
+    bool IsTicked(int id) const { return dynamic_cast<wxCheckBox*>(Find(id))->GetValue(); }
 
     /// Clicks the check box, and waits for it to follow.
     void Toggle(int id) {
@@ -50,7 +50,7 @@ TEST_F(SettingsDialogueTest, ReturnSavesWhatWasPicked) {
         EXPECT_EQ(Value(key), value) << key;
     EXPECT_EQ(Open([this] {
                   EXPECT_TRUE(IsTicked(ControlId::FrameSlides));
-                  EXPECT_EQ(wxDynamicCast(Find(ControlId::Printer), wxChoice)->GetStringSelection(),
+                  EXPECT_EQ(dynamic_cast<wxChoice*>(Find(ControlId::Printer))->GetStringSelection(),
                             "Proofer");
               }),
               wxID_NONE)
@@ -90,7 +90,7 @@ TEST_F(SettingsDialogueTest, StaysOpenWhenTheFileCannotBeWritten) {
         Click(ButtonId::Save);
         const wxWindow* fault = nullptr;
         ForEachBelow(m_window, [&fault](wxWindow* each) {
-            if (const auto* bar = wxDynamicCast(each, wxInfoBar))
+            if (const auto* bar = dynamic_cast<const wxInfoBar*>(each))
                 fault = bar;
         });
         EXPECT_TRUE(Until([fault] { return fault->IsShown(); }));
@@ -144,7 +144,8 @@ TEST_F(SettingsDialogueTest, TheTabKeyFollowsTheEye) {
         for (wxWindow* now = Focused();
              now && std::find(visited.begin(), visited.end(), now) == visited.end();
              now = Focused()) {
-            EXPECT_TRUE(wxDynamicCast(now, wxControl)) << "a stop at nothing: " << now->GetId();
+            EXPECT_TRUE(dynamic_cast<const wxControl*>(now))
+                << "a stop at nothing: " << now->GetId();
             visited.push_back(now);
             Press(WXK_TAB);
             EXPECT_TRUE(Until([&] { return Focused() && Focused() != now; })) << now->GetId();
@@ -159,8 +160,8 @@ TEST_F(SettingsDialogueTest, TheTabKeyFollowsTheEye) {
         ForEachBelow(m_window, [&visited](wxWindow* each) {
             const bool takesPart =
                 each->IsEnabled() && each->IsShownOnScreen() &&
-                (wxDynamicCast(each, wxChoice) || wxDynamicCast(each, wxCheckBox) ||
-                 wxDynamicCast(each, wxButton));
+                (dynamic_cast<const wxChoice*>(each) || dynamic_cast<const wxCheckBox*>(each) ||
+                 dynamic_cast<const wxButton*>(each));
             EXPECT_TRUE(!takesPart || std::count(visited.begin(), visited.end(), each) == 1)
                 << each->GetId();
         });

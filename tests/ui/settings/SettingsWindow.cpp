@@ -108,7 +108,7 @@ void SettingsWindow::Press(int key) {
 }
 
 void SettingsWindow::Choose(int id, const wxString& entry) {
-    auto* choice = wxDynamicCast(Find(id), wxChoice);
+    auto* choice = dynamic_cast<wxChoice*>(Find(id));
     ASSERT_TRUE(choice->SetStringSelection(entry)) << entry;
     wxCommandEvent event(wxEVT_CHOICE, id);
     event.SetEventObject(choice);
