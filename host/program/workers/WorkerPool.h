@@ -40,9 +40,9 @@ private:
         std::thread reader; ///< reads what the process says until it has ended
         std::optional<std::size_t> assignment;
         std::optional<Progress> progress;
-        bool begun = false;  ///< with the assignment
-        bool proven = false; ///< has brought a document to an end
-        bool silent = false; ///< was ended for that
+        bool begun = false;                          ///< with the assignment
+        bool proven = false;                         ///< has brought a document to an end
+        bool silent = false;                         ///< was ended for that
         std::chrono::steady_clock::time_point heard; ///< its last sign of life
     };
     /// A line from a worker, or nothing when it has ended.

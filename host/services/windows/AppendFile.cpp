@@ -13,8 +13,8 @@ HANDLE HandleOf(std::intptr_t file) {
 /// All of the line or nothing that anybody would miss: the console and pipes may take it in parts.
 void Write(HANDLE file, std::string_view line) {
     DWORD written = 0;
-    while (!line.empty() && WriteFile(file, line.data(), static_cast<DWORD>(line.size()), &written,
-                                      nullptr) &&
+    while (!line.empty() &&
+           WriteFile(file, line.data(), static_cast<DWORD>(line.size()), &written, nullptr) &&
            written > 0)
         line.remove_prefix(written);
 }

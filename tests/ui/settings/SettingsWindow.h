@@ -30,7 +30,7 @@ protected:
 
     wxWindow* Find(int id) const;
     wxRect Place(const wxWindow* window) const; ///< on the screen
-    wxWindow* Focused() const; ///< the control that keys go to, or null
+    wxWindow* Focused() const;                  ///< the control that keys go to, or null
     void Click(int id);
     void Press(int key);
     /// Picks an entry; the box itself is the toolkit's.
