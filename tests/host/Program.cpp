@@ -3,6 +3,7 @@
 #include "tests/host/System.h"
 
 #include <windows.h>
+#include <winspool.h>
 // After it, which it takes for granted.
 #include <objbase.h>
 
@@ -18,13 +19,23 @@ namespace fs = std::filesystem;
 
 namespace {
 
-/// Leaves the machine to the next program as it was.
-class StandInRegistration : public testing::Environment {
-    void TearDown() override { UnregisterStandIn(); }
+/// Leaves the machine to the next program as it was, where it outlives this one.
+class CleanMachine : public testing::Environment {
+    void TearDown() override {
+        UnregisterStandIn();
+        wchar_t name[] = L"Quillon PostScript File Printer"; // its driver's too
+        PRINTER_DEFAULTSW access = {nullptr, nullptr, PRINTER_ALL_ACCESS};
+        HANDLE printer = nullptr;
+        if (!OpenPrinterW(name, &printer, &access))
+            return;
+        EXPECT_TRUE(DeletePrinter(printer));
+        ClosePrinter(printer);
+        DeletePrinterDriverW(nullptr, nullptr, name);
+    }
 };
 
-[[maybe_unused]] testing::Environment* const g_registration =
-    testing::AddGlobalTestEnvironment(new StandInRegistration);
+[[maybe_unused]] testing::Environment* const g_cleanMachine =
+    testing::AddGlobalTestEnvironment(new CleanMachine);
 
 } // namespace
 

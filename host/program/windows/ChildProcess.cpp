@@ -100,8 +100,10 @@ HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
     startup.lpAttributeList = inherited.List();
     std::wstring line = CommandLineFor(arguments).ToStdWstring();
     PROCESS_INFORMATION process = {};
-    if (!CreateProcessW(nullptr, line.data(), nullptr, nullptr, TRUE, EXTENDED_STARTUPINFO_PRESENT,
-                        nullptr, nullptr, &startup.StartupInfo, &process))
+    // A group of its own begins without Ctrl-C: it must not end before it knows what that means.
+    constexpr DWORD Flags = EXTENDED_STARTUPINFO_PRESENT | CREATE_NEW_PROCESS_GROUP;
+    if (!CreateProcessW(nullptr, line.data(), nullptr, nullptr, TRUE, Flags, nullptr, nullptr,
+                        &startup.StartupInfo, &process))
         return nullptr;
     CloseHandle(process.hThread);
     return process.hProcess;
