@@ -24,9 +24,14 @@ void PutFrontBack(const std::filesystem::path& path) {
     file << "\x1b%-12345X@PJL\r\n%!PS-Adobe-3.0\n";
 }
 
+// Both begin with a run that does not count: on a virtual machine the first touch of memory is the
+// slowest thing there is, and says nothing about either.
+
 void RepairOneGiB(benchmark::State& state) {
     const TemporaryFolder folder;
     const auto path = WriteLargeFile(folder);
+    RepairPSHeader(path.wstring());
+    PutFrontBack(path);
     for (auto step : state) {
         (void)step;
         if (RepairPSHeader(path.wstring()) != PSRepair::Done)
@@ -42,6 +47,8 @@ BENCHMARK(RepairOneGiB)->Iterations(5)->Unit(benchmark::kMillisecond)->UseRealTi
 void CopyOneGiB(benchmark::State& state) {
     const TemporaryFolder folder;
     const auto path = WriteLargeFile(folder);
+    std::filesystem::copy_file(path, folder / "copy.ps");
+    std::filesystem::remove(folder / "copy.ps");
     for (auto step : state) {
         (void)step;
         std::filesystem::copy_file(path, folder / "copy.ps");
