@@ -7,6 +7,7 @@
 
 #include <memory>
 #include <new>
+#include <type_traits>
 
 namespace {
 
@@ -22,12 +23,15 @@ bool IsRepresentableInUtf8(const wxString& text) {
         return unit >= FirstLowSurrogate && unit <= LastSurrogate;
     };
 
-    const std::wstring units = text.ToStdWstring();
+    const std::wstring& units = text.ToStdWstring();
+    const auto unitAt = [&units](std::size_t index) {
+        return wxUint32{static_cast<std::make_unsigned_t<wchar_t>>(units[index])};
+    };
     for (std::size_t i = 0; i < units.size(); ++i) {
-        const auto unit = static_cast<wxUint32>(units[i]);
+        const wxUint32 unit = unitAt(i);
         const bool isPair = sizeof(wchar_t) == 2 && unit >= FirstSurrogate &&
                             unit < FirstLowSurrogate && i + 1 < units.size() &&
-                            isLow(static_cast<wxUint32>(units[i + 1]));
+                            isLow(unitAt(i + 1));
         if (isPair)
             ++i;
         else if (unit > LastCharacter || (unit >= FirstSurrogate && unit <= LastSurrogate))
