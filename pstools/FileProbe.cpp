@@ -2,7 +2,8 @@
 
 #include <sys/stat.h>
 #include <sys/types.h>
-#include <wchar.h>
+
+#include <cwchar>
 
 void QueryFileSize(const wxString& path, std::uint64_t& size) {
     struct __stat64 status;

@@ -5,8 +5,7 @@
 #include <windows.h>
 #include <winspool.h>
 
-#include <wchar.h>
-
+#include <cwchar>
 #include <vector>
 
 namespace {
