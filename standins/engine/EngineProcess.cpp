@@ -28,6 +28,7 @@ void DefaultSignals() {
 bool TakeDescriptors(const std::vector<int>& descriptors) {
     const int count = static_cast<int>(descriptors.size());
     std::vector<int> copies; // out of the way of the numbers that are to be taken
+    copies.reserve(descriptors.size());
     for (const int descriptor : descriptors)
         copies.push_back(fcntl(descriptor, F_DUPFD_CLOEXEC, count));
     for (int number = 0; number < count; ++number) {
