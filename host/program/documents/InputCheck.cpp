@@ -87,7 +87,8 @@ wxString DescribeInvalid(const fs::path& file) {
     if (BeginsWith(beginning, Zip) && extension == "pub")
         return "it is a ZIP package, not a publication";
     if (BeginsWith(beginning, Zip))
-        return openXml ? "it is damaged, or no ." + extension + " document inside"
+        return openXml ? "its application could not open it: it is damaged, or no ." + extension +
+                             " document; the log says more"
                        : wxString::Format("it is a ZIP package: probably a .%sx renamed to .%s",
                                           extension, extension);
     if (BeginsWith(beginning, CompoundFile))
