@@ -21,7 +21,7 @@ TemporaryFolder::~TemporaryFolder() {
 }
 
 fs::path TemporaryFolder::Write(const fs::path& name, std::string_view bytes) const {
-    const fs::path path = m_path / name;
+    fs::path path = m_path / name;
     std::ofstream file(path, std::ios::binary);
     file.write(bytes.data(), static_cast<std::streamsize>(bytes.size()));
     file.close();
