@@ -47,19 +47,7 @@ void OfficeTest::SetLimit(const wchar_t* name, unsigned seconds) {
 }
 
 std::string OfficeTest::Leftovers() const {
-    std::string found;
-    for (const fs::directory_entry& entry : fs::directory_iterator(m_temporary.Path())) {
-        const bool isOfTheTest = entry.path().filename().string().rfind("quillon-test-", 0) == 0;
-        if (!isOfTheTest)
-            found += "file " + entry.path().string() + "\n";
-    }
-    for (const fs::directory_entry& entry : fs::recursive_directory_iterator(m_files.Path())) {
-        if (entry.path().filename().string().rfind(".quillon-", 0) == 0)
-            found += "file " + entry.path().string() + "\n";
-    }
-    for (const pid_t process : ProcessesOf(m_temporary.Path()))
-        found += "process " + std::to_string(process) + "\n";
-    return found + NewSockets();
+    return LeftoversOf(m_temporary.Path(), m_files.Path()) + NewSockets();
 }
 
 bool IsLibreOfficeInstalled() {

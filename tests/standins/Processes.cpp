@@ -61,6 +61,24 @@ std::vector<pid_t> ProcessesOf(const fs::path& temporary) {
     return found;
 }
 
+std::string LeftoversOf(const fs::path& temporary, const fs::path& files) {
+    const auto begins = [](const fs::directory_entry& entry, const char* with) {
+        return entry.path().filename().string().rfind(with, 0) == 0;
+    };
+    std::string found;
+    for (const fs::directory_entry& entry : fs::directory_iterator(temporary)) {
+        if (!begins(entry, "quillon-test-")) // that is the test's own
+            found += "file " + entry.path().string() + "\n";
+    }
+    for (const fs::directory_entry& entry : fs::recursive_directory_iterator(files)) {
+        if (begins(entry, ".quillon-"))
+            found += "file " + entry.path().string() + "\n";
+    }
+    for (const pid_t process : ProcessesOf(temporary))
+        found += "process " + std::to_string(process) + "\n";
+    return found;
+}
+
 pid_t AwaitEngine(const fs::path& temporary) {
     pid_t engine = 0;
     Await([&] { return (engine = Find(temporary, IsEngine)) != 0; });

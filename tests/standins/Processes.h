@@ -13,6 +13,11 @@
 /// by their home folder, and supervisors, by their command line.
 std::vector<pid_t> ProcessesOf(const std::filesystem::path& temporary);
 
+/// What runs have left: work folders and processes in the folder for temporary files, unfinished
+/// output among the files.
+/// @return a line for each; empty when all is clean
+std::string LeftoversOf(const std::filesystem::path& temporary, const std::filesystem::path& files);
+
 /// Waits for an engine at work there.
 /// @return 0 when none comes up
 pid_t AwaitEngine(const std::filesystem::path& temporary);

@@ -111,18 +111,7 @@ void BridgeTest::SetLimit(const wchar_t* name, unsigned seconds) {
 }
 
 std::string BridgeTest::Leftovers() const {
-    std::string found;
-    for (const fs::directory_entry& entry : fs::directory_iterator(m_temporary.Path())) {
-        if (entry.path().filename().string().rfind("quillon-test-", 0) != 0)
-            found += "file " + entry.path().string() + "\n";
-    }
-    for (const fs::directory_entry& entry : fs::recursive_directory_iterator(m_files.Path())) {
-        if (entry.path().filename().string().rfind(".quillon-", 0) == 0)
-            found += "file " + entry.path().string() + "\n";
-    }
-    for (const pid_t process : ProcessesOf(m_temporary.Path()))
-        found += "process " + std::to_string(process) + "\n";
-    return found;
+    return LeftoversOf(m_temporary.Path(), m_files.Path());
 }
 
 std::set<std::string> BridgeTest::Names() const {
