@@ -32,6 +32,7 @@ public:
 
 private:
     explicit Workplace(std::filesystem::path path);
+    bool IsMarked() const;
 
     std::filesystem::path m_path; ///< empty after a move
     std::shared_ptr<void> m_mark; ///< a file that is open as long as the workplace is in use
