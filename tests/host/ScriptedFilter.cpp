@@ -4,6 +4,7 @@
 
 #include "common/WQServices.h"
 #include "plugin/WQPlugin.h"
+#include "tests/host/System.h"
 
 #include <windows.h>
 
@@ -14,7 +15,6 @@
 #include <wx/utils.h>
 #include <wx/xml/xml.h>
 
-#include <csignal>
 #include <cstdlib>
 #include <map>
 
@@ -113,10 +113,8 @@ public:
             wxMilliSleep(5);
         if (!script["crash"].empty())
             std::abort();
-#ifdef SIGSTOP
         if (!script["stop"].empty())
-            std::raise(SIGSTOP);
-#endif
+            System::StopThisProcess();
         if (script["output"] != "none")
             wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_told);
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
@@ -125,9 +123,7 @@ public:
         return Number(script, "convert");
     }
 
-    bool IsReady() override {
-        return wxRegKey(wxRegKey::HKCR, "Word.Application").Exists();
-    }
+    bool IsReady() override { return wxRegKey(wxRegKey::HKCR, "Word.Application").Exists(); }
 
 private:
     static std::unique_ptr<JobItem> ItemFor(const wxString& path) {

@@ -18,4 +18,7 @@ constexpr char OfficeAdvice[] = "apt-get install libreoffice-writer-nogui";
 constexpr char ExcelAdvice[] = "libreoffice-calc-nogui";
 #endif
 
+/// Has this process do nothing any more, as one that hangs for good.
+void StopThisProcess();
+
 } // namespace System

@@ -5,6 +5,7 @@
 
 #include <fcntl.h>
 #include <spawn.h>
+#include <sys/prctl.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
@@ -131,6 +132,8 @@ wxString ChildProcess::Wait() {
 }
 
 LineChannel TakeStandardStreams() {
+    // A process that is stopped would not see its channel closed.
+    prctl(PR_SET_PDEATHSIG, SIGKILL);
     const int in = fcntl(STDIN_FILENO, F_DUPFD_CLOEXEC, 3);
     const int out = fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, 3);
     const int nothing = open("/dev/null", O_RDONLY | O_CLOEXEC);

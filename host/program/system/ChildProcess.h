@@ -10,7 +10,7 @@
 #include <vector>
 
 /// Another process of this program, which is talked to by its stdin and stdout. It shares this
-/// one's stderr.
+/// one's stderr, and does not outlive this one.
 class ChildProcess {
 public:
     /// @param arguments UTF-8, without the program's name

@@ -85,6 +85,18 @@ private:
     bool m_ready = false;
 };
 
+/// What is in it ends with this process, however that ends. It has it for as long as it lives.
+HANDLE Job() {
+    static const HANDLE s_job = [] {
+        HANDLE job = CreateJobObjectW(nullptr, nullptr);
+        JOBOBJECT_EXTENDED_LIMIT_INFORMATION limits = {};
+        limits.BasicLimitInformation.LimitFlags = JOB_OBJECT_LIMIT_KILL_ON_JOB_CLOSE;
+        SetInformationJobObject(job, JobObjectExtendedLimitInformation, &limits, sizeof limits);
+        return job;
+    }();
+    return s_job;
+}
+
 /// @return the process's handle, or null
 HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
     HANDLE err = GetStdHandle(STD_ERROR_HANDLE);
@@ -101,10 +113,14 @@ HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
     std::wstring line = CommandLineFor(arguments).ToStdWstring();
     PROCESS_INFORMATION process = {};
     // A group of its own begins without Ctrl-C: it must not end before it knows what that means.
-    constexpr DWORD Flags = EXTENDED_STARTUPINFO_PRESENT | CREATE_NEW_PROCESS_GROUP;
+    // It is in the job before it does anything.
+    constexpr DWORD Flags =
+        EXTENDED_STARTUPINFO_PRESENT | CREATE_NEW_PROCESS_GROUP | CREATE_SUSPENDED;
     if (!CreateProcessW(nullptr, line.data(), nullptr, nullptr, TRUE, Flags, nullptr, nullptr,
                         &startup.StartupInfo, &process))
         return nullptr;
+    AssignProcessToJobObject(Job(), process.hProcess);
+    ResumeThread(process.hThread);
     CloseHandle(process.hThread);
     return process.hProcess;
 }

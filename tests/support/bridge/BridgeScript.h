@@ -7,6 +7,9 @@
 /// Below HKEY_CURRENT_USER; the values are BridgeScript's to write and read.
 constexpr wchar_t BridgeScriptKey[] = L"Software\\Scripted Bridge";
 
+/// A number there; unless it is 0 the bridge makes a file.
+constexpr wchar_t MakesPdfValue[] = L"MakesPdf";
+
 /// Tells the scripted bridge what to answer, and what it was asked. Puts the bridge into a folder
 /// of filters of its own, which the filter finds by the installation's registry key.
 class BridgeScript {

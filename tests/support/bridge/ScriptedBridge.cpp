@@ -6,7 +6,8 @@
 
 #include <objbase.h>
 
-#include <cstdio>
+#include <filesystem>
+#include <fstream>
 #include <stdexcept>
 
 #ifdef _WIN32
@@ -37,6 +38,13 @@ void Write(HKEY key, const wchar_t* name, const char16_t* text) {
     RegSetValueExW(key, name, 0, REG_SZ, reinterpret_cast<const BYTE*>(text), (units + 1) * 2);
 }
 
+/// Something that a test knows again as made of the PostScript file.
+void MakePdf(const DistillerRequest& request) {
+    const std::ifstream source(std::filesystem::path(request.psPath), std::ios::binary);
+    std::ofstream(std::filesystem::path(request.pdfPath), std::ios::binary)
+        << "%PDF-1.4\n%" << source.rdbuf();
+}
+
 bool IsComInitialised() {
     const CLSID unknown{0x11111111, 0x2222, 0x3333, {4, 4, 4, 4, 4, 4, 4, 4}};
     void* object = nullptr;
@@ -56,6 +64,8 @@ EXPORT std::int32_t DIST_convertFile(const DistillerRequest* request) {
     Write(key, L"Profile", request->profile);
     Write(key, L"HasReserved", request->reserved1 != 0 || request->reserved2 != 0 ? 1 : 0);
     Write(key, L"HasCom", IsComInitialised() ? 1 : 0);
+    if (Read(key, MakesPdfValue))
+        MakePdf(*request);
     const DWORD throws = Read(key, L"Throws");
     const auto result = static_cast<std::int32_t>(Read(key, L"Result"));
     RegCloseKey(key);
