@@ -27,7 +27,7 @@ CWndDCPluginNamePanel::CWndDCPluginNamePanel(wxWindow* parent, int id)
     : wxPanel(parent, id, wxDefaultPosition, wxSize(wxDefaultCoord, StripHeight),
               wxTAB_TRAVERSAL | wxBORDER_NONE) {
     SetBackgroundColour(HeaderTheme().backgroundColour);
-    SetCanFocus(false); // the Tab key passes it by
+    m_container.DisableSelfFocus(); // the Tab key passes it by
 }
 
 void CWndDCPluginNamePanel::SetPluginName(wxString name) {

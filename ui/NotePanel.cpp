@@ -13,12 +13,20 @@ namespace {
 constexpr int WrapWidth = 360;
 constexpr int LeastHeight = 30;
 
+/// The Tab key passes it by.
+class NotePanel : public wxPanel {
+public:
+    explicit NotePanel(wxWindow* parent)
+        : wxPanel(parent, ControlId::NotePanel, wxDefaultPosition, wxDefaultSize, 0, "NotePanel") {
+        m_container.DisableSelfFocus();
+    }
+};
+
 } // namespace
 
 wxPanel* CreateNotePanel(wxWindow* parent, const wxString& message) {
     const Theme& theme = Themer::GetThemeService()->GetTheme("Note");
-    auto* panel =
-        new wxPanel(parent, ControlId::NotePanel, wxDefaultPosition, wxDefaultSize, 0, "NotePanel");
+    auto* panel = new NotePanel(parent);
     panel->SetBackgroundColour(theme.backgroundColour);
 
     wxStaticText* heading = NewLabel(panel, wxID_ANY, "Note:");
@@ -32,6 +40,5 @@ wxPanel* CreateNotePanel(wxWindow* parent, const wxString& message) {
     row->Add(0, LeastHeight, 0, wxALIGN_CENTER | wxALL, 0);
     panel->SetSizer(row);
     row->SetSizeHints(panel);
-    panel->SetCanFocus(false); // only now: each child has a panel think it over
     return panel;
 }

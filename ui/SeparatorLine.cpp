@@ -15,7 +15,7 @@ SeparatorLine::SeparatorLine(wxWindow* parent, int id)
     : wxPanel(parent, id, wxDefaultPosition, wxSize(wxDefaultCoord, Height),
               wxTAB_TRAVERSAL | wxBORDER_NONE) {
     SetBackgroundColour(Themer::GetThemeService()->GetTheme("Default").borderColour);
-    SetCanFocus(false);
+    m_container.DisableSelfFocus();
 }
 
 void SeparatorLine::DoSetSize(int x, int y, int width, int height, int flags) {

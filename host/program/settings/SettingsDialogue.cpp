@@ -18,6 +18,16 @@ constexpr int ScrollStep = 10; // all sizes in device-independent pixels
 constexpr int Margin = 10;
 constexpr int ScreenMargin = 80; // room for the window's frame and the desktop's bars
 
+/// Scrolls; only what is in it has a use for keys.
+class ScrolledArea : public wxScrolledWindow {
+public:
+    explicit ScrolledArea(wxWindow* parent)
+        : wxScrolledWindow(parent, wxID_ANY, wxDefaultPosition, wxDefaultSize,
+                           wxTAB_TRAVERSAL | wxBORDER_NONE) {
+        m_container.DisableSelfFocus();
+    }
+};
+
 } // namespace
 
 SettingsDialogue::SettingsDialogue(const FilterSet& filters, const Settings& settings,
@@ -26,7 +36,7 @@ SettingsDialogue::SettingsDialogue(const FilterSet& filters, const Settings& set
                wxDEFAULT_DIALOG_STYLE | wxRESIZE_BORDER),
       m_filters(filters), m_file(file) {
     m_fault = new wxInfoBar(this);
-    m_fault->AddButton(ButtonId::Understood, "OK");
+    m_fault->AddButton(ButtonId::Understood, _("OK"));
     auto* const top = new wxBoxSizer(wxVERTICAL);
     top->Add(NewPanels(settings), 1, wxEXPAND);
     top->Add(m_fault, 0, wxEXPAND);
@@ -40,8 +50,7 @@ SettingsDialogue::SettingsDialogue(const FilterSet& filters, const Settings& set
 
 /// As large as the panels together, or as the screen allows.
 wxScrolledWindow* SettingsDialogue::NewPanels(const Settings& settings) {
-    auto* const area = new wxScrolledWindow(this, wxID_ANY, wxDefaultPosition, wxDefaultSize,
-                                            wxTAB_TRAVERSAL | wxBORDER_NONE);
+    auto* const area = new ScrolledArea(this);
     area->SetBackgroundColour(Themer::GetThemeService()->GetTheme("Default").backgroundColour);
     auto* const panels = new wxBoxSizer(wxVERTICAL);
     for (const auto& filter : m_filters.Filters())
@@ -50,7 +59,6 @@ wxScrolledWindow* SettingsDialogue::NewPanels(const Settings& settings) {
             m_hasPanel = true;
         }
     area->SetSizer(panels);
-    area->SetCanFocus(false); // only what is in it has a use for keys
     const int step = FromDIP(ScrollStep);
     area->SetScrollRate(step, step);
     const wxSize wanted = panels->ComputeFittingClientSize(area);

@@ -20,14 +20,14 @@ protected:
 
     bool IsTicked(int id) const { return dynamic_cast<wxCheckBox*>(Find(id))->GetValue(); }
 
-    /// Clicks the check box, and waits for it to follow.
+    /// Activates the check box, and waits for it to follow.
     void Toggle(int id) {
         const bool ticked = IsTicked(id);
-        Click(id);
+        Activate(id);
         EXPECT_TRUE(Until([&] { return IsTicked(id) != ticked; })) << id;
     }
 
-    bool HasClosed() const { return !m_window->IsModal(); }
+    bool HasClosed() const { return !m_window->IsShown(); }
 };
 
 TEST_F(SettingsDialogueTest, ReturnSavesWhatWasPicked) {
@@ -61,7 +61,7 @@ TEST_F(SettingsDialogueTest, LeavesTheFileAloneUnlessItIsToldToSave) {
     const std::string before = "<a><UI><FRAMESLIDES>0</FRAMESLIDES></UI></a>";
     const std::pair<const char*, std::function<void()>> ways[] = {
         {"Escape", [this] { Press(WXK_ESCAPE); }},
-        {"Cancel", [this] { Click(ButtonId::Cancel); }},
+        {"Cancel", [this] { Activate(ButtonId::Cancel); }},
         {"Return on Cancel",
          [this] {
              Find(ButtonId::Cancel)->SetFocus();
@@ -87,7 +87,7 @@ TEST_F(SettingsDialogueTest, StaysOpenWhenTheFileCannotBeWritten) {
     m_file = folder / "job.xml";
     const int end = Open([this, &folder] {
         Toggle(ControlId::FrameSlides);
-        Click(ButtonId::Save);
+        Activate(ButtonId::Save);
         const wxWindow* fault = nullptr;
         ForEachBelow(m_window, [&fault](wxWindow* each) {
             if (const auto* bar = dynamic_cast<const wxInfoBar*>(each))
@@ -100,7 +100,7 @@ TEST_F(SettingsDialogueTest, StaysOpenWhenTheFileCannotBeWritten) {
                   m_window->ScreenToClient(Place(Find(ButtonId::Save)).GetBottomRight()).y)
             << "the buttons are still there";
         std::filesystem::create_directory(folder);
-        Click(ButtonId::Save);
+        Activate(ButtonId::Save);
         EXPECT_TRUE(Until([this] { return HasClosed(); }));
     });
     EXPECT_EQ(end, wxID_SAVE);

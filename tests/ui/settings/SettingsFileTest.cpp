@@ -78,7 +78,10 @@ TEST_F(SettingsFileTest, AFileThatCannotBeReplacedStaysWhole) {
 TEST_F(SettingsFileTest, ALinkAndThePermissionsStay) {
     const fs::path target = m_folder.Write("target.xml", "<UI/>");
     fs::permissions(target, fs::perms::owner_read | fs::perms::owner_write);
-    fs::create_symlink(target, m_file);
+    std::error_code error;
+    fs::create_symlink(target, m_file, error);
+    if (error)
+        GTEST_SKIP() << "no links here: " << error.message();
     Store({{"COLOR", "new"}});
     EXPECT_TRUE(fs::is_symlink(m_file));
     EXPECT_EQ(fs::status(target).permissions(), fs::perms::owner_read | fs::perms::owner_write);

@@ -8,8 +8,6 @@
 #include <wx/choice.h>
 #include <wx/utils.h>
 
-#include <dlfcn.h>
-
 #include <chrono>
 
 namespace {
@@ -60,7 +58,7 @@ int SettingsWindow::Open(const std::function<void()>& user) {
         wxUIActionSimulator().MouseMove(m_window->GetScreenPosition() + wxPoint(30, 12));
         EXPECT_TRUE(Until([this] { return m_window->IsActive() && Focused(); }));
         user();
-        if (m_window->IsModal())
+        if (m_window->IsShown())
             m_window->EndModal(wxID_NONE);
     });
     const int end = window.ShowModal();
@@ -74,33 +72,14 @@ wxWindow* SettingsWindow::Find(int id) const {
     return window;
 }
 
-wxWindow* SettingsWindow::Focused() const {
-    // wxWidgets loses sight of the focus within a choice. The toolkit has it, but not its headers.
-    using GetPart = void* (*)(void*);
-    static const auto s_getFocus =
-        reinterpret_cast<GetPart>(dlsym(RTLD_DEFAULT, "gtk_window_get_focus"));
-    static const auto s_getParent =
-        reinterpret_cast<GetPart>(dlsym(RTLD_DEFAULT, "gtk_widget_get_parent"));
-    for (void* widget = s_getFocus(m_window->GetHandle()); widget; widget = s_getParent(widget)) {
-        wxWindow* found = nullptr;
-        ForEachBelow(m_window, [&](wxWindow* each) {
-            found = each->GetHandle() == static_cast<WXWidget>(widget) ? each : found;
-        });
-        if (found)
-            return found;
-    }
-    return nullptr;
-}
-
 wxRect SettingsWindow::Place(const wxWindow* window) const {
     return {window->GetScreenPosition(), window->GetSize()};
 }
 
-void SettingsWindow::Click(int id) {
-    const wxRect place = Place(Find(id));
-    wxUIActionSimulator user;
-    user.MouseMove(place.x + 10, place.y + place.height / 2); // on the box of a check box
-    user.MouseClick();
+void SettingsWindow::Activate(int id) {
+    Find(id)->SetFocus();
+    EXPECT_TRUE(Until([&] { return Focused() == Find(id); })) << id;
+    Press(WXK_SPACE);
 }
 
 void SettingsWindow::Press(int key) {

@@ -5,12 +5,22 @@
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"
 
+#include <wx/dcscreen.h>
 #include <wx/uiaction.h>
 
 #include <gtest/gtest.h>
 
 #include <functional>
 #include <optional>
+
+/// Runs a function for each window below one.
+void ForEachBelow(wxWindow* window, const std::function<void(wxWindow*)>& visit);
+
+/// @return the control in the window that keys go to, or null
+wxWindow* FocusedIn(wxWindow* window);
+
+/// Has the screen show what is on it now, should it have been read before.
+void ReadAnew(wxScreenDC& screen);
 
 /// The settings window of a machine with Office, two printers and two Distiller profiles, with a
 /// user in front of it.
@@ -29,9 +39,9 @@ protected:
     // What the user sees and does while the window is open.
 
     wxWindow* Find(int id) const;
+    wxWindow* Focused() const { return FocusedIn(m_window); }
     wxRect Place(const wxWindow* window) const; ///< on the screen
-    wxWindow* Focused() const;                  ///< the control that keys go to, or null
-    void Click(int id);
+    void Activate(int id);                      ///< a button or a check box, by the space bar
     void Press(int key);
     /// Picks an entry; the box itself is the toolkit's.
     void Choose(int id, const wxString& entry);
@@ -48,6 +58,3 @@ protected:
     std::optional<TestPrinter> m_printers[2];
     SettingsDialogue* m_window = nullptr;
 };
-
-/// Runs a function for each window below one.
-void ForEachBelow(wxWindow* window, const std::function<void(wxWindow*)>& visit);

@@ -60,7 +60,7 @@ TEST_F(ProgramTest, APanelSavedInGermanPrintsHandoutsInEnglish) {
                   Choose(ControlId::Print, "Handzettel");
                   Choose(ControlId::SlidesPerPage, "4");
                   Press(WXK_RETURN);
-                  Until([this] { return !m_window->IsModal(); });
+                  Until([this] { return !m_window->IsShown(); });
               }),
               wxID_SAVE);
     EXPECT_NE(Stored().find("<PRINTOUTPUTTYPE>Handzettel</PRINTOUTPUTTYPE>"), std::string::npos);
