@@ -1,5 +1,7 @@
 #include <afxwin.h>
 
+#include <utility>
+
 namespace {
 
 AFX_MODULE_STATE g_processState;
@@ -11,17 +13,11 @@ AFX_MODULE_STATE* AfxGetModuleState() {
     return t_moduleState ? t_moduleState : &g_processState;
 }
 
-AFX_MODULE_STATE* AfxSetModuleState(AFX_MODULE_STATE* state) noexcept {
-    AFX_MODULE_STATE* previous = AfxGetModuleState();
-    t_moduleState = state;
-    return previous;
-}
-
 AFX_MAINTAIN_STATE2::AFX_MAINTAIN_STATE2(AFX_MODULE_STATE* state) noexcept
-    : m_previous(AfxSetModuleState(state)) {}
+    : m_previous(std::exchange(t_moduleState, state)) {}
 
 AFX_MAINTAIN_STATE2::~AFX_MAINTAIN_STATE2() {
-    AfxSetModuleState(m_previous);
+    t_moduleState = m_previous;
 }
 
 BOOL AfxWinInit(HINSTANCE instance, HINSTANCE previous, LPTSTR /*commandLine*/, int /*show*/) {

@@ -2,6 +2,7 @@
 
 #include <cstdarg>
 #include <cstring>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -9,7 +10,7 @@ namespace {
 constexpr BYTE ByReference = 0x40; // MFC's mark of VTS_PVARIANT and its like
 
 /// One argument of the call, taken from InvokeHelper's list. A text is copied into a BSTR, which
-/// the argument owns; objects and variants are lent for the length of the call.
+/// the argument owns; variants are lent for the length of the call.
 class Argument {
 public:
     Argument() : m_value() {}
@@ -24,9 +25,6 @@ public:
     void Take(BYTE type, va_list* list) {
         m_value.vt = type;
         switch (type) {
-        case VT_I2:
-            m_value.iVal = static_cast<SHORT>(va_arg(*list, int));
-            break;
         case VT_I4:
             m_value.lVal = va_arg(*list, LONG);
             break;
@@ -35,9 +33,6 @@ public:
             break;
         case VT_BSTR:
             TakeText(va_arg(*list, LPCOLESTR));
-            break;
-        case VT_DISPATCH:
-            m_value.pdispVal = va_arg(*list, LPDISPATCH);
             break;
         case VT_VARIANT:
             m_value = *va_arg(*list, const VARIANT*);
@@ -67,60 +62,29 @@ private:
 };
 
 [[noreturn]] void ThrowRaised(EXCEPINFO& raised) {
-    if (raised.pfnDeferredFillIn)
+    if (raised.pfnDeferredFillIn) // an application may wait with the texts until they are asked for
         raised.pfnDeferredFillIn(&raised);
     auto* exception = new COleDispatchException;
     exception->m_wCode = raised.wCode;
     exception->m_scError = raised.scode;
     exception->m_strSource = CString(raised.bstrSource);
     exception->m_strDescription = CString(raised.bstrDescription);
-    exception->m_strHelpFile = CString(raised.bstrHelpFile);
-    exception->m_dwHelpContext = raised.dwHelpContext;
-    SysFreeString(raised.bstrSource);
-    SysFreeString(raised.bstrDescription);
-    SysFreeString(raised.bstrHelpFile);
+    for (BSTR text : {raised.bstrSource, raised.bstrDescription, raised.bstrHelpFile})
+        SysFreeString(text);
     throw exception; // NOLINT(misc-throw-by-value-catch-by-reference): as MFC does
 }
 
-/// Hands the call's result to the caller in the form that it asked for.
-void StoreResult(COleVariant& answer, VARTYPE type, void* result) {
-    if (type == VT_VARIANT) {
-        std::memcpy(result, static_cast<VARIANT*>(&answer), sizeof(VARIANT));
-        answer.vt = VT_EMPTY;
-        return;
-    }
-    if (answer.vt != type) {
-        const HRESULT converted = VariantChangeType(&answer, &answer, 0, type);
-        if (FAILED(converted))
-            AfxThrowOleException(converted);
-    }
-    switch (type) {
-    case VT_I2:
-        *static_cast<SHORT*>(result) = answer.iVal;
-        break;
-    case VT_I4:
-        *static_cast<LONG*>(result) = answer.lVal;
-        break;
-    case VT_BOOL:
-        *static_cast<BOOL*>(result) = answer.boolVal != VARIANT_FALSE;
-        break;
-    case VT_BSTR:
-        *static_cast<BSTR*>(result) = answer.bstrVal;
-        answer.vt = VT_EMPTY;
-        break;
-    case VT_DISPATCH:
-        *static_cast<LPDISPATCH*>(result) = answer.pdispVal;
-        answer.vt = VT_EMPTY;
-        break;
-    default:
-        AfxThrowOleException(DISP_E_BADVARTYPE);
-    }
+/// Hands the object that a call answered to the caller.
+void StoreObject(COleVariant& answer, LPDISPATCH& object) {
+    const HRESULT converted = VariantChangeType(&answer, &answer, 0, VT_DISPATCH);
+    if (FAILED(converted))
+        AfxThrowOleException(converted);
+    object = std::exchange(answer.pdispVal, nullptr);
 }
 
 } // namespace
 
-COleDispatchDriver::COleDispatchDriver(LPDISPATCH dispatch, BOOL autoRelease)
-    : m_lpDispatch(dispatch), m_bAutoRelease(autoRelease) {}
+COleDispatchDriver::COleDispatchDriver(LPDISPATCH dispatch) : m_lpDispatch(dispatch) {}
 
 COleDispatchDriver::COleDispatchDriver(const COleDispatchDriver& other)
     : m_lpDispatch(other.m_lpDispatch) {
@@ -132,7 +96,7 @@ COleDispatchDriver& COleDispatchDriver::operator=(const COleDispatchDriver& othe
     if (this != &other) {
         if (other.m_lpDispatch)
             other.m_lpDispatch->AddRef();
-        AttachDispatch(other.m_lpDispatch);
+        Attach(other.m_lpDispatch);
     }
     return *this;
 }
@@ -141,7 +105,7 @@ COleDispatchDriver::~COleDispatchDriver() {
     ReleaseDispatch();
 }
 
-BOOL COleDispatchDriver::CreateDispatch(LPCTSTR progId, COleException* error) {
+BOOL COleDispatchDriver::CreateDispatch(LPCTSTR progId) {
     CLSID clsid{};
     IUnknown* created = nullptr;
     LPDISPATCH dispatch = nullptr;
@@ -153,30 +117,20 @@ BOOL COleDispatchDriver::CreateDispatch(LPCTSTR progId, COleException* error) {
         result = created->QueryInterface(IID_IDispatch, reinterpret_cast<void**>(&dispatch));
         created->Release();
     }
-    if (FAILED(result)) {
-        if (error)
-            error->m_sc = result;
+    if (FAILED(result))
         return FALSE;
-    }
-    AttachDispatch(dispatch);
+    Attach(dispatch);
     return TRUE;
 }
 
-void COleDispatchDriver::AttachDispatch(LPDISPATCH dispatch, BOOL autoRelease) {
+void COleDispatchDriver::Attach(LPDISPATCH dispatch) {
     ReleaseDispatch();
     m_lpDispatch = dispatch;
-    m_bAutoRelease = autoRelease;
-}
-
-LPDISPATCH COleDispatchDriver::DetachDispatch() {
-    LPDISPATCH dispatch = m_lpDispatch;
-    m_lpDispatch = nullptr;
-    return dispatch;
 }
 
 void COleDispatchDriver::ReleaseDispatch() {
-    LPDISPATCH dispatch = DetachDispatch();
-    if (dispatch && m_bAutoRelease)
+    LPDISPATCH dispatch = std::exchange(m_lpDispatch, nullptr);
+    if (dispatch)
         dispatch->Release();
 }
 
@@ -184,6 +138,8 @@ void COleDispatchDriver::InvokeHelper(DISPID member, WORD flags, VARTYPE resultT
                                       const BYTE* parameters, ...) {
     if (!m_lpDispatch)
         AfxThrowOleException(E_POINTER);
+    if (resultType != VT_EMPTY && resultType != VT_DISPATCH)
+        AfxThrowOleException(DISP_E_BADVARTYPE);
 
     const auto* types = parameters ? reinterpret_cast<const char*>(parameters) : VTS_NONE;
     const std::size_t count = std::strlen(types);
@@ -204,7 +160,7 @@ void COleDispatchDriver::InvokeHelper(DISPID member, WORD flags, VARTYPE resultT
 
     DISPID put = DISPID_PROPERTYPUT;
     DISPPARAMS call{passed.data(), nullptr, static_cast<UINT>(count), 0};
-    if (flags & (DISPATCH_PROPERTYPUT | DISPATCH_PROPERTYPUTREF)) {
+    if (flags & DISPATCH_PROPERTYPUT) {
         call.rgdispidNamedArgs = &put;
         call.cNamedArgs = 1;
     }
@@ -220,5 +176,5 @@ void COleDispatchDriver::InvokeHelper(DISPID member, WORD flags, VARTYPE resultT
     if (FAILED(invoked))
         AfxThrowOleException(invoked);
     if (resultType != VT_EMPTY)
-        StoreResult(answer, resultType, result);
+        StoreObject(answer, *static_cast<LPDISPATCH*>(result));
 }

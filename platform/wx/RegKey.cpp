@@ -7,36 +7,19 @@
 
 namespace {
 
-struct RootName {
-    const char* longName;
-    const char* shortName;
+/// In the order of StdKey.
+const struct {
+    const char* name;
     HKEY key;
+} Roots[] = {
+    {"HKEY_CLASSES_ROOT", HKEY_CLASSES_ROOT},
+    {"HKEY_CURRENT_USER", HKEY_CURRENT_USER},
+    {"HKEY_LOCAL_MACHINE", HKEY_LOCAL_MACHINE},
 };
-
-const RootName RootNames[] = {
-    {"HKEY_CLASSES_ROOT", "HKCR", HKEY_CLASSES_ROOT},
-    {"HKEY_CURRENT_USER", "HKCU", HKEY_CURRENT_USER},
-    {"HKEY_LOCAL_MACHINE", "HKLM", HKEY_LOCAL_MACHINE},
-    {"HKEY_USERS", "HKU", HKEY_USERS},
-};
-
-HKEY RootOf(wxRegKey::StdKey root) {
-    switch (root) {
-    case wxRegKey::HKCR:
-        return HKEY_CLASSES_ROOT;
-    case wxRegKey::HKCU:
-        return HKEY_CURRENT_USER;
-    case wxRegKey::HKLM:
-        return HKEY_LOCAL_MACHINE;
-    case wxRegKey::HKUSR:
-        return HKEY_USERS;
-    }
-    return nullptr;
-}
 
 HKEY RootNamed(const wxString& name) {
-    for (const RootName& root : RootNames)
-        if (name.IsSameAs(root.longName, false) || name.IsSameAs(root.shortName, false))
+    for (const auto& root : Roots)
+        if (name == root.name)
             return root.key;
     return nullptr;
 }
@@ -51,34 +34,31 @@ const wchar_t* ValueName(const wxString& name) {
 wxRegKey::wxRegKey(const wxString& fullName)
     : m_root(RootNamed(fullName.BeforeFirst('\\'))), m_path(fullName.AfterFirst('\\')) {}
 
-wxRegKey::wxRegKey(StdKey root, const wxString& path) : m_root(RootOf(root)), m_path(path) {}
+wxRegKey::wxRegKey(StdKey root, const wxString& path) : m_root(Roots[root].key), m_path(path) {}
 
 wxRegKey::~wxRegKey() {
     Close();
 }
 
 bool wxRegKey::Exists() const {
-    if (IsOpened())
+    if (m_key)
         return true;
     HKEY key = nullptr;
-    if (!m_root || RegOpenKeyExW(m_root, m_path.wc_str(), 0, KEY_READ, &key) != ERROR_SUCCESS)
+    if (RegOpenKeyExW(m_root, m_path.wc_str(), 0, KEY_READ, &key) != ERROR_SUCCESS)
         return false;
     RegCloseKey(key);
     return true;
 }
 
-bool wxRegKey::Open(AccessMode mode) {
-    Close();
-    const REGSAM access = mode == Read ? KEY_READ : KEY_READ | KEY_WRITE;
-    return m_root && RegOpenKeyExW(m_root, m_path.wc_str(), 0, access, &m_key) == ERROR_SUCCESS;
-}
-
-bool wxRegKey::Create(bool okIfExists) {
-    if (!m_root || (!okIfExists && Exists()))
-        return false;
+bool wxRegKey::Create() {
     Close();
     return RegCreateKeyExW(m_root, m_path.wc_str(), 0, nullptr, REG_OPTION_NON_VOLATILE,
                            KEY_READ | KEY_WRITE, nullptr, &m_key, nullptr) == ERROR_SUCCESS;
+}
+
+bool wxRegKey::Open() const {
+    return m_key ||
+           RegOpenKeyExW(m_root, m_path.wc_str(), 0, KEY_READ | KEY_WRITE, &m_key) == ERROR_SUCCESS;
 }
 
 void wxRegKey::Close() {
@@ -87,19 +67,15 @@ void wxRegKey::Close() {
     m_key = nullptr;
 }
 
-bool wxRegKey::OpenForQuery() const {
-    return IsOpened() || const_cast<wxRegKey*>(this)->Open(Read);
-}
-
 bool wxRegKey::HasValue(const wxString& name) const {
-    return OpenForQuery() && RegQueryValueExW(m_key, ValueName(name), nullptr, nullptr, nullptr,
-                                              nullptr) == ERROR_SUCCESS;
+    return Open() && RegQueryValueExW(m_key, ValueName(name), nullptr, nullptr, nullptr, nullptr) ==
+                         ERROR_SUCCESS;
 }
 
-bool wxRegKey::QueryValue(const wxString& name, wxString& value, bool raw) const {
+bool wxRegKey::QueryValue(const wxString& name, wxString& value) const {
     DWORD type = REG_NONE;
     DWORD size = 0;
-    if (!OpenForQuery() ||
+    if (!Open() ||
         RegQueryValueExW(m_key, ValueName(name), nullptr, &type, nullptr, &size) != ERROR_SUCCESS)
         return false;
     if (type != REG_SZ && type != REG_EXPAND_SZ)
@@ -109,7 +85,7 @@ bool wxRegKey::QueryValue(const wxString& name, wxString& value, bool raw) const
                                      &size) != ERROR_SUCCESS)
         return false;
     const std::wstring text = win32::FromUtf16Bytes(bytes.data(), size);
-    value = type == REG_EXPAND_SZ && !raw ? win32::ExpandEnvironment(text) : text;
+    value = type == REG_EXPAND_SZ ? win32::ExpandEnvironment(text) : text;
     return true;
 }
 
@@ -117,7 +93,7 @@ bool wxRegKey::QueryValue(const wxString& name, long* value) const {
     DWORD type = REG_NONE;
     DWORD number = 0;
     DWORD size = sizeof number;
-    if (!OpenForQuery() ||
+    if (!Open() ||
         RegQueryValueExW(m_key, ValueName(name), nullptr, &type, reinterpret_cast<BYTE*>(&number),
                          &size) != ERROR_SUCCESS ||
         type != REG_DWORD)
@@ -128,23 +104,18 @@ bool wxRegKey::QueryValue(const wxString& name, long* value) const {
 
 bool wxRegKey::SetValue(const wxString& name, long value) {
     const auto number = static_cast<DWORD>(value);
-    return (IsOpened() || Open(Write)) &&
+    return Open() &&
            RegSetValueExW(m_key, ValueName(name), 0, REG_DWORD,
                           reinterpret_cast<const BYTE*>(&number), sizeof number) == ERROR_SUCCESS;
 }
 
 bool wxRegKey::SetValue(const wxString& name, const wxString& value) {
     const std::vector<BYTE> bytes = win32::ToUtf16Bytes(value.ToStdWstring());
-    return (IsOpened() || Open(Write)) &&
-           RegSetValueExW(m_key, ValueName(name), 0, REG_SZ, bytes.data(),
-                          static_cast<DWORD>(bytes.size())) == ERROR_SUCCESS;
-}
-
-bool wxRegKey::DeleteValue(const wxString& name) {
-    return (IsOpened() || Open(Write)) && RegDeleteValueW(m_key, ValueName(name)) == ERROR_SUCCESS;
+    return Open() && RegSetValueExW(m_key, ValueName(name), 0, REG_SZ, bytes.data(),
+                                    static_cast<DWORD>(bytes.size())) == ERROR_SUCCESS;
 }
 
 bool wxRegKey::DeleteSelf() {
     Close();
-    return m_root && RegDeleteTreeW(m_root, m_path.wc_str()) == ERROR_SUCCESS;
+    return RegDeleteTreeW(m_root, m_path.wc_str()) == ERROR_SUCCESS;
 }

@@ -1,14 +1,21 @@
+#include "tests/platform/ErrorOf.h"
 #include "tests/support/TemporaryFolder.h"
-
-#include <windows.h>
 
 #include <gtest/gtest.h>
 
-#include <filesystem>
+#include <memory>
 
 namespace {
 
-using Answer = int (*)();
+struct Unload {
+    using pointer = HMODULE;
+    void operator()(HMODULE module) const { FreeLibrary(module); }
+};
+using Module = std::unique_ptr<HMODULE, Unload>;
+
+Module Load(const std::filesystem::path& path) {
+    return Module(LoadLibraryW(path.wstring().c_str()));
+}
 
 std::wstring NameOf(HMODULE module) {
     wchar_t name[4096];
@@ -16,67 +23,40 @@ std::wstring NameOf(HMODULE module) {
     return std::filesystem::path(name).filename().wstring();
 }
 
-const std::wstring TestModuleName = std::filesystem::path(TEST_MODULE).filename().wstring();
-
 TEST(Modules, AreLoadedAndUnloaded) {
-    EXPECT_EQ(nullptr, GetModuleHandleW(TEST_MODULE));
-    EXPECT_EQ(DWORD{ERROR_MOD_NOT_FOUND}, GetLastError());
-    const HMODULE module = LoadLibraryW(TEST_MODULE);
-    ASSERT_NE(nullptr, module);
-    EXPECT_EQ(module, LoadLibraryW(TEST_MODULE));
+    EXPECT_EQ(ERROR_MOD_NOT_FOUND, ErrorOf(GetModuleHandleW(TEST_MODULE)));
+    Module first = Load(TEST_MODULE);
+    Module second = Load(TEST_MODULE);
+    ASSERT_TRUE(first);
+    const HMODULE module = first.get();
+    EXPECT_EQ(module, second.get());
     EXPECT_EQ(module, GetModuleHandleW(TEST_MODULE));
-    const auto answer = reinterpret_cast<Answer>(
+    EXPECT_EQ(std::filesystem::path(TEST_MODULE).filename().wstring(), NameOf(module));
+    first.reset();
+    const auto answer = reinterpret_cast<int (*)()>(
         reinterpret_cast<void*>(GetProcAddress(module, "TestModuleAnswer")));
     ASSERT_NE(nullptr, answer);
-    EXPECT_EQ(42, answer());
-    EXPECT_TRUE(FreeLibrary(module));
     EXPECT_EQ(42, answer()); // one reference is left
-    EXPECT_TRUE(FreeLibrary(module));
+    second.reset();
     EXPECT_EQ(nullptr, GetModuleHandleW(TEST_MODULE));
     EXPECT_FALSE(FreeLibrary(module));
 }
 
 TEST(Modules, ExportWhatIsTheirOwn) {
-    const HMODULE module = LoadLibraryW(TEST_SERVER);
-    ASSERT_NE(nullptr, module);
-    EXPECT_NE(nullptr, GetProcAddress(module, "DllCanUnloadNow"));
-    for (const char* name : {"NoSuchExport", "memcpy"}) { // the other one is of a library below
-        EXPECT_EQ(nullptr, GetProcAddress(module, name)) << name;
-        EXPECT_EQ(DWORD{ERROR_PROC_NOT_FOUND}, GetLastError()) << name;
-    }
-    FreeLibrary(module);
+    const Module module = Load(TEST_SERVER);
+    EXPECT_EQ(ERROR_SUCCESS, ErrorOf(GetProcAddress(module.get(), "DllCanUnloadNow")));
+    for (const char* name : {"NoSuchExport", "memcpy"}) // the other one is of a library below
+        EXPECT_EQ(ERROR_PROC_NOT_FOUND, ErrorOf(GetProcAddress(module.get(), name))) << name;
 }
 
 TEST(Modules, FailuresHaveTheirCodes) {
     const TemporaryFolder folder;
-    const auto errorOf = [](const std::wstring& path) {
-        return LoadLibraryW(path.c_str()) ? DWORD{ERROR_SUCCESS} : GetLastError();
-    };
-    EXPECT_EQ(DWORD{ERROR_MOD_NOT_FOUND}, errorOf((folder / "none.dll").wstring()));
-    EXPECT_EQ(DWORD{ERROR_MOD_NOT_FOUND}, errorOf(L"quillon-none"));
-    EXPECT_EQ(DWORD{ERROR_BAD_EXE_FORMAT},
-              errorOf(folder.Write("text.dll", "This is no module.").wstring()));
+    EXPECT_EQ(ERROR_MOD_NOT_FOUND, ErrorOf(Load(folder / "none.dll")));
+    EXPECT_EQ(ERROR_MOD_NOT_FOUND, ErrorOf(Load("quillon-none")));
+    EXPECT_EQ(ERROR_BAD_EXE_FORMAT, ErrorOf(Load(folder.Write("text.dll", "This is no module."))));
 }
 
-TEST(Modules, ABareNameStandsBesideTheProgram) {
-    const auto beside = std::filesystem::path(TEST_MODULE).parent_path() / "quillon-bare.dll";
-    std::filesystem::copy_file(TEST_MODULE, beside,
-                               std::filesystem::copy_options::overwrite_existing);
-    for (const wchar_t* name : {L"quillon-bare.dll", L"quillon-bare"}) {
-        const HMODULE module = LoadLibraryW(name);
-        ASSERT_NE(nullptr, module) << name;
-        EXPECT_EQ(L"quillon-bare.dll", NameOf(module));
-        FreeLibrary(module);
-    }
-    std::filesystem::remove(beside);
-}
-
-TEST(Modules, KnowTheirNames) {
-    EXPECT_EQ(NameOf(nullptr), NameOf(GetModuleHandleW(nullptr)));
-    const HMODULE module = LoadLibraryW(TEST_MODULE);
-    EXPECT_EQ(TestModuleName, NameOf(module));
-    FreeLibrary(module);
-
+TEST(Modules, ANameIsCutToTheBuffer) {
     wchar_t whole[4096];
     const DWORD length = GetModuleFileNameW(nullptr, whole, 4096);
     wchar_t cut[8];
@@ -87,31 +67,20 @@ TEST(Modules, KnowTheirNames) {
 }
 
 TEST(Modules, AreFoundByAnAddressInThem) {
-    constexpr DWORD Peek =
-        GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS | GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT;
-    const auto find = [](DWORD flags, const void* address) {
+    const auto find = [](const void* address) {
         HMODULE found = nullptr;
-        const BOOL result = GetModuleHandleExW(flags, static_cast<LPCWSTR>(address), &found);
-        EXPECT_EQ(result != FALSE, found != nullptr);
+        GetModuleHandleExW(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS |
+                               GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT,
+                           static_cast<LPCWSTR>(address), &found);
         return found;
     };
-    EXPECT_EQ(GetModuleHandleW(nullptr), find(Peek, &TestModuleName));
-    const HMODULE module = LoadLibraryW(TEST_MODULE);
-    const void* code = reinterpret_cast<void*>(GetProcAddress(module, "TestModuleAnswer"));
-    EXPECT_EQ(module, find(Peek, code));
-    EXPECT_EQ(module, find(GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS, code)); // one reference more
-    EXPECT_TRUE(FreeLibrary(module));
-    EXPECT_EQ(module, GetModuleHandleW(TEST_MODULE));
-    EXPECT_TRUE(FreeLibrary(module));
-    EXPECT_EQ(nullptr, GetModuleHandleW(TEST_MODULE));
-    const int onTheStack = 0;
-    EXPECT_EQ(nullptr, find(Peek, &onTheStack));
-    EXPECT_EQ(DWORD{ERROR_MOD_NOT_FOUND}, GetLastError());
-}
-
-TEST(Process, HasACommandLine) {
-    const std::wstring line = GetCommandLineW();
-    EXPECT_NE(std::wstring::npos, line.find(NameOf(nullptr)));
+    static const char inTheProgram = 0;
+    EXPECT_EQ(GetModuleHandleW(nullptr), find(&inTheProgram));
+    Module module = Load(TEST_MODULE);
+    const void* code = reinterpret_cast<void*>(GetProcAddress(module.get(), "TestModuleAnswer"));
+    EXPECT_EQ(module.get(), find(code));
+    module.reset();
+    EXPECT_EQ(ERROR_MOD_NOT_FOUND, ErrorOf(find(code)));
 }
 
 } // namespace

@@ -1,12 +1,12 @@
 #include "tests/support/RecordingOffice.h"
 
+#include "tests/support/CountedObject.h"
 #include "tests/support/RegistryText.h"
 
 #include <wx/string.h>
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <utility>
 
 struct RecordingOffice::State {
@@ -17,34 +17,6 @@ struct RecordingOffice::State {
 };
 
 namespace {
-
-struct Application {
-    const wchar_t* progId;
-    const char* object;
-    CLSID clsid;
-};
-
-const Application Applications[] = {
-    {L"Word.Application",
-     "Word",
-     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x01}}},
-    {L"Excel.Application",
-     "Excel",
-     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x02}}},
-    {L"PowerPoint.Application",
-     "PowerPoint",
-     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x03}}},
-    {L"Publisher.Application",
-     "Publisher",
-     {0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x04}}},
-};
-
-const Application* FindApplication(const std::wstring& progId) {
-    const auto* found =
-        std::find_if(std::begin(Applications), std::end(Applications),
-                     [&](const Application& application) { return progId == application.progId; });
-    return found == std::end(Applications) ? nullptr : found;
-}
 
 /// Which object a member answers; every other member answers nothing.
 struct AnsweredObject {
@@ -115,54 +87,13 @@ const char* KindName(WORD flags) {
 
 using SharedState = std::shared_ptr<RecordingOffice::State>;
 
-/// Counts references; the object goes with its last.
-template <typename Interface>
-class Counted : public Interface {
-public:
-    ULONG STDMETHODCALLTYPE AddRef() override { return ++m_references; }
-    ULONG STDMETHODCALLTYPE Release() override {
-        const ULONG left = --m_references;
-        if (left == 0)
-            delete this;
-        return left;
-    }
-
-protected:
-    virtual ~Counted() = default;
-
-private:
-    ULONG m_references = 1;
-};
-
-class RecordingObject final : public Counted<IDispatch> {
+class RecordingObject final : public CountedDispatch {
 public:
     RecordingObject(std::string name, SharedState state)
         : m_name(std::move(name)), m_state(std::move(state)) {
         ++m_state->liveObjects;
     }
 
-    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) override {
-        if (!IsEqualIID(iid, IID_IUnknown) && !IsEqualIID(iid, IID_IDispatch)) {
-            *object = nullptr;
-            return E_NOINTERFACE;
-        }
-        *object = static_cast<IDispatch*>(this);
-        AddRef();
-        return S_OK;
-    }
-    HRESULT STDMETHODCALLTYPE GetTypeInfoCount(UINT* count) override {
-        *count = 0;
-        return S_OK;
-    }
-    HRESULT STDMETHODCALLTYPE GetTypeInfo(UINT /*index*/, LCID /*locale*/,
-                                          ITypeInfo** /*info*/) override {
-        return E_NOTIMPL;
-    }
-    HRESULT STDMETHODCALLTYPE GetIDsOfNames(REFIID /*reserved*/, LPOLESTR* /*names*/,
-                                            UINT /*count*/, LCID /*locale*/,
-                                            DISPID* /*ids*/) override {
-        return DISP_E_UNKNOWNNAME;
-    }
     HRESULT STDMETHODCALLTYPE Invoke(DISPID member, REFIID /*reserved*/, LCID /*locale*/,
                                      WORD flags, DISPPARAMS* arguments, VARIANT* result,
                                      EXCEPINFO* exception, UINT* /*badArgument*/) override {
@@ -185,9 +116,10 @@ public:
     }
 
 private:
-    ~RecordingObject() override {
+    void LastReferenceGone() override {
         m_state->journal.push_back("~" + m_name);
         --m_state->liveObjects;
+        delete this;
     }
 
     void Note(DISPID member, WORD flags, const DISPPARAMS& arguments,
@@ -221,17 +153,8 @@ private:
 class RecordingClass final : public Counted<IClassFactory> {
 public:
     RecordingClass(std::string name, SharedState state)
-        : m_name(std::move(name)), m_state(std::move(state)) {}
+        : Counted(IID_IClassFactory), m_name(std::move(name)), m_state(std::move(state)) {}
 
-    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) override {
-        if (!IsEqualIID(iid, IID_IUnknown) && !IsEqualIID(iid, IID_IClassFactory)) {
-            *object = nullptr;
-            return E_NOINTERFACE;
-        }
-        *object = static_cast<IClassFactory*>(this);
-        AddRef();
-        return S_OK;
-    }
     HRESULT STDMETHODCALLTYPE CreateInstance(IUnknown* /*outer*/, REFIID iid,
                                              void** object) override {
         if (m_state->refusesToStart)
@@ -244,18 +167,25 @@ public:
     HRESULT STDMETHODCALLTYPE LockServer(BOOL /*lock*/) override { return S_OK; }
 
 private:
-    ~RecordingClass() override = default;
+    void LastReferenceGone() override { delete this; }
 
     std::string m_name;
     SharedState m_state;
 };
 
-void EnterProgId(const Application& application, int version) {
-    const std::wstring progId = application.progId;
-    wchar_t clsid[40];
-    StringFromGUID2(application.clsid, clsid, 40);
+/// A class id that no other application of this process has had.
+CLSID NewClassId() {
+    static CLSID last = {
+        0x6b1f0a51, 0x2f0e, 0x4d55, {0x9a, 0x01, 0x5e, 0x2d, 0x8c, 0x10, 0x00, 0x01}};
+    ++last.Data1;
+    return last;
+}
+
+void EnterProgId(const std::wstring& progId, const CLSID& clsid, int version) {
+    wchar_t classId[40];
+    StringFromGUID2(clsid, classId, 40);
     WriteRegistryText(HKEY_CLASSES_ROOT, progId, L"", L"Recording " + progId);
-    WriteRegistryText(HKEY_CLASSES_ROOT, progId + L"\\CLSID", L"", clsid);
+    WriteRegistryText(HKEY_CLASSES_ROOT, progId + L"\\CLSID", L"", classId);
     if (version != 0)
         WriteRegistryText(HKEY_CLASSES_ROOT, progId + L"\\CurVer", L"",
                           progId + L"." + std::to_wstring(version));
@@ -267,15 +197,12 @@ RecordingOffice::RecordingOffice(const std::vector<std::wstring>& progIds, int v
     : m_state(std::make_shared<State>()), m_progIds(progIds) {
     CoInitialize(nullptr);
     for (const std::wstring& progId : progIds) {
-        const Application* application = FindApplication(progId);
-        if (!application) {
-            ADD_FAILURE() << "no such application";
-            continue;
-        }
-        EnterProgId(*application, version);
+        const CLSID clsid = NewClassId();
+        EnterProgId(progId, clsid, version);
+        const wxString object = wxString(progId).BeforeFirst('.'); // Word of Word.Application
+        auto* classObject = new RecordingClass(object.ToStdString(), m_state);
         DWORD cookie = 0;
-        auto* classObject = new RecordingClass(application->object, m_state);
-        EXPECT_EQ(S_OK, CoRegisterClassObject(application->clsid, classObject, CLSCTX_INPROC_SERVER,
+        EXPECT_EQ(S_OK, CoRegisterClassObject(clsid, classObject, CLSCTX_INPROC_SERVER,
                                               REGCLS_MULTIPLEUSE, &cookie));
         classObject->Release();
         m_cookies.push_back(cookie);

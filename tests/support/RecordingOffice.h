@@ -11,10 +11,15 @@
 /// Office applications that do nothing but note every call that reaches them: class objects that
 /// stand for Word, Excel, PowerPoint and Publisher, with the objects behind them.
 ///
-/// The journal holds one line per event, in order:
-///     Documents.15 method (&"C:\in.doc", &omitted, &I2 1)    a call: object, DISPID, kind,
-///     arguments ~Documents                                             the last reference to an
-///     object went
+/// The journal holds one line per event, in order. A call is its object, DISPID, kind and
+/// arguments:
+///
+///     Documents.15 method (&"C:\in.doc", &omitted, &I2 1)
+///
+/// and the end of an object, with its last reference:
+///
+///     ~Documents
+///
 /// An ampersand marks an argument passed by reference.
 class RecordingOffice {
 public:

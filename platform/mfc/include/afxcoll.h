@@ -8,12 +8,9 @@
 class CByteArray {
 public:
     INT_PTR GetSize() const { return static_cast<INT_PTR>(m_bytes.size()); }
-    bool IsEmpty() const { return m_bytes.empty(); }
     /// Gives the array `size` bytes; new ones are zero.
     void SetSize(INT_PTR size) { m_bytes.resize(static_cast<std::size_t>(size)); }
-    void RemoveAll() { m_bytes.clear(); }
     BYTE* GetData() { return m_bytes.data(); }
-    const BYTE* GetData() const { return m_bytes.data(); }
 
 private:
     std::vector<BYTE> m_bytes;

@@ -13,9 +13,6 @@ public:
     CString() = default;
     CString(LPCWSTR text) : m_text(text ? text : L"") {} // NOLINT(google-explicit-constructor)
     operator LPCWSTR() const { return m_text.c_str(); }  // NOLINT(google-explicit-constructor)
-    LPCWSTR GetString() const { return m_text.c_str(); }
-    int GetLength() const { return static_cast<int>(m_text.size()); }
-    bool IsEmpty() const { return m_text.empty(); }
 
 private:
     std::wstring m_text;
@@ -28,12 +25,6 @@ public:
     CException(const CException&) = delete;
     CException& operator=(const CException&) = delete;
     virtual ~CException() = default;
-
-    /// Writes what went wrong as one line.
-    /// @param buffer receives the zero-terminated text, cut to fit
-    /// @param size the buffer's size in characters
-    /// @return false when there is no text; the buffer is then empty
-    virtual BOOL GetErrorMessage(LPTSTR buffer, UINT size) const;
 
     void Delete();
 };
@@ -60,9 +51,6 @@ AFX_PER_MODULE inline AFX_MODULE_STATE* AfxGetStaticModuleState() {
     static AFX_MODULE_STATE state;
     return &state;
 }
-
-/// Makes `state` the thread's module state and answers the one before.
-AFX_MODULE_STATE* AfxSetModuleState(AFX_MODULE_STATE* state) noexcept;
 
 /// Switches MFC's module state for the life of the object.
 class AFX_MAINTAIN_STATE2 {

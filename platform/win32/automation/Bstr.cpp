@@ -44,13 +44,9 @@ void WINAPI SysFreeString(BSTR text) {
         std::free(BlockOf(text));
 }
 
-UINT WINAPI SysStringByteLen(BSTR text) {
+UINT WINAPI SysStringLen(BSTR text) {
     std::uint32_t size = 0;
     if (text)
         std::memcpy(&size, BlockOf(text) + LengthOffset, sizeof size);
-    return size;
-}
-
-UINT WINAPI SysStringLen(BSTR text) {
-    return static_cast<UINT>(SysStringByteLen(text) / sizeof(OLECHAR));
+    return static_cast<UINT>(size / sizeof(OLECHAR));
 }

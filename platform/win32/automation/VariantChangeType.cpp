@@ -2,7 +2,6 @@
 #include "platform/win32/log/LogSink.h"
 #include "platform/win32/text/CaseFold.h"
 
-#include <algorithm>
 #include <charconv>
 #include <cmath>
 #include <limits>
@@ -49,9 +48,6 @@ HRESULT ToNumber(const VARIANT& source, double& number) {
     case VT_I4:
         number = source.lVal;
         return S_OK;
-    case VT_R8:
-        number = source.dblVal;
-        return S_OK;
     case VT_BSTR:
         return ParseNumber({source.bstrVal, SysStringLen(source.bstrVal)}, number);
     default:
@@ -89,14 +85,6 @@ HRESULT ToBool(const VARIANT& source, VARIANT_BOOL& value) {
     return read;
 }
 
-std::string RealText(double number) {
-    char text[32] = {};
-    const auto [end, error] =
-        std::to_chars(text, text + sizeof text, number, std::chars_format::general, 15);
-    std::replace(text, end, 'e', 'E');
-    return {text, end};
-}
-
 HRESULT ToText(const VARIANT& source, VARIANT& target) {
     switch (source.vt) {
     case VT_EMPTY:
@@ -107,42 +95,35 @@ HRESULT ToText(const VARIANT& source, VARIANT& target) {
         return AllocateText(std::to_string(source.boolVal), target);
     case VT_I4:
         return AllocateText(std::to_string(source.lVal), target);
-    case VT_R8:
-        return AllocateText(RealText(source.dblVal), target);
     default:
         return DISP_E_TYPEMISMATCH;
     }
 }
 
-HRESULT ToObject(const VARIANT& source, REFIID iid, VARIANT& target) {
-    if (source.vt != VT_DISPATCH && source.vt != VT_UNKNOWN)
-        return DISP_E_TYPEMISMATCH;
-    if (!source.punkVal)
+/// Gives the target the same value, with a text or a reference of its own.
+HRESULT Copy(const VARIANT& source, VARIANT& target) {
+    target = source;
+    if (source.vt == VT_DISPATCH && source.pdispVal)
+        source.pdispVal->AddRef();
+    if (source.vt != VT_BSTR || !source.bstrVal)
         return S_OK;
-    void* object = nullptr;
-    if (FAILED(source.punkVal->QueryInterface(iid, &object)))
-        return DISP_E_TYPEMISMATCH;
-    target.byref = object;
-    return S_OK;
+    target.bstrVal = SysAllocStringLen(source.bstrVal, SysStringLen(source.bstrVal));
+    return target.bstrVal ? S_OK : E_OUTOFMEMORY;
 }
 
 HRESULT Convert(const VARIANT& source, VARTYPE type, VARIANT& target) {
+    if (source.vt == type)
+        return Copy(source, target);
     target.vt = type;
     switch (type) {
     case VT_I2:
         return ToInteger(source, target.iVal);
     case VT_I4:
         return ToInteger(source, target.lVal);
-    case VT_R8:
-        return ToNumber(source, target.dblVal);
     case VT_BOOL:
         return ToBool(source, target.boolVal);
     case VT_BSTR:
         return ToText(source, target);
-    case VT_DISPATCH:
-        return ToObject(source, IID_IDispatch, target);
-    case VT_UNKNOWN:
-        return ToObject(source, IID_IUnknown, target);
     default:
         return DISP_E_TYPEMISMATCH;
     }
@@ -152,23 +133,15 @@ HRESULT Convert(const VARIANT& source, VARTYPE type, VARIANT& target) {
 
 HRESULT WINAPI VariantChangeType(VARIANTARG* target, const VARIANTARG* source, USHORT flags,
                                  VARTYPE type) {
-    if ((type & VT_BYREF) != 0 || !win32::IsSupportedVariantType(type))
+    if ((type & VT_BYREF) != 0 || !win32::IsSupportedVariantType(type) ||
+        !win32::IsSupportedVariantType(source->vt))
         return DISP_E_BADVARTYPE;
-    if (flags != 0) {
-        win32::Log("VariantChangeType: flags are not supported");
+    if (flags != 0 || (source->vt & VT_BYREF) != 0) {
+        win32::Log("VariantChangeType: flags and references are not supported");
         return E_INVALIDARG;
     }
-    VARIANT value{};
-    HRESULT result = VariantCopyInd(&value, source);
-    if (FAILED(result))
-        return result;
     VARIANT converted{};
-    if (value.vt == type) {
-        converted = value;
-    } else {
-        result = Convert(value, type, converted);
-        VariantClear(&value);
-    }
+    HRESULT result = Convert(*source, type, converted);
     if (FAILED(result))
         return result;
     result = VariantClear(target);

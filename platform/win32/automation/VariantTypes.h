@@ -4,8 +4,8 @@
 
 namespace win32 {
 
-/// Whether a value of this type can stand in a VARIANT here; one passed by reference may be a
-/// VARIANT as well. Arrays and the types that this system has no use for are refused.
+/// Whether a VARIANT here can be of this type: a value's, or that of a reference to a VARIANT.
+/// Arrays and the types that this system has no use for are refused.
 bool IsSupportedVariantType(VARTYPE type);
 
 } // namespace win32

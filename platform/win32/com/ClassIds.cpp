@@ -46,19 +46,6 @@ bool ParseGuid(std::wstring_view text, GUID& guid) {
 
 } // namespace
 
-HRESULT WINAPI CLSIDFromString(LPCOLESTR text, LPCLSID clsid) {
-    if (!clsid)
-        return E_INVALIDARG;
-    *clsid = CLSID{};
-    if (!text)
-        return S_OK; // the null CLSID
-    GUID guid{};
-    if (!ParseGuid(text, guid))
-        return CO_E_CLASSSTRING;
-    *clsid = guid;
-    return S_OK;
-}
-
 int WINAPI StringFromGUID2(REFGUID guid, LPOLESTR text, int size) {
     if (!text || size <= TextLength)
         return 0;
@@ -76,5 +63,9 @@ HRESULT WINAPI CLSIDFromProgID(LPCOLESTR progId, LPCLSID clsid) {
     *clsid = CLSID{};
     const std::optional<std::wstring> text =
         win32::ReadClassesText(std::wstring(progId) + L"\\CLSID");
-    return text ? CLSIDFromString(text->c_str(), clsid) : CO_E_CLASSSTRING;
+    GUID guid{};
+    if (!text || !ParseGuid(*text, guid))
+        return CO_E_CLASSSTRING;
+    *clsid = guid;
+    return S_OK;
 }

@@ -4,18 +4,15 @@
 
 namespace {
 
-DWORD CheckArguments(DWORD desiredAccess, DWORD shareMode, LPSECURITY_ATTRIBUTES security,
-                     DWORD creationDisposition, DWORD flagsAndAttributes, HANDLE templateFile) {
-    constexpr DWORD EveryShare = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE;
-    const bool canTruncate = (desiredAccess & GENERIC_WRITE) != 0;
-    if ((shareMode & ~EveryShare) != 0 || creationDisposition < CREATE_NEW ||
-        creationDisposition > TRUNCATE_EXISTING ||
-        (creationDisposition == TRUNCATE_EXISTING && !canTruncate))
+DWORD CheckArguments(const win32::OpenRequest& request, bool isProtected, DWORD flagsAndAttributes,
+                     HANDLE templateFile) {
+    if ((request.share & ~FILE_SHARE_READ) != 0 ||
+        (request.disposition != CREATE_NEW && request.disposition != OPEN_EXISTING)) {
+        win32::Log("CreateFileW: such share modes or dispositions are not supported");
         return ERROR_INVALID_PARAMETER;
-    const bool isInherited = security && security->bInheritHandle;
-    const bool isProtected = security && security->lpSecurityDescriptor;
-    if ((desiredAccess & ~(GENERIC_READ | GENERIC_WRITE)) != 0 || isInherited || isProtected ||
-        (flagsAndAttributes & ~FILE_ATTRIBUTE_NORMAL) != 0 || templateFile) {
+    }
+    if (request.access == 0 || (request.access & ~(GENERIC_READ | GENERIC_WRITE)) != 0 ||
+        isProtected || (flagsAndAttributes & ~FILE_ATTRIBUTE_NORMAL) != 0 || templateFile) {
         win32::Log("CreateFileW: only generic rights and normal attributes are supported");
         return ERROR_NOT_SUPPORTED;
     }
@@ -27,19 +24,16 @@ DWORD CheckArguments(DWORD desiredAccess, DWORD shareMode, LPSECURITY_ATTRIBUTES
 HANDLE WINAPI CreateFileW(LPCWSTR fileName, DWORD desiredAccess, DWORD shareMode,
                           LPSECURITY_ATTRIBUTES securityAttributes, DWORD creationDisposition,
                           DWORD flagsAndAttributes, HANDLE templateFile) {
-    DWORD error = CheckArguments(desiredAccess, shareMode, securityAttributes, creationDisposition,
-                                 flagsAndAttributes, templateFile);
+    const win32::OpenRequest request{desiredAccess, shareMode, creationDisposition};
+    DWORD error =
+        CheckArguments(request, securityAttributes != nullptr, flagsAndAttributes, templateFile);
     std::shared_ptr<win32::OpenFile> file;
-    bool existed = false;
     if (error == ERROR_SUCCESS)
-        error = win32::OpenFile::Open(fileName, {desiredAccess, shareMode, creationDisposition},
-                                      file, existed);
+        error = win32::OpenFile::Open(fileName, request, file);
     if (error != ERROR_SUCCESS) {
         SetLastError(error);
         return INVALID_HANDLE_VALUE;
     }
-    if (creationDisposition == CREATE_ALWAYS || creationDisposition == OPEN_ALWAYS)
-        SetLastError(existed ? ERROR_ALREADY_EXISTS : ERROR_SUCCESS);
     return win32::FileHandles().Add(std::move(file));
 }
 

@@ -1,12 +1,10 @@
 #pragma once
 
-#include "platform/win32/files/ShareTable.h"
 #include "platform/win32/handles/HandleTable.h"
 
 #include <windows.h>
 
 #include <memory>
-#include <string>
 
 namespace win32 {
 
@@ -17,39 +15,32 @@ struct OpenRequest {
     DWORD disposition;
 };
 
-/// A regular file that is open, with its share mode: in the table of this process, and as an
-/// advisory lock for other processes. Closes itself.
+/// A regular file that is open, with its share mode as an advisory lock. Closes itself.
 class OpenFile {
 public:
     /// Never waits: not for a lock, and not for the other end of a FIFO, which is refused.
     /// @param file receives the file
-    /// @param existed whether the file was there before
     /// @return a system error code
-    static DWORD Open(LPCWSTR name, const OpenRequest& request, std::shared_ptr<OpenFile>& file,
-                      bool& existed);
+    static DWORD Open(LPCWSTR name, const OpenRequest& request, std::shared_ptr<OpenFile>& file);
 
-    OpenFile(int descriptor, const FileId& id, const ShareMode& mode)
-        : m_descriptor(descriptor), m_id(id), m_mode(mode) {}
+    OpenFile(int descriptor, DWORD access) : m_descriptor(descriptor), m_access(access) {}
     OpenFile(const OpenFile&) = delete;
     OpenFile& operator=(const OpenFile&) = delete;
     ~OpenFile();
 
     int Descriptor() const { return m_descriptor; }
-    bool MayRead() const { return m_mode.reads; }
-    bool MayWrite() const { return m_mode.writes; }
+    bool MayRead() const { return (m_access & GENERIC_READ) != 0; }
+    bool MayWrite() const { return (m_access & GENERIC_WRITE) != 0; }
 
 private:
-    bool Lock() const;
+    bool IsRegular() const;
+    bool Lock(DWORD share) const;
 
     int m_descriptor;
-    FileId m_id;
-    ShareMode m_mode;
+    DWORD m_access;
 };
 
 /// The file handles of the process.
 HandleTable<OpenFile>& FileHandles();
-
-/// The error of a system call on the file at `path`: a missing folder is not a missing file.
-DWORD PathError(int number, const std::string& path);
 
 } // namespace win32

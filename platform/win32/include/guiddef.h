@@ -24,7 +24,3 @@ inline bool operator==(REFGUID left, REFGUID right) {
 inline bool operator!=(REFGUID left, REFGUID right) {
     return !(left == right);
 }
-
-#define IsEqualGUID(left, right) ((left) == (right))
-#define IsEqualIID(left, right) ((left) == (right))
-#define IsEqualCLSID(left, right) ((left) == (right))

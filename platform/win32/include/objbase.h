@@ -7,8 +7,6 @@
 #include <guiddef.h>
 
 #define STDAPI EXTERN_C HRESULT STDMETHODCALLTYPE
-#define STDMETHODIMP HRESULT STDMETHODCALLTYPE
-#define STDMETHODIMP_(type) type STDMETHODCALLTYPE
 
 using OLECHAR = WCHAR;
 using LPOLESTR = OLECHAR*;
@@ -35,34 +33,20 @@ protected:
 
 enum CLSCTX : DWORD {
     CLSCTX_INPROC_SERVER = 0x1,
-    CLSCTX_INPROC_HANDLER = 0x2,
-    CLSCTX_LOCAL_SERVER = 0x4,
-    CLSCTX_REMOTE_SERVER = 0x10,
+    CLSCTX_ALL = 0x17, // with handlers and servers in other processes, of which there are none
 };
-#define CLSCTX_ALL                                                                                 \
-    (CLSCTX_INPROC_SERVER | CLSCTX_INPROC_HANDLER | CLSCTX_LOCAL_SERVER | CLSCTX_REMOTE_SERVER)
 
 enum REGCLS : DWORD {
-    REGCLS_SINGLEUSE = 0,
     REGCLS_MULTIPLEUSE = 1,
-};
-
-enum COINIT : DWORD {
-    COINIT_APARTMENTTHREADED = 0x2,
-    COINIT_MULTITHREADED = 0x0,
 };
 
 extern "C" {
 
 HRESULT WINAPI CoInitialize(LPVOID reserved);
-HRESULT WINAPI CoInitializeEx(LPVOID reserved, DWORD model);
 void WINAPI CoUninitialize();
 HRESULT WINAPI CLSIDFromProgID(LPCOLESTR progId, LPCLSID clsid);
-HRESULT WINAPI CLSIDFromString(LPCOLESTR text, LPCLSID clsid);
 int WINAPI StringFromGUID2(REFGUID guid, LPOLESTR text, int size);
 HRESULT WINAPI CoCreateInstance(REFCLSID clsid, LPUNKNOWN outer, DWORD context, REFIID iid,
-                                LPVOID* object);
-HRESULT WINAPI CoGetClassObject(REFCLSID clsid, DWORD context, LPVOID reserved, REFIID iid,
                                 LPVOID* object);
 HRESULT WINAPI CoRegisterClassObject(REFCLSID clsid, LPUNKNOWN object, DWORD context, DWORD flags,
                                      LPDWORD cookie);

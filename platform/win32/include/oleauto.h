@@ -15,18 +15,14 @@ using LCID = DWORD;
 
 enum VARENUM : VARTYPE {
     VT_EMPTY = 0,
-    VT_NULL = 1,
     VT_I2 = 2,
     VT_I4 = 3,
-    VT_R8 = 5,
     VT_BSTR = 8,
     VT_DISPATCH = 9,
     VT_ERROR = 10,
     VT_BOOL = 11,
     VT_VARIANT = 12,
-    VT_UNKNOWN = 13,
     VT_BYREF = 0x4000,
-    VT_TYPEMASK = 0xFFF,
 };
 
 struct IDispatch;
@@ -39,14 +35,11 @@ struct VARIANT {
     union {
         LONG lVal;
         SHORT iVal;
-        double dblVal;
         VARIANT_BOOL boolVal;
         SCODE scode;
         BSTR bstrVal;
-        IUnknown* punkVal;
         IDispatch* pdispVal;
         VARIANT* pvarVal;
-        PVOID byref;
     };
 };
 using VARIANTARG = VARIANT;
@@ -90,7 +83,6 @@ using LPDISPATCH = IDispatch*;
 #define DISPATCH_METHOD 0x1
 #define DISPATCH_PROPERTYGET 0x2
 #define DISPATCH_PROPERTYPUT 0x4
-#define DISPATCH_PROPERTYPUTREF 0x8
 
 #define DISPID_UNKNOWN (-1)
 #define DISPID_VALUE 0
@@ -98,28 +90,15 @@ using LPDISPATCH = IDispatch*;
 
 #define LOCALE_USER_DEFAULT 0x0400U
 
-#define V_VT(v) ((v)->vt)
-#define V_I2(v) ((v)->iVal)
-#define V_I4(v) ((v)->lVal)
-#define V_BOOL(v) ((v)->boolVal)
-#define V_BSTR(v) ((v)->bstrVal)
-#define V_ERROR(v) ((v)->scode)
-#define V_DISPATCH(v) ((v)->pdispVal)
-#define V_UNKNOWN(v) ((v)->punkVal)
-#define V_VARIANTREF(v) ((v)->pvarVal)
-
 extern "C" {
 
 BSTR WINAPI SysAllocString(const OLECHAR* text);
 BSTR WINAPI SysAllocStringLen(const OLECHAR* text, UINT length);
 void WINAPI SysFreeString(BSTR text);
 UINT WINAPI SysStringLen(BSTR text);
-UINT WINAPI SysStringByteLen(BSTR text);
 
 void WINAPI VariantInit(VARIANTARG* variant);
 HRESULT WINAPI VariantClear(VARIANTARG* variant);
-HRESULT WINAPI VariantCopy(VARIANTARG* target, const VARIANTARG* source);
-HRESULT WINAPI VariantCopyInd(VARIANT* target, const VARIANTARG* source);
 HRESULT WINAPI VariantChangeType(VARIANTARG* target, const VARIANTARG* source, USHORT flags,
                                  VARTYPE type);
 

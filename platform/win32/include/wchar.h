@@ -11,25 +11,19 @@
 extern "C" {
 
 struct __stat64 {
-    unsigned short st_mode;
     long long st_size;
-    long long st_mtime64; ///< seconds since 1970; st_mtime is a macro of the C library here
 };
 
 /// Fills `status` for the file at `path`; answers 0, or -1 with errno set.
 int _wstat64(const wchar_t* path, struct __stat64* status);
 
-/// Splits a path into drive, folder, name and extension (with its dot); both kinds of slash count.
-/// Each part may be null, and holds at least _MAX_DRIVE, _MAX_DIR, _MAX_FNAME or _MAX_EXT
-/// characters.
+/// Takes the extension of a path, with its dot; both kinds of slash count.
+/// @param drive must be null, like `dir` and `name`
+/// @param extension receives at most _MAX_EXT characters; empty when it is longer
 void _wsplitpath(const wchar_t* path, wchar_t* drive, wchar_t* dir, wchar_t* name,
                  wchar_t* extension);
 }
 
-#        define _MAX_PATH 260
-#        define _MAX_DRIVE 3
-#        define _MAX_DIR 256
-#        define _MAX_FNAME 256
 #        define _MAX_EXT 256
 
 #    endif

@@ -19,17 +19,13 @@ BOOL WINAPI ReadFile(HANDLE file, LPVOID buffer, DWORD bytesToRead, LPDWORD byte
                      LPVOID overlapped);
 BOOL WINAPI WriteFile(HANDLE file, LPCVOID buffer, DWORD bytesToWrite, LPDWORD bytesWritten,
                       LPVOID overlapped);
-DWORD WINAPI SetFilePointer(HANDLE file, LONG distance, PLONG distanceHigh, DWORD moveMethod);
 BOOL WINAPI SetFilePointerEx(HANDLE file, LARGE_INTEGER distance, PLARGE_INTEGER newPosition,
                              DWORD moveMethod);
 BOOL WINAPI SetEndOfFile(HANDLE file);
-DWORD WINAPI GetFileSize(HANDLE file, LPDWORD sizeHigh);
 BOOL WINAPI GetFileSizeEx(HANDLE file, PLARGE_INTEGER size);
 BOOL WINAPI CloseHandle(HANDLE object);
-BOOL WINAPI DeleteFileW(LPCWSTR fileName);
 
-// Modules. A module name without a path is looked for beside the program; the ending does not
-// matter to the loader.
+// Modules. They are named by their paths; the ending does not matter to the loader.
 HMODULE WINAPI GetModuleHandleW(LPCWSTR moduleName);
 DWORD WINAPI GetModuleFileNameW(HMODULE module, LPWSTR fileName, DWORD size);
 BOOL WINAPI GetModuleHandleExW(DWORD flags, LPCWSTR moduleNameOrAddress, HMODULE* module);
@@ -44,32 +40,19 @@ BOOL WINAPI HeapFree(HANDLE heap, DWORD flags, LPVOID block);
 
 // The process.
 LPWSTR WINAPI GetCommandLineW();
-DWORD WINAPI GetCurrentProcessId();
 void WINAPI Sleep(DWORD milliseconds);
 void WINAPI OutputDebugStringW(LPCWSTR text);
 
 } // extern "C"
 
 #define FILE_SHARE_READ 0x00000001U
-#define FILE_SHARE_WRITE 0x00000002U
-#define FILE_SHARE_DELETE 0x00000004U
 
 #define CREATE_NEW 1
-#define CREATE_ALWAYS 2
 #define OPEN_EXISTING 3
-#define OPEN_ALWAYS 4
-#define TRUNCATE_EXISTING 5
 
 #define FILE_ATTRIBUTE_NORMAL 0x00000080U
 
 #define FILE_BEGIN 0
-#define FILE_CURRENT 1
-#define FILE_END 2
-
-#define INVALID_FILE_SIZE 0xFFFFFFFFU
-#define INVALID_SET_FILE_POINTER 0xFFFFFFFFU
 
 #define GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT 0x00000002U
 #define GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS 0x00000004U
-
-#define INFINITE 0xFFFFFFFFU

@@ -7,8 +7,6 @@
 #include <cstdint>
 
 #define WINAPI
-#define CALLBACK
-#define APIENTRY
 #define STDMETHODCALLTYPE
 #define EXTERN_C extern "C"
 
@@ -18,35 +16,25 @@
 
 using BOOL = int;
 using BYTE = std::uint8_t;
-using CHAR = char;
 using WCHAR = wchar_t;
 using SHORT = std::int16_t;
 using USHORT = std::uint16_t;
 using WORD = std::uint16_t;
-using INT = int;
 using UINT = unsigned int;
 using LONG = std::int32_t;
 using ULONG = std::uint32_t;
 using DWORD = std::uint32_t;
 using LONGLONG = std::int64_t;
 using ULONGLONG = std::uint64_t;
-using DWORD64 = std::uint64_t;
 using INT_PTR = std::intptr_t;
-using UINT_PTR = std::uintptr_t;
-using LONG_PTR = std::intptr_t;
 using ULONG_PTR = std::uintptr_t;
-using DWORD_PTR = std::uintptr_t;
 using SIZE_T = std::size_t;
 
 using PVOID = void*;
 using LPVOID = void*;
 using LPCVOID = const void*;
 using LPBYTE = BYTE*;
-using PLONG = LONG*;
 using LPDWORD = DWORD*;
-using PDWORD = DWORD*;
-using LPBOOL = BOOL*;
-using LPSTR = char*;
 using LPCSTR = const char*;
 using LPWSTR = wchar_t*;
 using LPCWSTR = const wchar_t*;
@@ -86,25 +74,10 @@ union ULARGE_INTEGER {
     ULONGLONG QuadPart;
 };
 
-struct FILETIME {
-    DWORD dwLowDateTime;
-    DWORD dwHighDateTime;
-};
-using PFILETIME = FILETIME*;
-
-struct SECURITY_ATTRIBUTES {
-    DWORD nLength;
-    LPVOID lpSecurityDescriptor;
-    BOOL bInheritHandle;
-};
+struct SECURITY_ATTRIBUTES; // nothing in this system has any
 using LPSECURITY_ATTRIBUTES = SECURITY_ATTRIBUTES*;
 using PSECURITY_DESCRIPTOR = PVOID;
 
-// Standard access rights, which files, registry keys and printers share.
-#define READ_CONTROL 0x00020000U
-#define STANDARD_RIGHTS_REQUIRED 0x000F0000U
-#define STANDARD_RIGHTS_READ READ_CONTROL
-#define STANDARD_RIGHTS_WRITE READ_CONTROL
-#define SYNCHRONIZE 0x00100000U
+// Access rights.
 #define GENERIC_READ 0x80000000U
 #define GENERIC_WRITE 0x40000000U

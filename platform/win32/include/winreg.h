@@ -12,29 +12,19 @@ using LSTATUS = LONG;
 #define HKEY_CLASSES_ROOT (FixedHandle<HKEY>(0x80000000))
 #define HKEY_CURRENT_USER (FixedHandle<HKEY>(0x80000001))
 #define HKEY_LOCAL_MACHINE (FixedHandle<HKEY>(0x80000002))
-#define HKEY_USERS (FixedHandle<HKEY>(0x80000003))
 
 #define KEY_QUERY_VALUE 0x0001U
 #define KEY_SET_VALUE 0x0002U
-#define KEY_CREATE_SUB_KEY 0x0004U
-#define KEY_ENUMERATE_SUB_KEYS 0x0008U
-#define KEY_NOTIFY 0x0010U
 #define KEY_READ 0x20019U
 #define KEY_WRITE 0x20006U
-#define KEY_ALL_ACCESS 0xF003FU
 
 #define REG_OPTION_NON_VOLATILE 0x00000000U
-
-#define REG_CREATED_NEW_KEY 1U
-#define REG_OPENED_EXISTING_KEY 2U
 
 #define REG_NONE 0U
 #define REG_SZ 1U
 #define REG_EXPAND_SZ 2U
 #define REG_BINARY 3U
 #define REG_DWORD 4U
-#define REG_MULTI_SZ 7U
-#define REG_QWORD 11U
 
 extern "C" {
 
@@ -50,7 +40,5 @@ LSTATUS WINAPI RegSetValueExW(HKEY key, LPCWSTR valueName, DWORD reserved, DWORD
                               const BYTE* data, DWORD dataSize);
 LSTATUS WINAPI RegDeleteValueW(HKEY key, LPCWSTR valueName);
 LSTATUS WINAPI RegDeleteTreeW(HKEY key, LPCWSTR subKey);
-LSTATUS WINAPI RegEnumKeyExW(HKEY key, DWORD index, LPWSTR name, LPDWORD nameSize, LPDWORD reserved,
-                             LPWSTR keyClass, LPDWORD keyClassSize, PFILETIME lastWriteTime);
 
 } // extern "C"

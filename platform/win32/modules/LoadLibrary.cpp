@@ -12,17 +12,12 @@ namespace fs = std::filesystem;
 
 namespace {
 
-/// Where a module of this name is looked for: a bare name stands for a file beside the program.
+/// Where a module of this name is looked for: nowhere without a folder.
 std::optional<fs::path> PathOfName(LPCWSTR name) {
     const std::optional<std::string> utf8 = name ? win32::ToUtf8(name) : std::nullopt;
-    if (!utf8 || utf8->empty())
-        return std::nullopt;
-    fs::path path(*utf8);
-    if (path.has_parent_path())
-        return fs::absolute(path).lexically_normal();
-    if (!path.has_extension())
-        path += ".dll";
-    return fs::path(win32::ProgramPath()).parent_path() / path;
+    const fs::path path(utf8.value_or(std::string()));
+    return path.has_parent_path() ? std::optional(fs::absolute(path).lexically_normal())
+                                  : std::nullopt;
 }
 
 bool IsWithin(HMODULE module, const void* address) {

@@ -3,29 +3,18 @@
 #include "platform/win32/modules/ModuleTable.h"
 #include "platform/win32/text/Utf8.h"
 
-#include <algorithm>
-
 BOOL WINAPI GetModuleHandleExW(DWORD flags, LPCWSTR moduleNameOrAddress, HMODULE* module) {
     constexpr DWORD Supported =
         GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS | GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT;
     if (!module)
         return win32::Fail(ERROR_INVALID_PARAMETER);
     *module = nullptr;
-    if ((flags & ~Supported) != 0) {
-        win32::Log("GetModuleHandleExW: modules cannot be pinned");
+    if (flags != Supported) {
+        win32::Log("GetModuleHandleExW: modules are found by an address alone, and not kept");
         return win32::Fail(ERROR_INVALID_PARAMETER);
     }
-    const bool addReference = (flags & GET_MODULE_HANDLE_EX_FLAG_UNCHANGED_REFCOUNT) == 0;
-    if ((flags & GET_MODULE_HANDLE_EX_FLAG_FROM_ADDRESS) != 0) {
-        *module = win32::ModuleTable::Instance().FindByAddress(moduleNameOrAddress, addReference);
-        return *module || win32::Fail(ERROR_MOD_NOT_FOUND);
-    }
-    const HMODULE loaded = GetModuleHandleW(moduleNameOrAddress);
-    if (loaded && addReference && moduleNameOrAddress)
-        *module = LoadLibraryW(moduleNameOrAddress);
-    else
-        *module = loaded;
-    return *module != nullptr;
+    *module = win32::ModuleTable::Instance().FindByAddress(moduleNameOrAddress);
+    return *module || win32::Fail(ERROR_MOD_NOT_FOUND);
 }
 
 DWORD WINAPI GetModuleFileNameW(HMODULE module, LPWSTR fileName, DWORD size) {

@@ -12,11 +12,9 @@ ModuleTable& ModuleTable::Instance() {
     return table;
 }
 
-HMODULE ModuleTable::Enter(void* loaded, const std::string& path, bool addReference) {
+HMODULE ModuleTable::Enter(void* loaded, const std::string& path) {
     const auto module = static_cast<HMODULE>(loaded);
-    Entry& entry = m_modules.try_emplace(module, Entry{path, 0}).first->second;
-    if (addReference)
-        ++entry.references;
+    m_modules.try_emplace(module, Entry{path, 0});
     return module;
 }
 
@@ -28,7 +26,9 @@ HMODULE ModuleTable::Load(const std::string& path, std::string& reason) {
         reason = message ? message : "unknown reason";
         return nullptr;
     }
-    return Enter(loaded, path, true);
+    const HMODULE module = Enter(loaded, path);
+    ++m_modules[module].references;
+    return module;
 }
 
 HMODULE ModuleTable::FindLoaded(const std::string& path) {
@@ -37,10 +37,10 @@ HMODULE ModuleTable::FindLoaded(const std::string& path) {
     if (!loaded)
         return nullptr;
     dlclose(loaded); // it stays: somebody else loaded it
-    return Enter(loaded, path, false);
+    return Enter(loaded, path);
 }
 
-HMODULE ModuleTable::FindByAddress(const void* address, bool addReference) {
+HMODULE ModuleTable::FindByAddress(const void* address) {
     Dl_info info{};
     void* found = nullptr;
     if (dladdr1(address, &info, &found, RTLD_DL_LINKMAP) == 0 || !found)
@@ -48,15 +48,13 @@ HMODULE ModuleTable::FindByAddress(const void* address, bool addReference) {
     const auto* map = static_cast<const link_map*>(found);
     const std::string path = *map->l_name ? map->l_name : ProgramPath();
     const std::lock_guard lock(m_mutex);
-    if (addReference && *map->l_name)
-        found = dlopen(map->l_name, RTLD_NOW | RTLD_LOCAL | RTLD_NOLOAD);
-    return found ? Enter(found, path, addReference && *map->l_name) : nullptr;
+    return Enter(found, path);
 }
 
 HMODULE ModuleTable::Program() {
     const std::lock_guard lock(m_mutex);
     void* program = dlopen(nullptr, RTLD_NOW | RTLD_NOLOAD);
-    return Enter(program, ProgramPath(), false);
+    return Enter(program, ProgramPath());
 }
 
 std::optional<std::string> ModuleTable::PathOf(HMODULE module) {

@@ -23,17 +23,17 @@ public:
     /// The module that is loaded from `path`, without a new reference; null when there is none.
     HMODULE FindLoaded(const std::string& path);
 
-    /// The module whose code or data is at `address`; null when there is none.
-    /// @param addReference whether FreeLibrary will be called for it
-    HMODULE FindByAddress(const void* address, bool addReference);
+    /// The module whose code or data is at `address`, without a new reference; null when there is
+    /// none.
+    HMODULE FindByAddress(const void* address);
 
     HMODULE Program();
 
     /// @return the module's full path in UTF-8; nothing when `module` is no module's handle
     std::optional<std::string> PathOf(HMODULE module);
 
-    /// Gives a reference of Load or FindByAddress back; the last unloads the module. Modules that
-    /// came with the program stay.
+    /// Gives a reference of Load back; the last unloads the module. Modules that came with the
+    /// program stay.
     /// @return false when `module` is no module's handle
     bool Release(HMODULE module);
 
@@ -42,7 +42,7 @@ private:
         std::string path;
         unsigned references = 0;
     };
-    HMODULE Enter(void* loaded, const std::string& path, bool addReference);
+    HMODULE Enter(void* loaded, const std::string& path);
 
     std::mutex m_mutex;
     std::map<HMODULE, Entry> m_modules;

@@ -10,9 +10,9 @@ constexpr std::size_t LongestKeyName = 255;
 constexpr std::size_t MostNewLevels = 32; // by one call
 
 bool IsSupportedAccess(REGSAM access) {
-    if ((access & ~KEY_ALL_ACCESS) == 0)
+    if ((access & ~(KEY_READ | KEY_WRITE)) == 0)
         return true;
-    win32::Log("registry: access rights beyond KEY_ALL_ACCESS are not supported");
+    win32::Log("registry: access rights beyond KEY_READ and KEY_WRITE are not supported");
     return false;
 }
 
@@ -26,12 +26,6 @@ void MarkDeleted(RegistryKey& key) {
     key.subKeys.clear();
     key.values.clear();
     key.deleted = true;
-}
-
-void CopyOut(const std::wstring& text, LPWSTR buffer, LPDWORD size) {
-    text.copy(buffer, text.size());
-    buffer[text.size()] = L'\0';
-    *size = static_cast<DWORD>(text.size());
 }
 
 } // namespace
@@ -64,8 +58,8 @@ LSTATUS WINAPI RegCreateKeyExW(HKEY key, LPCWSTR subKey, DWORD reserved, LPWSTR 
                                LPDWORD disposition) {
     if (!result || !subKey || reserved != 0)
         return ERROR_INVALID_PARAMETER;
-    if (keyClass || options != REG_OPTION_NON_VOLATILE || securityAttributes) {
-        win32::Log("RegCreateKeyExW: classes, options and security attributes are not supported");
+    if (keyClass || options != REG_OPTION_NON_VOLATILE || securityAttributes || disposition) {
+        win32::Log("RegCreateKeyExW: only a path and access rights are supported");
         return ERROR_INVALID_PARAMETER;
     }
     if (!IsSupportedAccess(access))
@@ -86,8 +80,6 @@ LSTATUS WINAPI RegCreateKeyExW(HKEY key, LPCWSTR subKey, DWORD reserved, LPWSTR 
             return ERROR_INVALID_PARAMETER;
     found = win32::AddSubKeys(found, missing);
     *result = registry.Open(std::move(found), access);
-    if (disposition)
-        *disposition = missing.empty() ? REG_OPENED_EXISTING_KEY : REG_CREATED_NEW_KEY;
     return ERROR_SUCCESS;
 }
 
@@ -96,21 +88,17 @@ LSTATUS WINAPI RegCloseKey(HKEY key) {
 }
 
 LSTATUS WINAPI RegDeleteTreeW(HKEY key, LPCWSTR subKey) {
-    const bool keyItself = !subKey || !*subKey;
+    if (!subKey || !*subKey) {
+        win32::Log("RegDeleteTreeW: only a subkey can be deleted");
+        return ERROR_INVALID_PARAMETER;
+    }
     if (!IsSupportedPath(subKey))
         return ERROR_BAD_PATHNAME;
     Registry& registry = Registry::Instance();
     const auto lock = registry.Lock();
-    const REGSAM needed =
-        keyItself ? KEY_ENUMERATE_SUB_KEYS | KEY_QUERY_VALUE | KEY_SET_VALUE : REGSAM{0};
     std::shared_ptr<RegistryKey> start;
-    if (const LSTATUS resolved = registry.Resolve(key, needed, start); resolved != ERROR_SUCCESS)
+    if (const LSTATUS resolved = registry.Resolve(key, 0, start); resolved != ERROR_SUCCESS)
         return resolved;
-    if (keyItself) {
-        MarkDeleted(*start);
-        start->deleted = false; // it loses what it holds and stays
-        return ERROR_SUCCESS;
-    }
     std::wstring path(subKey);
     path.erase(path.find_last_not_of(L'\\') + 1);
     const std::size_t split = path.find_last_of(L'\\');
@@ -126,32 +114,5 @@ LSTATUS WINAPI RegDeleteTreeW(HKEY key, LPCWSTR subKey) {
             parent->subKeys.erase(entry);
             break;
         }
-    return ERROR_SUCCESS;
-}
-
-LSTATUS WINAPI RegEnumKeyExW(HKEY key, DWORD index, LPWSTR name, LPDWORD nameSize, LPDWORD reserved,
-                             LPWSTR keyClass, LPDWORD keyClassSize, PFILETIME lastWriteTime) {
-    if (!name || !nameSize || reserved || (keyClass && !keyClassSize))
-        return ERROR_INVALID_PARAMETER;
-    if (lastWriteTime) {
-        win32::Log("RegEnumKeyExW: the time of the last write is not kept");
-        return ERROR_INVALID_PARAMETER;
-    }
-    Registry& registry = Registry::Instance();
-    const auto lock = registry.Lock();
-    std::shared_ptr<RegistryKey> start;
-    if (const LSTATUS resolved = registry.Resolve(key, KEY_ENUMERATE_SUB_KEYS, start);
-        resolved != ERROR_SUCCESS)
-        return resolved;
-    if (index >= start->subKeys.size())
-        return ERROR_NO_MORE_ITEMS;
-    const std::wstring& found = std::next(start->subKeys.begin(), index)->second->name;
-    if (found.size() >= *nameSize || (keyClass && *keyClassSize == 0))
-        return ERROR_MORE_DATA;
-    CopyOut(found, name, nameSize);
-    if (keyClass)
-        CopyOut({}, keyClass, keyClassSize);
-    else if (keyClassSize)
-        *keyClassSize = 0;
     return ERROR_SUCCESS;
 }

@@ -21,8 +21,6 @@ std::shared_ptr<RegistryKey> Registry::Root(HKEY handle) {
         return m_currentUser;
     if (handle == HKEY_LOCAL_MACHINE)
         return m_localMachine;
-    if (handle == HKEY_USERS)
-        return m_users;
     return nullptr;
 }
 
@@ -72,7 +70,6 @@ std::shared_ptr<RegistryKey> AddSubKeys(std::shared_ptr<RegistryKey> parent,
                                         const std::vector<std::wstring>& names) {
     for (const std::wstring& name : names) {
         auto key = std::make_shared<RegistryKey>();
-        key->name = name;
         parent->subKeys.emplace(CaseFold(name), key);
         parent = std::move(key);
     }

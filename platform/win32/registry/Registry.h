@@ -13,13 +13,11 @@
 namespace win32 {
 
 struct RegistryValue {
-    std::wstring name;
     DWORD type;
     std::vector<BYTE> data;
 };
 
 struct RegistryKey {
-    std::wstring name;
     std::map<std::wstring, std::shared_ptr<RegistryKey>> subKeys; ///< by case-folded name
     std::map<std::wstring, RegistryValue> values;                 ///< by case-folded name
     bool deleted = false; ///< gone from the tree, while handles to it are still open
@@ -54,7 +52,6 @@ private:
     std::mutex m_mutex;
     std::shared_ptr<RegistryKey> m_currentUser = std::make_shared<RegistryKey>();
     std::shared_ptr<RegistryKey> m_localMachine = std::make_shared<RegistryKey>();
-    std::shared_ptr<RegistryKey> m_users = std::make_shared<RegistryKey>();
     HandleTable<OpenedKey> m_handles;
 };
 

@@ -48,8 +48,8 @@ LSTATUS WINAPI RegQueryValueExW(HKEY key, LPCWSTR valueName, LPDWORD reserved, L
 
 LSTATUS WINAPI RegSetValueExW(HKEY key, LPCWSTR valueName, DWORD reserved, DWORD type,
                               const BYTE* data, DWORD dataSize) {
-    const std::wstring name = valueName ? valueName : L"";
-    if (reserved != 0 || name.size() > LongestValueName)
+    const std::wstring index = IndexOf(valueName);
+    if (reserved != 0 || index.size() > LongestValueName)
         return ERROR_INVALID_PARAMETER;
     if (!data && dataSize > 0)
         return ERROR_NOACCESS;
@@ -59,12 +59,7 @@ LSTATUS WINAPI RegSetValueExW(HKEY key, LPCWSTR valueName, DWORD reserved, DWORD
     if (const LSTATUS resolved = registry.Resolve(key, KEY_SET_VALUE, owner);
         resolved != ERROR_SUCCESS)
         return resolved;
-    // A value that is there keeps the letter case of its name.
-    RegistryValue& value = owner->values.try_emplace(IndexOf(valueName)).first->second;
-    if (value.name.empty())
-        value.name = name;
-    value.type = type;
-    value.data.assign(data, data + dataSize);
+    owner->values[index] = RegistryValue{type, std::vector<BYTE>(data, data + dataSize)};
     return ERROR_SUCCESS;
 }
 

@@ -73,13 +73,10 @@ struct Queue {
 Queue ReadQueue(ipp_t* answer, ipp_attribute_t*& attribute) {
     Queue queue;
     queue.printer->isQueue = true;
-    queue.driver.defaultDataType = L"RAW";
     const std::map<std::string, std::wstring*> texts = {
         {"printer-name", &queue.printer->name},
         {"printer-make-and-model", &queue.driver.name},
         {"device-uri", &queue.printer->portName},
-        {"printer-info", &queue.printer->comment},
-        {"printer-location", &queue.printer->location},
     };
     for (; attribute && ippGetGroupTag(attribute) == IPP_TAG_PRINTER;
          attribute = ippNextAttribute(answer)) {
@@ -110,9 +107,8 @@ Printers AskServer() {
     const Connection server = Connect();
     if (!server)
         return {};
-    static const char* const Wanted[] = {"printer-name", "printer-make-and-model",
-                                         "device-uri",   "printer-info",
-                                         "printer-type", "printer-location"};
+    static const char* const Wanted[] = {"printer-name", "printer-make-and-model", "device-uri",
+                                         "printer-type"};
     ipp_t* request = ippNewRequest(IPP_OP_CUPS_GET_PRINTERS);
     ippAddStrings(request, IPP_TAG_OPERATION, IPP_CONST_TAG(IPP_TAG_KEYWORD),
                   "requested-attributes", static_cast<int>(std::size(Wanted)), nullptr, Wanted);

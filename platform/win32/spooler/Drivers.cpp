@@ -1,7 +1,6 @@
 #include "platform/win32/log/LogSink.h"
 #include "platform/win32/spooler/PackRecords.h"
 #include "platform/win32/spooler/Spooler.h"
-#include "platform/win32/text/CaseFold.h"
 #include "platform/win32/text/Utf8.h"
 
 #include <filesystem>
@@ -13,10 +12,6 @@ namespace {
 
 constexpr DWORD UserModeVersion = 3; // of drivers since Windows 2000
 
-bool IsOurEnvironment(LPCWSTR environment) {
-    return !environment || !*environment || win32::SameName(environment, win32::DriverEnvironment);
-}
-
 bool IsFile(LPCWSTR path) {
     const std::optional<std::string> utf8 = win32::ToUtf8(path);
     std::error_code ignored;
@@ -25,6 +20,14 @@ bool IsFile(LPCWSTR path) {
 
 bool IsGiven(LPCWSTR text) {
     return text && *text;
+}
+
+/// Drivers are installed for one environment, which goes without saying.
+bool IsOtherEnvironment(LPCWSTR environment) {
+    if (!IsGiven(environment))
+        return false;
+    win32::Log("spooler: environments of drivers are not supported");
+    return true;
 }
 
 /// @return a system error code
@@ -36,7 +39,7 @@ DWORD CheckNewDriver(LPWSTR server, const DRIVER_INFO_3W& record) {
     if (record.cVersion != UserModeVersion || !IsGiven(record.pName) ||
         !IsGiven(record.pDriverPath) || !IsGiven(record.pDataFile) || !IsGiven(record.pConfigFile))
         return ERROR_INVALID_PARAMETER;
-    if (!IsOurEnvironment(record.pEnvironment))
+    if (IsOtherEnvironment(record.pEnvironment))
         return ERROR_INVALID_ENVIRONMENT;
     // The description is what is read here; no code of a driver is ever loaded.
     return IsFile(record.pDataFile) ? ERROR_SUCCESS : ERROR_FILE_NOT_FOUND;
@@ -46,13 +49,7 @@ DRIVER_INFO_3W ToRecord(const PrinterDriver& driver) {
     DRIVER_INFO_3W record{};
     record.cVersion = UserModeVersion;
     record.pName = win32::Lend(driver.name);
-    record.pEnvironment = win32::Lend(win32::DriverEnvironment);
-    record.pDriverPath = win32::Lend(driver.driverPath);
     record.pDataFile = win32::Lend(driver.dataFile);
-    record.pConfigFile = win32::Lend(driver.configFile);
-    record.pHelpFile = win32::Lend(driver.helpFile);
-    record.pMonitorName = win32::Lend(driver.monitorName);
-    record.pDefaultDataType = win32::Lend(driver.defaultDataType);
     return record;
 }
 
@@ -67,17 +64,8 @@ BOOL WINAPI AddPrinterDriverW(LPWSTR name, DWORD level, LPBYTE driverInfo) {
         return win32::Fail(ERROR_INVALID_PARAMETER);
     const auto& record = *reinterpret_cast<const DRIVER_INFO_3W*>(driverInfo);
     DWORD error = CheckNewDriver(name, record);
-    if (error == ERROR_SUCCESS) {
-        PrinterDriver driver;
-        driver.name = record.pName;
-        driver.driverPath = record.pDriverPath;
-        driver.dataFile = record.pDataFile;
-        driver.configFile = record.pConfigFile;
-        driver.helpFile = win32::TextOrEmpty(record.pHelpFile);
-        driver.monitorName = win32::TextOrEmpty(record.pMonitorName);
-        driver.defaultDataType = win32::TextOrEmpty(record.pDefaultDataType);
-        error = Spooler::Instance().AddDriver(std::move(driver));
-    }
+    if (error == ERROR_SUCCESS)
+        error = Spooler::Instance().AddDriver({record.pName, record.pDataFile});
     return error == ERROR_SUCCESS || win32::Fail(error);
 }
 
@@ -88,7 +76,7 @@ BOOL WINAPI DeletePrinterDriverW(LPWSTR name, LPWSTR environment, LPWSTR driverN
     }
     if (!driverName)
         return win32::Fail(ERROR_INVALID_PARAMETER);
-    if (!IsOurEnvironment(environment))
+    if (IsOtherEnvironment(environment))
         return win32::Fail(ERROR_INVALID_ENVIRONMENT);
     const DWORD error = Spooler::Instance().RemoveDriver(driverName);
     return error == ERROR_SUCCESS || win32::Fail(error);
@@ -109,15 +97,12 @@ BOOL WINAPI GetPrinterDriverW(HANDLE printer, LPWSTR environment, DWORD level, L
         win32::Log("GetPrinterDriverW: only level 3 is supported");
         return win32::Fail(ERROR_INVALID_LEVEL);
     }
-    if (!IsOurEnvironment(environment))
+    if (IsOtherEnvironment(environment))
         return win32::Fail(ERROR_INVALID_ENVIRONMENT);
     if (!driverInfo && size > 0)
         return win32::Fail(ERROR_INVALID_USER_BUFFER);
     using Record = DRIVER_INFO_3W;
-    constexpr LPWSTR Record::*Texts[] = {&Record::pName,        &Record::pEnvironment,
-                                         &Record::pDriverPath,  &Record::pDataFile,
-                                         &Record::pConfigFile,  &Record::pHelpFile,
-                                         &Record::pMonitorName, &Record::pDefaultDataType};
+    constexpr LPWSTR Record::*Texts[] = {&Record::pName, &Record::pDataFile};
     const std::vector<Record> records = {ToRecord(*opened->printer->driver)};
     return win32::PackRecords(records, Texts, driverInfo, size, needed);
 }

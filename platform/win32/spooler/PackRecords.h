@@ -3,7 +3,6 @@
 #include "platform/win32/errors/ErrorCodes.h"
 
 #include <algorithm>
-#include <cstring>
 #include <cwchar>
 #include <vector>
 
@@ -35,7 +34,8 @@ BOOL PackRecords(const std::vector<Record>& records, LPWSTR Record::*const (&tex
             record.*text = std::copy_n(record.*text, length, room) - length;
             room += length;
         }
-        std::memcpy(buffer + i * sizeof(Record), &record, sizeof(Record));
+        std::copy_n(reinterpret_cast<const BYTE*>(&record), sizeof(Record),
+                    buffer + i * sizeof(Record));
     }
     return TRUE;
 }

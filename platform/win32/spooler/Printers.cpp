@@ -24,20 +24,11 @@ bool IsKnownPort(const std::wstring& name) {
 }
 
 PRINTER_INFO_2W ToRecord(const Printer& printer) {
-    static const std::wstring Nothing;
     PRINTER_INFO_2W record{};
     record.pPrinterName = win32::Lend(printer.name);
-    record.pShareName = win32::Lend(printer.shareName);
     record.pPortName = win32::Lend(printer.portName);
     record.pDriverName = win32::Lend(printer.driver->name);
-    record.pComment = win32::Lend(printer.comment);
-    record.pLocation = win32::Lend(printer.location);
-    record.pSepFile = win32::Lend(Nothing);
-    record.pPrintProcessor = win32::Lend(printer.printProcessor);
-    record.pDatatype = win32::Lend(printer.dataType);
-    record.pParameters = win32::Lend(Nothing);
     record.Attributes = printer.attributes;
-    record.Priority = printer.priority;
     return record;
 }
 
@@ -87,10 +78,8 @@ BOOL WINAPI EnumPrintersW(DWORD flags, LPWSTR /*name*/, DWORD level, LPBYTE prin
         if (IsAsked(*printer, flags))
             records.push_back(ToRecord(*printer));
     using Record = PRINTER_INFO_2W;
-    constexpr LPWSTR Record::*Texts[] = {
-        &Record::pPrinterName,    &Record::pShareName, &Record::pPortName, &Record::pDriverName,
-        &Record::pComment,        &Record::pLocation,  &Record::pSepFile,  &Record::pDatatype,
-        &Record::pPrintProcessor, &Record::pParameters};
+    constexpr LPWSTR Record::*Texts[] = {&Record::pPrinterName, &Record::pPortName,
+                                         &Record::pDriverName};
     if (!win32::PackRecords(records, Texts, printers, size, needed))
         return FALSE;
     *returned = static_cast<DWORD>(records.size());
@@ -114,9 +103,8 @@ BOOL WINAPI OpenPrinterW(LPWSTR printerName, LPHANDLE printer, LPPRINTER_DEFAULT
     std::shared_ptr<Printer> found = Spooler::Instance().Find(printerName);
     if (!found)
         return win32::Fail(ERROR_INVALID_PRINTER_NAME);
-    const DWORD asked = defaults ? defaults->DesiredAccess : 0;
     auto opened = std::make_shared<OpenedPrinter>(
-        OpenedPrinter{std::move(found), asked != 0 ? asked : PRINTER_ACCESS_USE});
+        OpenedPrinter{std::move(found), defaults ? defaults->DesiredAccess : 0});
     *printer = Spooler::Instance().Handles().Add(std::move(opened));
     return TRUE;
 }
@@ -140,11 +128,7 @@ HANDLE WINAPI AddPrinterW(LPWSTR name, DWORD level, LPBYTE printer) {
     error = CheckNewPrinter(name, record);
     if (error == ERROR_SUCCESS) {
         added->name = record.pPrinterName;
-        added->shareName = win32::TextOrEmpty(record.pShareName);
         added->portName = record.pPortName;
-        added->comment = win32::TextOrEmpty(record.pComment);
-        added->location = win32::TextOrEmpty(record.pLocation);
-        added->priority = record.Priority != 0 ? record.Priority : 1;
         error = Spooler::Instance().AddPrinter(added, win32::TextOrEmpty(record.pDriverName));
     }
     if (error != ERROR_SUCCESS) {

@@ -8,8 +8,6 @@
 
 namespace win32 {
 
-const std::wstring DriverEnvironment = L"Windows x64";
-
 namespace {
 
 /// Finds a printer or driver by its name; end() when there is none.

@@ -31,20 +31,15 @@ public:
 
     HRESULT STDMETHODCALLTYPE Seek(LARGE_INTEGER distance, DWORD origin,
                                    ULARGE_INTEGER* newPosition) override {
-        std::uint64_t length = 0;
-        const HRESULT known = m_document->GetLength(m_input.get(), length);
-        if (FAILED(known))
-            return known;
-        std::uint64_t start = 0;
-        if (origin == STREAM_SEEK_CUR)
-            start = m_position;
-        else if (origin == STREAM_SEEK_END)
-            start = length;
-        else if (origin != STREAM_SEEK_SET)
+        if (m_document->IsReverted())
+            return STG_E_REVERTED;
+        if (origin != STREAM_SEEK_CUR) {
+            win32::Log("IStream::Seek: only distances from where the stream is are supported");
             return STG_E_INVALIDFUNCTION;
-        const std::uint64_t position = start + static_cast<std::uint64_t>(distance.QuadPart);
-        const bool isBeforeStart = distance.QuadPart < 0 && position > start;
-        const bool isBeyondReach = distance.QuadPart > 0 && position < start;
+        }
+        const std::uint64_t position = m_position + static_cast<std::uint64_t>(distance.QuadPart);
+        const bool isBeforeStart = distance.QuadPart < 0 && position > m_position;
+        const bool isBeyondReach = distance.QuadPart > 0 && position < m_position;
         if (isBeforeStart || isBeyondReach)
             return STG_E_INVALIDFUNCTION;
         m_position = position;
@@ -76,9 +71,6 @@ public:
             return STG_E_INVALIDNAME;
         if (reserved1 || reserved2 != 0)
             return STG_E_INVALIDPARAMETER;
-        if (mode == (STGM_WRITE | STGM_SHARE_EXCLUSIVE) ||
-            mode == (STGM_READWRITE | STGM_SHARE_EXCLUSIVE))
-            return STG_E_ACCESSDENIED; // the storage was opened for reading
         if (mode != (STGM_READ | STGM_SHARE_EXCLUSIVE))
             return STG_E_INVALIDFLAG;
         GsfInputPointer input;
@@ -130,15 +122,13 @@ HRESULT WINAPI StgOpenStorage(const WCHAR* fileName, IStorage* priority, DWORD m
         win32::Log("StgOpenStorage: priority storages and exclusions are not supported");
         return STG_E_INVALIDPARAMETER;
     }
-    const bool isShared = mode == (STGM_READ | STGM_SHARE_DENY_WRITE);
-    if (!isShared && mode != (STGM_READ | STGM_SHARE_EXCLUSIVE)) {
-        win32::Log("StgOpenStorage: storages are opened for reading, and not beside a writer");
+    if (mode != (STGM_READ | STGM_SHARE_DENY_WRITE)) {
+        win32::Log("StgOpenStorage: storages are opened for reading, beside others that read");
         return STG_E_INVALIDFLAG;
     }
     std::shared_ptr<win32::OpenFile> file;
-    bool existed = false;
-    const win32::OpenRequest request{GENERIC_READ, isShared ? FILE_SHARE_READ : 0, OPEN_EXISTING};
-    const DWORD error = win32::OpenFile::Open(fileName, request, file, existed);
+    const win32::OpenRequest request{GENERIC_READ, FILE_SHARE_READ, OPEN_EXISTING};
+    const DWORD error = win32::OpenFile::Open(fileName, request, file);
     if (error != ERROR_SUCCESS)
         return ToStorageError(error);
     auto document = std::make_shared<Document>(std::move(file), win32::ToReadableUtf8(fileName));

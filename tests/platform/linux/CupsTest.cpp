@@ -1,8 +1,7 @@
 // The queues of a print server as the spooler shows them. Each case runs in a process of its own,
 // since the spooler remembers for a while what a server answered.
 
-#include <windows.h>
-#include <winspool.h>
+#include "tests/platform/PrinterRecords.h"
 
 #include <arpa/inet.h>
 #include <cups/cups.h>
@@ -10,22 +9,18 @@
 #include <sys/socket.h>
 
 #include <chrono>
-#include <cstdio>
 #include <cstdlib>
-#include <map>
 #include <string>
 #include <thread>
 #include <vector>
 
 namespace {
 
-struct Queue {
+constexpr struct {
     const char* name;
     const char* driver;
     int type;
-};
-
-constexpr Queue Queues[] = {
+} Queues[] = {
     {"Farbe", "Example Color Printer", CUPS_PRINTER_DEFAULT},
     {"Gr\xC3\xB6\xC3\x9F"
      "e A0",
@@ -52,7 +47,7 @@ void AnswerWithQueues(http_t* http) {
     while (ippRead(http, request) == IPP_STATE_ATTRIBUTE) {
     }
     ipp_t* response = ippNewResponse(request);
-    for (const Queue& queue : Queues) {
+    for (const auto& queue : Queues) {
         ippAddString(response, IPP_TAG_PRINTER, IPP_TAG_NAME, "printer-name", nullptr, queue.name);
         ippAddString(response, IPP_TAG_PRINTER, IPP_TAG_TEXT, "printer-make-and-model", nullptr,
                      queue.driver);
@@ -70,6 +65,13 @@ void AnswerWithQueues(http_t* http) {
     ippDelete(response);
 }
 
+/// Tells whether the queue asked for has a printer description: all but the raw one.
+void AnswerAboutDescription(http_t* http, const std::string& resource) {
+    httpClearFields(http);
+    httpWriteResponse(http,
+                      resource == "/printers/raw.ppd" ? HTTP_STATUS_NOT_FOUND : HTTP_STATUS_OK);
+}
+
 void Serve(int listener) {
     while (http_t* http = httpAcceptConnection(listener, 1)) {
         char resource[1024];
@@ -83,13 +85,10 @@ void Serve(int listener) {
             }
             if (httpGetExpect(http) == HTTP_STATUS_CONTINUE)
                 httpWriteResponse(http, HTTP_STATUS_CONTINUE);
-            if (method == HTTP_STATE_POST) {
+            if (method == HTTP_STATE_POST)
                 AnswerWithQueues(http);
-            } else {
-                const bool isRaw = resource == std::string("/printers/raw.ppd");
-                httpClearFields(http);
-                httpWriteResponse(http, isRaw ? HTTP_STATUS_NOT_FOUND : HTTP_STATUS_OK);
-            }
+            else
+                AnswerAboutDescription(http, resource);
             httpFlushWrite(http);
         }
         httpClose(http);
@@ -98,23 +97,17 @@ void Serve(int listener) {
 
 std::wstring DataFileOf(LPWSTR printerName) {
     HANDLE printer = nullptr;
-    DWORD needed = 0;
     if (!OpenPrinterW(printerName, &printer, nullptr))
         return L"not opened";
-    GetPrinterDriverW(printer, nullptr, 3, nullptr, 0, &needed);
-    std::vector<BYTE> buffer(needed);
-    GetPrinterDriverW(printer, nullptr, 3, buffer.data(), needed, &needed);
+    const std::vector<BYTE> buffer = DriverRecord(printer);
     ClosePrinter(printer);
     return reinterpret_cast<const DRIVER_INFO_3W*>(buffer.data())->pDataFile;
 }
 
-/// @return one line a printer: name, driver, whether it is a connection, data file
+/// @return one line a printer: name, driver, attributes, data file
 std::vector<std::wstring> Describe(DWORD flags) {
-    DWORD needed = 0;
     DWORD count = 0;
-    EnumPrintersW(flags, nullptr, 2, nullptr, 0, &needed, &count);
-    std::vector<BYTE> buffer(needed);
-    EnumPrintersW(flags, nullptr, 2, buffer.data(), needed, &needed, &count);
+    const std::vector<BYTE> buffer = PrinterRecords(flags, count);
     const auto* records = reinterpret_cast<const PRINTER_INFO_2W*>(buffer.data());
     std::vector<std::wstring> lines;
     for (const auto* record = records; record < records + count; ++record)

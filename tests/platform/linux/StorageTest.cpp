@@ -1,63 +1,63 @@
 // Compound files and the limits of a process.
 
+#include "office/ComPointer.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
 
 #include <ole2.h>
-#include <windows.h>
 
 #include <gtest/gtest.h>
-#include <pthread.h>
+#include <sys/resource.h>
 
 namespace {
 
-struct Opening {
-    std::wstring path;
-    HRESULT result;
+/// Limits the stack of the main thread, as a thread of its own may have it.
+class SmallStack {
+public:
+    SmallStack() {
+        getrlimit(RLIMIT_STACK, &m_before);
+        const rlimit small{1 << 20, m_before.rlim_max};
+        EXPECT_EQ(0, setrlimit(RLIMIT_STACK, &small));
+    }
+    ~SmallStack() { setrlimit(RLIMIT_STACK, &m_before); }
+    SmallStack(const SmallStack&) = delete;
+    SmallStack& operator=(const SmallStack&) = delete;
+
+private:
+    rlimit m_before{};
 };
 
-void* Open(void* argument) {
-    auto* opening = static_cast<Opening*>(argument);
-    IStorage* storage = nullptr;
-    opening->result = StgOpenStorage(opening->path.c_str(), nullptr,
-                                     STGM_READ | STGM_SHARE_DENY_WRITE, nullptr, 0, &storage);
-    if (storage)
-        storage->Release();
-    return nullptr;
-}
-
-/// The result of opening a storage on a thread with a small stack.
-HRESULT OpenOnSmallStack(const std::wstring& path) {
-    Opening opening{path, E_UNEXPECTED};
-    pthread_attr_t attributes;
-    pthread_attr_init(&attributes);
-    pthread_attr_setstacksize(&attributes, 1 << 20);
-    pthread_t thread{};
-    if (pthread_create(&thread, &attributes, Open, &opening) == 0)
-        pthread_join(thread, nullptr);
-    pthread_attr_destroy(&attributes);
-    return opening.result;
+HRESULT Open(const std::filesystem::path& path) {
+    const SmallStack small;
+    ComPointer<IStorage> storage;
+    return StgOpenStorage(path.wstring().c_str(), nullptr, STGM_READ | STGM_SHARE_DENY_WRITE,
+                          nullptr, 0, storage.Receive());
 }
 
 TEST(LinuxStorages, ADirectoryDoesNotUseUpStackOrTime) {
-    const TemporaryFolder folder;
-    const auto write = [&](int entries, bool isDegenerate) {
-        CompoundFile file;
-        for (int i = 0; i < entries; ++i) {
-            std::u16string name = u"S";
-            for (const char digit : std::to_string(i))
-                name += static_cast<char16_t>(digit);
-            file.AddStream(name, "");
-        }
-        if (isDegenerate) // a reader goes down one step a sibling
-            file.MakeDirectoryDegenerate();
-        return folder.Write("deep.doc", file.Bytes()).wstring();
+    const struct {
+        int entries;
+        bool isDegenerate; // a reader goes down one step a sibling
+        HRESULT result;
+    } cases[] = {
+        {900, true, S_OK},
+        {15000, true, STG_E_DOCFILECORRUPT},
+        {50000, true, STG_E_DOCFILECORRUPT},
+        {2000, false, S_OK},
+        {25000, false, STG_E_DOCFILECORRUPT}, // a matter of time
     };
-    EXPECT_EQ(S_OK, OpenOnSmallStack(write(900, true)));
-    EXPECT_EQ(STG_E_DOCFILECORRUPT, OpenOnSmallStack(write(15000, true)));
-    EXPECT_EQ(STG_E_DOCFILECORRUPT, OpenOnSmallStack(write(50000, true)));
-    EXPECT_EQ(S_OK, OpenOnSmallStack(write(2000, false)));
-    EXPECT_EQ(STG_E_DOCFILECORRUPT, OpenOnSmallStack(write(25000, false))); // a matter of time
+    const TemporaryFolder folder;
+    for (const auto& expected : cases) {
+        CompoundFile file;
+        for (int i = 0; i < expected.entries; ++i) {
+            const std::string digits = std::to_string(i);
+            file.AddStream(std::u16string(digits.begin(), digits.end()), "");
+        }
+        if (expected.isDegenerate)
+            file.MakeDirectoryDegenerate();
+        EXPECT_EQ(expected.result, Open(folder.Write("deep.doc", file.Bytes())))
+            << expected.entries << " entries";
+    }
 }
 
 } // namespace

@@ -10,35 +10,31 @@
 /// when a value is asked for; closes itself when destroyed.
 class wxRegKey {
 public:
-    enum StdKey { HKCR, HKCU, HKLM, HKUSR };
-    enum AccessMode { Read, Write };
+    enum StdKey { HKCR, HKCU, HKLM };
 
-    /// @param fullName root key and path, separated by backslashes; the short root names
-    /// ("HKCU") serve as well
+    /// @param fullName root key and path, separated by backslashes
     explicit wxRegKey(const wxString& fullName);
     wxRegKey(StdKey root, const wxString& path);
     ~wxRegKey();
     wxRegKey(const wxRegKey&) = delete;
     wxRegKey& operator=(const wxRegKey&) = delete;
 
-    bool IsOpened() const { return m_key != nullptr; }
     bool Exists() const;
-    bool Open(AccessMode mode = Write);
-    bool Create(bool okIfExists = true);
-    void Close();
+    /// Makes the key if need be.
+    bool Create();
 
     bool HasValue(const wxString& name) const;
-    /// Reads a text; one of the expandable type has its %NAME% parts replaced from the environment
-    /// unless `raw`. An empty name is the key's default value.
-    bool QueryValue(const wxString& name, wxString& value, bool raw = false) const;
+    /// Reads a text; one of the expandable type has its %NAME% parts replaced from the environment.
+    /// An empty name is the key's default value.
+    bool QueryValue(const wxString& name, wxString& value) const;
     bool QueryValue(const wxString& name, long* value) const;
     bool SetValue(const wxString& name, long value);
     bool SetValue(const wxString& name, const wxString& value);
-    bool DeleteValue(const wxString& name);
     bool DeleteSelf();
 
 private:
-    bool OpenForQuery() const;
+    bool Open() const;
+    void Close();
 
     HKEY m_root;
     wxString m_path;
