@@ -10,20 +10,13 @@
 class FakeEngine {
 public:
     explicit FakeEngine(const std::string& script);
-    ~FakeEngine();
-    FakeEngine(const FakeEngine&) = delete;
-    FakeEngine& operator=(const FakeEngine&) = delete;
 
     /// How often it was started.
     std::size_t Starts() const;
 
-    /// Takes its program away, as when LibreOffice is removed while a client runs.
-    void Uninstall() const;
-
-    /// A script's line that hands over a PDF with one page.
-    static std::string MakePdf();
-    /// That PDF.
-    static std::string OnePage();
+    /// Lines of a script that hand over a PDF with one page.
+    /// @param contents the page's contents (object 4) and further objects
+    static std::string MakePdf(const std::string& contents = "");
 
 private:
     TemporaryFolder m_folder;

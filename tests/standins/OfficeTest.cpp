@@ -1,85 +1,124 @@
 #include "tests/standins/OfficeTest.h"
 
+#include "office/AutomationScope.h"
+#include "office/ExcelDriver.h"
+#include "office/InstalledApplications.h"
+#include "office/OfficeApplication.h"
+#include "office/OpenXmlCheck.h"
+#include "office/PowerPointDriver.h"
+#include "office/PowerPointPrintOptions.h"
+#include "office/PublisherDriver.h"
+#include "office/RunAutomation.h"
+#include "office/WordDriver.h"
 #include "tests/standins/Processes.h"
-#include "tests/standins/StandInModule.h"
 
-#include <ole2.h>
-#include <windows.h>
+#include <gmock/gmock.h>
 
-#include <wx/string.h>
-
-#include <cstdlib>
+#include <algorithm>
 
 namespace fs = std::filesystem;
 
 namespace {
 
-constexpr const wchar_t* SettingsKey = L"SOFTWARE\\Orvanta\\Office Stand-Ins";
+ResultCode PrintByDriver(const wxString& document, const wxString& folder,
+                         const wxString& printer) {
+    const PowerPointOptions options;
+    wxString output;
+    switch (ApplicationForExtension(document.AfterLast('.')).value()) {
+    case OfficeApplication::Word:
+        return PrintWordDocument(document, folder, output, nullptr, &printer);
+    case OfficeApplication::Excel:
+        return PrintExcelWorkbook(document, folder, output, nullptr, &printer);
+    case OfficeApplication::PowerPoint:
+        return PrintPowerPointPresentation(document, folder, output, nullptr, &printer, &options);
+    case OfficeApplication::Publisher:
+        return PrintPublisherDocument(document, folder, output, nullptr, &printer);
+    }
+    return Result::Failure;
+}
+
+bool PrintPresentation(const wxString& document, const wxString& output,
+                       const PowerPointOptions& options) {
+    const AutomationScope scope;
+    return RunAutomation([&] {
+        powerpoint::Application application;
+        application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint));
+        powerpoint::Presentation presentation =
+            application.GetPresentations().Open(document.wc_str(), 1, 1, 0);
+        powerpoint::PrintOptions printOptions = presentation.GetPrintOptions();
+        PutColour(printOptions, options);
+        PutContents(printOptions, options);
+        PutSwitches(printOptions, options);
+        presentation.PrintOut(-1, -1, output.wc_str(), 1, 1);
+        return true;
+    });
+}
 
 } // namespace
 
+OfficeTest::OfficeTest()
+    : StandInTest(STANDINS_FOLDER "/office.so", "SOFTWARE\\Orvanta\\Office Stand-Ins"),
+      m_installedPrinter(
+          m_printer, L"Test driver",
+          m_temporary.Write("quillon-test-printer.ppd", "*PPD-Adobe: \"4.3\"\n").wstring()) {}
+
 void OfficeTest::SetUp() {
-    m_socketsBefore = SocketsOfKilledEngines();
-    setenv("TMPDIR", m_temporary.Path().c_str(), 1);
-    const fs::path ppd = m_files.Write("printer.ppd", "*PPD-Adobe: \"4.3\"\n");
-    m_printer.emplace(Printer, L"Test driver", ppd.wstring());
-    CoInitialize(nullptr);
-    ASSERT_EQ(S_OK, StandInModule::Instance().Register());
-    RegDeleteTreeW(HKEY_CURRENT_USER, SettingsKey);
+    m_socketsBefore = AbandonedSockets();
+    StandInTest::SetUp();
+    if (!IsWordInstalled())
+        GTEST_SKIP() << "LibreOffice is not installed";
 }
 
 void OfficeTest::TearDown() {
-    EXPECT_EQ("", Leftovers());
-    RegDeleteTreeW(HKEY_CURRENT_USER, SettingsKey);
-    CoUninitialize();
-    unsetenv("TMPDIR");
+    StandInTest::TearDown();
+    // Nothing tells whose a socket is: one that goes soon is that of a test at the same time.
+    std::set<std::string> left;
+    Await([&] {
+        left = AbandonedSockets();
+        for (const std::string& socket : m_socketsBefore)
+            left.erase(socket);
+        return left.empty();
+    });
+    EXPECT_THAT(left, testing::IsEmpty());
 }
 
-void OfficeTest::SetLimit(const wchar_t* name, unsigned seconds) {
-    HKEY key = nullptr;
-    ASSERT_EQ(ERROR_SUCCESS,
-              RegCreateKeyExW(HKEY_CURRENT_USER, SettingsKey, 0, nullptr, REG_OPTION_NON_VOLATILE,
-                              KEY_WRITE, nullptr, &key, nullptr));
-    const DWORD value = seconds;
-    EXPECT_EQ(ERROR_SUCCESS, RegSetValueExW(key, name, 0, REG_DWORD,
-                                            reinterpret_cast<const BYTE*>(&value), sizeof value));
-    RegCloseKey(key);
+std::string OfficeTest::Open(const fs::path& document) {
+    return ReasonUnless(TryOpenInWord(FilterPath(document)));
 }
 
-std::string OfficeTest::Leftovers() const {
-    return LeftoversOf(m_temporary.Path(), m_files.Path()) + NewSockets();
+std::string OfficeTest::Print(const fs::path& document) {
+    return ReasonUnless(PrintByDriver(FilterPath(document), FilterPath(m_outputFolder),
+                                      m_printer) == Result::Success);
 }
 
-bool IsLibreOfficeInstalled() {
-    HKEY key = nullptr;
-    const bool isRegistered =
-        RegOpenKeyExW(HKEY_CLASSES_ROOT, L"Word.Application", 0, KEY_READ, &key) == ERROR_SUCCESS;
-    if (isRegistered)
-        RegCloseKey(key);
-    return isRegistered;
+std::string OfficeTest::Print(const fs::path& document, const PowerPointOptions& options) {
+    return ReasonUnless(
+        PrintPresentation(FilterPath(document), FilterPath(PrintedFile(document)), options));
 }
 
-/// The sockets have names that do not tell whose they are: one that goes at once may be that of a
-/// test which runs at the same time.
-std::string OfficeTest::NewSockets() const {
-    std::string found;
-    Await(
-        [&] {
-            found.clear();
-            for (const std::string& socket : SocketsOfKilledEngines()) {
-                if (m_socketsBefore.count(socket) == 0)
-                    found += "socket " + socket + "\n";
-            }
-            return found.empty();
-        },
-        std::chrono::seconds(1));
-    return found;
+fs::path OfficeTest::PrintedFile(const fs::path& document) const {
+    return m_outputFolder / document.filename().replace_extension(".ps");
 }
 
-std::wstring WidePath(const fs::path& path) {
-    return wxString::FromUTF8(path.string()).ToStdWstring(); // whatever the locale
+fs::path OfficeTest::NewDocument(const std::string& name) const {
+    static int number = 0;
+    return m_files.Write(name, "Document " + std::to_string(++number));
 }
 
-std::wstring SamplePath(const std::string& name) {
-    return WidePath(fs::path(SAMPLES_FOLDER) / name);
+pid_t OfficeTest::AwaitLibreOffice() const {
+    Await([&] {
+        const fs::directory_iterator folders(m_temporary.Path());
+        return std::any_of(begin(folders), end(folders), [](const fs::directory_entry& folder) {
+            return fs::exists(folder.path() / "profile/.lock");
+        });
+    });
+    return AwaitEngine();
+}
+
+fs::path Sample(const std::string& name) {
+    return fs::path(SAMPLES_FOLDER) / name;
+}
+
+wxString FilterPath(const fs::path& path) {
+    return wxString::FromUTF8(path.string()); // whatever the locale
 }

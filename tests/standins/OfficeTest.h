@@ -1,51 +1,41 @@
 #pragma once
 
-#include "tests/support/TemporaryFolder.h"
+#include "plugin/PowerPointOptions.h"
+#include "tests/standins/StandInTest.h"
 #include "tests/support/TestPrinter.h"
 
-#include <gtest/gtest.h>
-
-#include <optional>
-#include <set>
-#include <string>
-
-/// A path as the Windows API takes it.
-std::wstring WidePath(const std::filesystem::path& path);
-
-/// A machine with the Office stand-ins registered and one printer; temporary files go to a folder
-/// of the test's own. After the test no process and no file of the stand-ins may be left.
-class OfficeTest : public testing::Test {
+/// A machine with the Office stand-ins and one printer, driven by the filter itself. Tests are
+/// skipped where LibreOffice is not installed.
+class OfficeTest : public StandInTest {
 protected:
+    OfficeTest();
     void SetUp() override;
     void TearDown() override;
 
-    /// Sets a number among the stand-ins' settings, for instance "StallSeconds".
-    static void SetLimit(const wchar_t* name, unsigned seconds);
-    /// What the stand-ins have left behind so far: processes, files; empty when all is clean.
-    std::string Leftovers() const;
+    // Each answers what the application has logged of its failure; empty when all went well.
 
-    std::wstring PathOf(const std::filesystem::path& name) const {
-        return WidePath(m_files / name);
-    }
+    /// Opens a document in Word and closes it, as screening does.
+    std::string Open(const std::filesystem::path& document);
+    /// Prints a document by the driver of its application, to PrintedFile(document).
+    std::string Print(const std::filesystem::path& document);
+    /// Prints a presentation as the options say, without the waits of its driver.
+    std::string Print(const std::filesystem::path& document, const PowerPointOptions& options);
 
-    static constexpr const wchar_t* Printer = L"Test printer";
+    /// Where the output of a document goes.
+    std::filesystem::path PrintedFile(const std::filesystem::path& document) const;
+    /// Writes a document whose bytes no test before has opened.
+    std::filesystem::path NewDocument(const std::string& name = "new.docx") const;
+    /// Waits until LibreOffice has made the socket that it leaves behind when it is killed.
+    pid_t AwaitLibreOffice() const;
 
-    TemporaryFolder m_files; ///< documents and output
-    TemporaryFolder m_temporary;
-    std::optional<TestPrinter> m_printer;
+    std::wstring m_printer = L"Test printer";
+    std::filesystem::path m_outputFolder = m_files.Path();
 
 private:
-    std::string NewSockets() const;
-
+    TestPrinter m_installedPrinter;
     std::set<std::string> m_socketsBefore;
 };
 
-/// Skips the test where LibreOffice is not installed.
-#define NEEDS_LIBREOFFICE()                                                                        \
-    if (!IsLibreOfficeInstalled())                                                                 \
-    GTEST_SKIP() << "LibreOffice is not installed"
-
-bool IsLibreOfficeInstalled();
-
-/// The full path of a sample document.
-std::wstring SamplePath(const std::string& name);
+std::filesystem::path Sample(const std::string& name);
+/// A file's path as the filter takes it.
+wxString FilterPath(const std::filesystem::path& path);

@@ -1,15 +1,14 @@
 #include "tests/standins/FakeEngine.h"
-#include "tests/standins/OfficeClient.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/SmallFileSystem.h"
 
 #include <gmock/gmock.h>
 #include <sys/stat.h>
-#include <unistd.h>
 
 #include <cstdlib>
 
 namespace fs = std::filesystem;
+using testing::EndsWith;
 using testing::HasSubstr;
 using testing::StartsWith;
 
@@ -17,109 +16,94 @@ namespace {
 
 class OutputFaultsTest : public OfficeTest {
 protected:
-    /// Prints a document of one page.
-    /// @return what was raised
-    std::wstring Print(const fs::path& output) {
+    /// Prints a document of one page into a folder, where it becomes "printed.ps".
+    std::string PrintInto(const fs::path& folder) {
         const FakeEngine engine(FakeEngine::MakePdf());
-        WordClient word;
-        word::Document document =
-            word.Open(WidePath(m_files.Write("printed.docx", "A document to print")));
-        return RaisedBy([&] { PrintDocument(document, PrintArguments(WidePath(output))); });
+        m_outputFolder = folder;
+        return Print(m_files.Write("printed.docx", "A document to print"));
     }
 };
 
-std::vector<std::string> NamesIn(const fs::path& folder) {
-    std::vector<std::string> names;
-    for (const fs::directory_entry& entry : fs::directory_iterator(folder))
-        names.push_back(entry.path().filename());
-    return names;
+/// A page that takes for ever to draw: each form draws the next one four times.
+std::string EndlessPage() {
+    std::string objects;
+    for (int form = 4; form < 40; ++form)
+        objects += std::to_string(form) +
+                   " 0 obj<</Type/XObject/Subtype/Form/BBox[0 0 200 100]/Resources<</XObject<</X " +
+                   std::to_string(form + 1) +
+                   " 0 R>>>>/Length 24>>stream\n/X Do /X Do /X Do /X Do \nendstream endobj\n";
+    return objects;
 }
-
-#define NEEDS_MOUNT(fileSystem)                                                                    \
-    if (!(fileSystem).IsMounted())                                                                 \
-    GTEST_SKIP() << "file systems cannot be mounted here"
 
 } // namespace
 
 TEST_F(OutputFaultsTest, AnEarlierFileIsReplacedWhenTheNewOneIsWhole) {
-    const fs::path output = m_files.Write("out.ps", "An earlier file");
-    EXPECT_EQ(L"", Print(output));
+    const fs::path output = m_files.Write("printed.ps", "An earlier file");
+    EXPECT_EQ("", PrintInto(m_files.Path()));
     EXPECT_THAT(ReadBytes(output), StartsWith("%!PS-Adobe-"));
     const mode_t mask = umask(0);
     umask(mask);
     EXPECT_EQ(0666 & ~mask, static_cast<mode_t>(fs::status(output).permissions()));
 }
 
-TEST_F(OutputFaultsTest, WhatIsNoFileIsNotReplaced) {
-    fs::create_directory(m_files / "folder.ps");
-    ASSERT_EQ(0, mkfifo((m_files / "pipe.ps").c_str(), 0600));
-    EXPECT_EQ(L"printed.docx cannot be printed to " + PathOf("folder.ps") + L": Is a directory.",
-              Print(m_files / "folder.ps"));
-    EXPECT_THAT(Print(m_files / "pipe.ps"), HasSubstr(L"cannot be printed to"));
-    EXPECT_TRUE(fs::is_fifo(m_files / "pipe.ps"));
-    EXPECT_THAT(Print(m_files / "missing/out.ps"), HasSubstr(L"No such file or directory"));
-    EXPECT_THAT(Print(m_files / "printed.docx/out.ps"), HasSubstr(L"Not a directory"));
-    EXPECT_THAT(Print(m_files / std::string(300, 'n')), HasSubstr(L"File name too long"));
+TEST_F(OutputFaultsTest, WhatCannotBeWrittenIsTold) {
+    for (const char* folder : {"folder", "pipe"})
+        fs::create_directory(m_files / folder);
+    fs::create_directory(m_files / "folder/printed.ps");
+    ASSERT_EQ(0, mkfifo((m_files / "pipe/printed.ps").c_str(), 0600));
+    const std::pair<const char*, const char*> folders[] = {
+        {"folder", "Is a directory."},
+        {"pipe", "File exists."},
+        {"missing", "No such file or directory."},
+        {"printed.docx", "Not a directory."},
+    };
+    for (const auto& [folder, reason] : folders)
+        EXPECT_EQ("Word: printed.docx cannot be printed to " +
+                      (m_files / folder / "printed.ps").string() + ": " + reason,
+                  PrintInto(m_files / folder));
+    EXPECT_TRUE(fs::is_fifo(m_files / "pipe/printed.ps"));
 }
 
-TEST_F(OutputFaultsTest, AFullFolderKeepsWhatItHas) {
+TEST_F(OutputFaultsTest, AFullOrReadOnlyFolderKeepsWhatItHas) {
     const SmallFileSystem fileSystem(m_files / "small", std::size_t{16} << 10);
     NEEDS_MOUNT(fileSystem);
-    const fs::path output = m_files.Write("small/out.ps", "An earlier file");
-    m_files.Write("small/other",
-                  std::string(std::size_t{12} << 10, 'x')); // room for one page of memory less
-    EXPECT_THAT(Print(output), HasSubstr(L"No space left on device"));
-    EXPECT_EQ("An earlier file", ReadBytes(output));
-    EXPECT_THAT(NamesIn(m_files / "small"), testing::UnorderedElementsAre("out.ps", "other"));
-}
-
-TEST_F(OutputFaultsTest, AReadOnlyFolderIsTold) {
-    const SmallFileSystem fileSystem(m_files / "small", 1 << 20);
-    NEEDS_MOUNT(fileSystem);
-    m_files.Write("small/out.ps", "An earlier file");
+    const fs::path output = m_files.Write("small/printed.ps", "An earlier file");
+    m_files.Write("small/other", std::string(std::size_t{12} << 10, 'x')); // all but a page
+    EXPECT_THAT(PrintInto(m_files / "small"), HasSubstr("No space left on device"));
     fileSystem.MakeReadOnly();
-    EXPECT_THAT(Print(m_files / "small/out.ps"), HasSubstr(L"Read-only file system"));
-    EXPECT_EQ("An earlier file", ReadBytes(m_files / "small/out.ps"));
+    EXPECT_THAT(PrintInto(m_files / "small"), EndsWith("Read-only file system."));
+    EXPECT_EQ("An earlier file", ReadBytes(output));
+    EXPECT_EQ((std::set<std::string>{"printed.docx", "small", "small/other", "small/printed.ps"}),
+              Names());
 }
 
 TEST_F(OutputFaultsTest, NoRoomForTheEngineIsTold) {
-    NEEDS_LIBREOFFICE();
     const SmallFileSystem fileSystem(m_files / "small", std::size_t{256} << 10);
     NEEDS_MOUNT(fileSystem);
     setenv("TMPDIR", (m_files / "small").c_str(), 1);
-    const std::string letter = ReadBytes(SamplePath("letter.docx"));
-    const std::pair<const char*, std::string> documents[] = {
-        {"letter.docx", letter},                             // the engine's own files do not fit
-        {"large.docx", letter + std::string(1 << 20, '\0')}, // the document does not fit
-    };
-    WordClient word;
-    for (const auto& [name, bytes] : documents) {
-        const fs::path document = m_files.Write(name, bytes + "new");
-        const std::wstring raised = RaisedBy([&] { word.Open(WidePath(document)); });
-        EXPECT_THAT(raised, testing::AnyOf(HasSubstr(L"there is no room left in "),
-                                           HasSubstr(L"No space left on device")));
+    const std::string letter = ReadBytes(Sample("letter.docx"));
+    for (const std::size_t size : {0, 1 << 20}) { // the engine's own files, or the document's copy
+        const fs::path document = m_files.Write("letter.docx", letter + std::string(size, '\0'));
+        EXPECT_THAT(Open(document), testing::AnyOf(HasSubstr("there is no room left in "),
+                                                   HasSubstr("No space left on device")));
         EXPECT_TRUE(fs::is_empty(m_files / "small"));
     }
     setenv("TMPDIR", m_temporary.Path().c_str(), 1);
 }
 
-TEST_F(OutputFaultsTest, APrintThatTakesTooLongIsEnded) {
-    NEEDS_LIBREOFFICE();
-    WordClient word;
-    word::Document document = word.Open(SamplePath("report.docx"));
-    SetLimit(L"TotalSeconds", 1);
-    PrintArguments arguments(PathOf("endless.ps"));
-    arguments.copies = COleVariant(static_cast<SHORT>(32767));
-    EXPECT_THAT(RaisedBy([&] { PrintDocument(document, arguments); }),
-                HasSubstr(L"the PostScript writer took too long"));
-    EXPECT_FALSE(fs::exists(m_files / "endless.ps"));
-}
-
-TEST_F(OutputFaultsTest, PagesThatAreNoPdfCannotBePrinted) {
-    const FakeEngine engine("echo '%PDF-1.4 and then nothing' > \"$PDF\"");
-    WordClient word;
-    word::Document document = word.Open(WidePath(m_files.Write("broken.docx", "Broken")));
-    EXPECT_THAT(RaisedBy([&] { PrintDocument(document, PrintArguments(PathOf("broken.ps"))); }),
-                StartsWith(L"broken.docx cannot be printed to"));
-    EXPECT_FALSE(fs::exists(m_files / "broken.ps"));
+TEST_F(OutputFaultsTest, PagesThatCannotBePrintedInTimeOrAtAllLeaveNoFile) {
+    SetLimit("TotalSeconds", 2);
+    const std::pair<std::string, std::string> engines[] = {
+        {FakeEngine::MakePdf(EndlessPage()), "the PostScript writer took too long."},
+        {"echo '%PDF-1.4 and then nothing' > \"$PDF\"", ""},
+    };
+    for (const auto& [script, reason] : engines) {
+        const FakeEngine engine(script);
+        const fs::path document = NewDocument();
+        const std::string output = PrintedFile(document);
+        const std::string failure = Print(document);
+        EXPECT_THAT(failure, StartsWith("Word: new.docx cannot be printed to " + output));
+        EXPECT_THAT(failure, EndsWith(reason));
+        EXPECT_FALSE(fs::exists(output));
+    }
 }
