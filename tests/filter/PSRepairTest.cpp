@@ -14,52 +14,44 @@ namespace {
 const std::string Header = "%!PS-Adobe-3.0\n";
 const std::string Body = Header + "showpage\n" + std::string(3000, '%') + "\n%%EOF\n";
 
-struct Content {
-    const char* what;
-    std::string before;
-    std::string after; ///< equal to `before` where nothing may change
-    std::int32_t result;
-};
-
-void PrintTo(const Content& content, std::ostream* out) {
-    *out << content.what;
-}
-
-Content Unchanged(const char* what, const std::string& content, std::int32_t result) {
-    return {what, content, content, result};
-}
-
-class RepairPSHeaderTest : public testing::TestWithParam<Content> {};
-
-TEST_P(RepairPSHeaderTest, CutsWhatStandsInFront) {
+TEST(RepairPSHeader, CutsWhatStandsInFront) {
+    const std::string nulBytes(3, '\0');
+    const std::string printerLanguage = "\x1b%-12345X@PJL ENTER LANGUAGE=POSTSCRIPT\r\n";
+    const struct {
+        std::string front;
+        std::string rest;
+    } cases[] = {
+        {"", Body},
+        {"", "%!PS-Adobe-"},
+        {"x", Header + nulBytes + Body},
+        {"x", Body + Body},
+        {printerLanguage, Body},
+        {std::string(400, 'x'), Header},
+        {std::string(501, 'x'), Body}, // the mark ends with byte 512
+    };
     const TemporaryFolder folder;
-    const auto path = folder.Write("a.ps", GetParam().before);
-    EXPECT_EQ(GetParam().result, RepairPSHeader(path.wstring()));
-    EXPECT_EQ(GetParam().after, ReadBytes(path));
+    for (const auto& each : cases) {
+        const auto path = folder.Write("a.ps", each.front + each.rest);
+        EXPECT_EQ(PSRepair::Done, RepairPSHeader(path.wstring()));
+        EXPECT_EQ(each.rest, ReadBytes(path));
+    }
 }
 
-const std::string NulBytes(3, '\0');
-
-INSTANTIATE_TEST_SUITE_P(
-    Borders, RepairPSHeaderTest,
-    testing::Values(
-        Unchanged("empty", "", PSRepair::NoHeader),
-        Unchanged("no header", std::string(5000, 'x'), PSRepair::NoHeader),
-        Unchanged("begins with the header", Body, PSRepair::Done),
-        Unchanged("header alone", "%!PS-Adobe-", PSRepair::Done),
-        Content{"20 bytes in front", std::string(20, 'x') + Body, Body, PSRepair::Done},
-        Content{"printer language in front",
-                "\x1b%-12345X@PJL ENTER LANGUAGE=POSTSCRIPT\r\n" + Body, Body, PSRepair::Done},
-        Content{"front longer than the rest", std::string(400, 'x') + Header, Header,
-                PSRepair::Done},
-        Content{"zero bytes behind the header", "x" + Header + NulBytes + Body,
-                Header + NulBytes + Body, PSRepair::Done},
-        Content{"a second header later", "x" + Body + Body, Body + Body, PSRepair::Done},
-        Content{"mark ends with byte 512", std::string(501, 'x') + Body, Body, PSRepair::Done},
-        Unchanged("mark ends behind byte 512", std::string(502, 'x') + Body, PSRepair::NoHeader),
-        Unchanged("zero byte in front", "ten bytes:" + NulBytes + Body, PSRepair::NoHeader),
-        Unchanged("mark cut short", "xx%!PS-Adobe", PSRepair::NoHeader)),
-    [](const auto& test) { return "Case" + std::to_string(test.index); });
+TEST(RepairPSHeader, LeavesAFileAloneThatHasNoHeaderAtItsBeginning) {
+    const std::string contents[] = {
+        "",
+        std::string(5000, 'x'),
+        "xx%!PS-Adobe",
+        std::string("zero byte: \0", 12) + Body,
+        std::string(502, 'x') + Body, // the mark ends behind byte 512
+    };
+    const TemporaryFolder folder;
+    for (const std::string& content : contents) {
+        const auto path = folder.Write("a.ps", content);
+        EXPECT_EQ(PSRepair::NoHeader, RepairPSHeader(path.wstring()));
+        EXPECT_EQ(content, ReadBytes(path));
+    }
+}
 
 TEST(RepairPSHeader, AnswersThatTheFileCannotBeOpened) {
     const TemporaryFolder folder;
@@ -77,6 +69,8 @@ TEST(RepairPSHeader, AnswersThatTheFileCannotBeOpened) {
 /// A file in memory whose nth step fails; a failing write stops half-way, as on a full disk.
 class FaultyFile : public PSRepair::File {
 public:
+    static constexpr int NoStep = -1;
+
     FaultyFile(std::string bytes, int failingStep)
         : content(std::move(bytes)), m_failingStep(failingStep) {}
 
@@ -90,7 +84,6 @@ public:
     }
     bool Write(const void* buffer, DWORD size) override {
         const DWORD written = Fails() ? size / 2 : size;
-        content.resize(std::max<std::size_t>(content.size(), m_position + written));
         content.replace(m_position, written, static_cast<const char*>(buffer), written);
         m_position += written;
         return !m_failed;
@@ -127,10 +120,9 @@ private:
 };
 
 TEST(CutToHeader, LeavesTheFileWholeWhicheverStepFails) {
-    constexpr int None = -1;
     for (const std::size_t frontSize : {1U, 20U, 501U}) {
         const std::string before = std::string(frontSize, 'x') + Body;
-        FaultyFile faultless(before, None);
+        FaultyFile faultless(before, FaultyFile::NoStep);
         ASSERT_EQ(PSRepair::Done, PSRepair::CutToHeader(faultless));
         ASSERT_EQ(Body, faultless.content);
 
@@ -143,7 +135,7 @@ TEST(CutToHeader, LeavesTheFileWholeWhicheverStepFails) {
 }
 
 TEST(CutToHeader, LeavesAloneWhatIsTooLargeToMove) {
-    FaultyFile file("x" + Body, -1);
+    FaultyFile file("x" + Body, FaultyFile::NoStep);
     file.pretendedSize = 1ULL << 32U;
     EXPECT_EQ(PSRepair::NoHeader, PSRepair::CutToHeader(file));
     EXPECT_EQ("x" + Body, file.content);

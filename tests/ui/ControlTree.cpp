@@ -4,8 +4,6 @@
 #include <wx/choice.h>
 #include <wx/panel.h>
 #include <wx/radiobut.h>
-#include <wx/sizer.h>
-#include <wx/stattext.h>
 
 namespace {
 
@@ -41,38 +39,10 @@ void Append(const wxWindow* window, std::size_t depth, std::vector<std::string>&
     }
 }
 
-struct FlagName {
-    int flag;
-    const char* name;
-};
-
-const FlagName FlagNames[] = {
-    {wxEXPAND, "EXPAND"},
-    {wxALIGN_CENTER_VERTICAL, "MIDDLE"},
-    {wxALIGN_CENTER_HORIZONTAL, "CENTRE"},
-    {wxALIGN_BOTTOM, "BOTTOM"},
-    {wxLEFT, "left"},
-    {wxRIGHT, "right"},
-    {wxTOP, "top"},
-    {wxBOTTOM, "bottom"},
-};
-
 } // namespace
 
 std::vector<std::string> WindowTree(const wxWindow* window) {
     std::vector<std::string> lines;
     Append(window, 0, lines);
-    return lines;
-}
-
-std::vector<std::string> SizerItems(const wxSizer* sizer) {
-    std::vector<std::string> lines;
-    for (const wxSizerItem* item : sizer->GetChildren()) {
-        std::string line = std::to_string(item->GetProportion());
-        for (const FlagName& flag : FlagNames)
-            if ((item->GetFlag() & flag.flag) == flag.flag)
-                line += std::string(" ") + flag.name;
-        lines.push_back(line + " " + std::to_string(item->GetBorder()));
-    }
     return lines;
 }

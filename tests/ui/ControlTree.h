@@ -3,13 +3,9 @@
 #include <string>
 #include <vector>
 
-class wxSizer;
 class wxWindow;
 
 /// The windows below `window`, one line each, indented by their depth: class, identifier, label or
 /// entries, and what sets it apart (disabled, hidden, ticked). Identifiers that wxWidgets gave are
 /// left out.
 std::vector<std::string> WindowTree(const wxWindow* window);
-
-/// The items of a sizer: proportion, flags and border.
-std::vector<std::string> SizerItems(const wxSizer* sizer);

@@ -5,15 +5,12 @@
 #include <wx/app.h>
 #include <wx/uiaction.h>
 
-#include <gmock/gmock.h>
-
 namespace {
 
 class PanelEventsTest : public PanelFixture {
 protected:
-    /// Clicks into the middle of a control with a real mouse pointer, and awaits `done`.
-    template <typename Condition>
-    bool ClickUntil(int id, Condition done) {
+    /// Clicks into a control with a real mouse pointer, and waits for its setting to be on.
+    bool ClickUntil(int id, const char* key) {
         wxUIActionSimulator mouse;
         const wxWindow* control = Find(id);
         const wxSize size = control->GetSize();
@@ -21,9 +18,9 @@ protected:
         wxYield();
         mouse.MouseClick();
         const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(10);
-        while (!done() && std::chrono::steady_clock::now() < end)
+        while (Saved()[key] != "1" && std::chrono::steady_clock::now() < end)
             wxYield();
-        return done();
+        return Saved()[key] == "1";
     }
 
     bool HandoutsEnabled(bool enabled) const {
@@ -48,17 +45,17 @@ TEST_F(PanelEventsTest, HandoutsBringTheirControlsToLife) {
 
 TEST_F(PanelEventsTest, PdfBringsTheProfileToLife) {
     BuildPanel();
+    const std::initializer_list<int> profile = {ControlId::DistillerProfile,
+                                                ControlId::DistillerProfileLabel};
     Press(ControlId::OutputPDF);
-    EXPECT_TRUE(AreEnabled({ControlId::DistillerProfile, ControlId::DistillerProfileLabel}, true));
+    EXPECT_TRUE(AreEnabled(profile, true));
     EXPECT_EQ("Press.joboptions", Saved()["SELECTEDDISTILLERPROFILE"]);
     Choose(ControlId::DistillerProfile, "Print.joboptions");
-    Settings saved = Saved();
-    EXPECT_EQ("Print.joboptions", saved["SELECTEDDISTILLERPROFILE"]);
-    EXPECT_EQ("0 1", saved["OUTPUTFILETYPEPS"] + " " + saved["OUTPUTFILETYPEPDF"]);
+    EXPECT_EQ("Print.joboptions", Saved()["SELECTEDDISTILLERPROFILE"]);
+    EXPECT_EQ("0 1", Saved()["OUTPUTFILETYPEPS"] + " " + Saved()["OUTPUTFILETYPEPDF"]);
     Press(ControlId::OutputPS);
-    EXPECT_TRUE(AreEnabled({ControlId::DistillerProfile, ControlId::DistillerProfileLabel}, false));
-    saved = Saved();
-    EXPECT_EQ("1 0", saved["OUTPUTFILETYPEPS"] + " " + saved["OUTPUTFILETYPEPDF"]);
+    EXPECT_TRUE(AreEnabled(profile, false));
+    EXPECT_EQ("1 0", Saved()["OUTPUTFILETYPEPS"] + " " + Saved()["OUTPUTFILETYPEPDF"]);
 }
 
 TEST_F(PanelEventsTest, ThePrinterDecidesWhetherTheNoteIsShown) {
@@ -76,33 +73,31 @@ TEST_F(PanelEventsTest, ThePrinterDecidesWhetherTheNoteIsShown) {
 
 TEST_F(PanelEventsTest, EachControlSetsItsOwnSetting) {
     BuildPanel();
-    const struct {
-        int id;
-        const char* key;
-    } boxes[] = {
-        {ControlId::ScaleToFitPaper, "SCALETOFITPAGE"},
-        {ControlId::PrintHiddenSlides, "PRINTHIDDENSLIDES"},
-        {ControlId::FrameSlides, "FRAMESLIDES"},
-        {ControlId::HighQuality, "HIGHQUALITY"},
-        {ControlId::PrintCommentsAndInkMarkup, "PRINTCOMMENTSANDINKMARKUP"},
-    };
-    for (const auto& box : boxes) {
+    Settings expected = Saved();
+    for (const auto& [box, key] :
+         {std::pair<int, const char*>{ControlId::ScaleToFitPaper, "SCALETOFITPAGE"},
+          {ControlId::PrintHiddenSlides, "PRINTHIDDENSLIDES"},
+          {ControlId::FrameSlides, "FRAMESLIDES"},
+          {ControlId::HighQuality, "HIGHQUALITY"},
+          {ControlId::PrintCommentsAndInkMarkup, "PRINTCOMMENTSANDINKMARKUP"}}) {
         for (const bool ticked : {true, false}) {
-            Settings expected = Saved();
-            expected[box.key] = ticked ? "1" : "0";
-            Tick(box.id, ticked);
-            EXPECT_EQ(expected, Saved()) << box.key;
+            expected[key] = ticked ? "1" : "0";
+            Tick(box, ticked);
+            EXPECT_EQ(expected, Saved()) << key;
         }
     }
+    expected["COLOR"] = "Grayscale";
     Choose(ControlId::Colour, "Grayscale");
+    EXPECT_EQ(expected, Saved());
+    expected["SLIDESPERPAGE"] = "3";
     Choose(ControlId::SlidesPerPage, "3");
-    Press(ControlId::OrderVertical);
-    Settings saved = Saved();
-    EXPECT_EQ("Grayscale 3 0 1", saved["COLOR"] + " " + saved["SLIDESPERPAGE"] + " " +
-                                     saved["HANDOUTSHORIZONTAL"] + " " + saved["HANDOUTSVERTICAL"]);
-    Press(ControlId::OrderHorizontal);
-    saved = Saved();
-    EXPECT_EQ("1 0", saved["HANDOUTSHORIZONTAL"] + " " + saved["HANDOUTSVERTICAL"]);
+    EXPECT_EQ(expected, Saved());
+    for (const bool vertical : {true, false}) {
+        expected["HANDOUTSVERTICAL"] = vertical ? "1" : "0";
+        expected["HANDOUTSHORIZONTAL"] = vertical ? "0" : "1";
+        Press(vertical ? ControlId::OrderVertical : ControlId::OrderHorizontal);
+        EXPECT_EQ(expected, Saved());
+    }
 }
 
 TEST_F(PanelEventsTest, AnswersARealMouse) {
@@ -112,11 +107,9 @@ TEST_F(PanelEventsTest, AnswersARealMouse) {
     m_host->Show();
     m_host->Raise();
     wxYield();
-    EXPECT_TRUE(ClickUntil(ControlId::FrameSlides, [&] { return Saved()["FRAMESLIDES"] == "1"; }));
-    EXPECT_TRUE(
-        ClickUntil(ControlId::OrderVertical, [&] { return Saved()["HANDOUTSVERTICAL"] == "1"; }));
-    EXPECT_TRUE(
-        ClickUntil(ControlId::OutputPDF, [&] { return Saved()["OUTPUTFILETYPEPDF"] == "1"; }));
+    EXPECT_TRUE(ClickUntil(ControlId::FrameSlides, "FRAMESLIDES"));
+    EXPECT_TRUE(ClickUntil(ControlId::OrderVertical, "HANDOUTSVERTICAL"));
+    EXPECT_TRUE(ClickUntil(ControlId::OutputPDF, "OUTPUTFILETYPEPDF"));
     EXPECT_TRUE(Find(ControlId::DistillerProfile)->IsEnabled());
     EXPECT_EQ("0", Saved()["HANDOUTSHORIZONTAL"]);
 }

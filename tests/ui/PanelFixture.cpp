@@ -19,14 +19,22 @@ PanelFixture::PanelFixture() {
 }
 
 PanelFixture::~PanelFixture() {
-    if (m_host)
-        m_host->Destroy();
-    wxTheApp->ProcessIdle(); // deletes what was destroyed
+    CloseHost();
     RegDeleteTreeW(HKEY_LOCAL_MACHINE, DistillerKey);
 }
 
+void PanelFixture::CloseHost() {
+    if (m_host)
+        m_host->Destroy();
+    m_host = nullptr;
+    wxTheApp->ProcessIdle(); // deletes what was destroyed
+}
+
 void PanelFixture::BuildPanel(const Settings& settings) {
+    CloseHost();
+    m_plugin.emplace();
     m_office.emplace(m_machine.applications, m_machine.officeVersion);
+    m_testPrinters.clear();
     const std::wstring ppd = m_folder.Write("a.ppd", "x").wstring();
     for (const std::wstring& printer : m_machine.printers)
         m_testPrinters.push_back(std::make_unique<TestPrinter>(printer, L"Test driver", ppd));
@@ -91,28 +99,23 @@ bool PanelFixture::AreEnabled(std::initializer_list<int> ids, bool enabled) cons
 }
 
 void PanelFixture::Choose(int id, const char* entry) {
-    wxChoice* choice = Choice(id);
-    ASSERT_TRUE(choice->SetStringSelection(wxString::FromUTF8(entry))) << entry;
-    wxCommandEvent event(wxEVT_CHOICE, id);
-    event.SetEventObject(choice);
-    event.SetInt(choice->GetSelection());
-    choice->ProcessWindowEvent(event);
+    ASSERT_TRUE(Choice(id)->SetStringSelection(wxString::FromUTF8(entry))) << entry;
+    Tell(wxEVT_CHOICE, id, Choice(id)->GetSelection());
 }
 
 void PanelFixture::Tick(int id, bool ticked) {
-    auto* box = dynamic_cast<wxCheckBox*>(Find(id));
-    box->SetValue(ticked);
-    wxCommandEvent event(wxEVT_CHECKBOX, id);
-    event.SetEventObject(box);
-    event.SetInt(ticked ? 1 : 0);
-    box->ProcessWindowEvent(event);
+    dynamic_cast<wxCheckBox*>(Find(id))->SetValue(ticked);
+    Tell(wxEVT_CHECKBOX, id, ticked ? 1 : 0);
 }
 
 void PanelFixture::Press(int id) {
-    auto* button = dynamic_cast<wxRadioButton*>(Find(id));
-    button->SetValue(true);
-    wxCommandEvent event(wxEVT_RADIOBUTTON, id);
-    event.SetEventObject(button);
-    event.SetInt(1);
-    button->ProcessWindowEvent(event);
+    dynamic_cast<wxRadioButton*>(Find(id))->SetValue(true);
+    Tell(wxEVT_RADIOBUTTON, id, 1);
+}
+
+void PanelFixture::Tell(wxEventType type, int id, int value) {
+    wxCommandEvent event(type, id);
+    event.SetEventObject(Find(id));
+    event.SetInt(value);
+    Find(id)->ProcessWindowEvent(event);
 }

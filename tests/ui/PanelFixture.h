@@ -32,8 +32,10 @@ protected:
     PanelFixture();
     ~PanelFixture() override;
 
-    /// Makes the machine as described and the panel on it, loaded from the settings.
+    /// Makes the machine as described, in place of an earlier one, and the panel on it, loaded from
+    /// the settings.
     void BuildPanel(const Settings& settings = {});
+    void CloseHost();
 
     /// What SaveSettings writes.
     Settings Saved();
@@ -53,7 +55,10 @@ protected:
     TemporaryFolder m_folder;
     std::optional<RecordingOffice> m_office;
     std::vector<std::unique_ptr<TestPrinter>> m_testPrinters;
-    std::optional<MSOfficePluginImpl> m_plugin{std::in_place};
+    std::optional<MSOfficePluginImpl> m_plugin;
     wxFrame* m_host = nullptr;
     wxWindow* m_panel = nullptr;
+
+private:
+    void Tell(wxEventType type, int id, int value);
 };

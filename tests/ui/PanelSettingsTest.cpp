@@ -1,10 +1,6 @@
 #include "tests/ui/PanelFixture.h"
 #include "ui/ControlIds.h"
 
-#include <wx/app.h>
-
-#include <gmock/gmock.h>
-
 namespace {
 
 class PanelSettingsTest : public PanelFixture {};
@@ -87,34 +83,28 @@ TEST_F(PanelSettingsTest, KeepTextsThatMatchNoEntry) {
     EXPECT_EQ(stored, Saved());
 }
 
-TEST_F(PanelSettingsTest, ReadFlagsByTheDigitAlone) {
+TEST_F(PanelSettingsTest, ReadFlagsByTheDigitAndHandoutsInAnyCase) {
     BuildPanel({{"HIGHQUALITY", "true"},
                 {"FRAMESLIDES", " 1"},
                 {"PRINTHIDDENSLIDES", "01"},
                 {"SCALETOFITPAGE", ""},
-                {"OUTPUTFILETYPEPS", "yes"}});
+                {"OUTPUTFILETYPEPS", "yes"},
+                {"PRINTOUTPUTTYPE", "handouts"}});
     Settings expected = Standard;
     expected["PRINTHIDDENSLIDES"] = "0";
     expected["OUTPUTFILETYPEPS"] = "0";
+    expected["PRINTOUTPUTTYPE"] = "handouts";
     EXPECT_EQ(expected, Saved());
-}
-
-TEST_F(PanelSettingsTest, TakeHandoutsInAnyCase) {
-    BuildPanel({{"PRINTOUTPUTTYPE", "handouts"}});
     EXPECT_EQ("Handouts", Selection(ControlId::Print));
     EXPECT_TRUE(AreEnabled({ControlId::SlidesPerPage, ControlId::OrderVertical}, true));
-    EXPECT_EQ("handouts", Saved()["PRINTOUTPUTTYPE"]);
 }
 
 TEST_F(PanelSettingsTest, AreThePanelsAsLongAsItLives) {
     BuildPanel();
     Tick(ControlId::FrameSlides, true);
     EXPECT_EQ("1", Saved()["FRAMESLIDES"]);
-    m_host->Destroy();
-    wxTheApp->ProcessIdle(); // deletes what was destroyed
-    m_host = nullptr;
+    CloseHost();
     EXPECT_EQ("1", Saved()["FRAMESLIDES"]); // what was collected before stays
-    m_testPrinters.clear();
     BuildPanel();
     m_plugin.reset(); // the panel is its host's
     EXPECT_TRUE(Find(ControlId::FrameSlides)->IsThisEnabled());

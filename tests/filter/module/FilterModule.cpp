@@ -1,24 +1,29 @@
 #include "tests/filter/module/FilterModule.h"
 
+#include <wx/filename.h>
+#include <wx/sstream.h>
+
 #include <gtest/gtest.h>
 
-namespace {
-
-template <typename Function>
-Function* Export(const LoadedModule& module, const char* name) {
-    Function* function = module.Find<Function>(name);
-    EXPECT_TRUE(function) << name;
-    return function;
-}
-
-} // namespace
+#define FIND_EXPORT(name) name = m_module.Find<decltype(::name)>(#name)
 
 FilterModule::FilterModule() : m_module(wxString::FromUTF8(FILTER_MODULE)) {
     EXPECT_TRUE(m_module) << "error " << GetLastError();
-    InitializePlugin = Export<decltype(::InitializePlugin)>(m_module, "InitializePlugin");
-    GetPluginInfo = Export<decltype(::GetPluginInfo)>(m_module, "GetPluginInfo");
-    GetPluginInstance = Export<decltype(::GetPluginInstance)>(m_module, "GetPluginInstance");
-    ReleasePluginInstance =
-        Export<decltype(::ReleasePluginInstance)>(m_module, "ReleasePluginInstance");
-    UninitializePlugin = Export<decltype(::UninitializePlugin)>(m_module, "UninitializePlugin");
+    FIND_EXPORT(InitializePlugin);
+    FIND_EXPORT(GetPluginInfo);
+    FIND_EXPORT(GetPluginInstance);
+    FIND_EXPORT(ReleasePluginInstance);
+    FIND_EXPORT(UninitializePlugin);
+}
+
+XmlText::XmlText(const std::string& text) {
+    wxStringInputStream stream(wxString::FromUTF8(text));
+    EXPECT_TRUE(Load(stream, "UTF-8"));
+}
+
+JobItem ItemFor(const wxString& path) {
+    JobItem item;
+    item.fileName = wxFileName(path).GetFullName();
+    item.paths.Add(path);
+    return item;
 }

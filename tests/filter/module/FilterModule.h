@@ -3,6 +3,8 @@
 #include "common/LoadedModule.h"
 #include "plugin/WQPlugin.h"
 
+#include <wx/xml/xml.h>
+
 /// The built filter module, loaded as the host loads it.
 class FilterModule {
     LoadedModule m_module;
@@ -36,14 +38,11 @@ private:
     WQPlugin* m_plugin;
 };
 
-/// The items of a screening run; deletes them, as the host does.
-class OwnedItems : public JobItemArray {
+/// An XML document from its text, UTF-8.
+class XmlText : public wxXmlDocument {
 public:
-    OwnedItems() = default;
-    OwnedItems(const OwnedItems&) = delete;
-    OwnedItems& operator=(const OwnedItems&) = delete;
-    ~OwnedItems() {
-        for (JobItem* item : *this)
-            delete item;
-    }
+    explicit XmlText(const std::string& text);
 };
+
+/// A document as screening hands it to the conversion.
+JobItem ItemFor(const wxString& path);

@@ -6,52 +6,61 @@
 
 #include <wx/filename.h>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 #include <optional>
 
 namespace {
 
-/// The outcome of a run in words: "code | names of the accepted | names of the refused".
-struct Outcome {
-    int code = 0;
-    wxArrayString refused;
-    wxArrayString spare;
-    OwnedItems items;
-
-    std::string InWords() const {
-        wxString words;
-        words << code << " |";
-        for (const JobItem* item : items)
-            words << ' ' << item->fileName;
-        words << " |";
-        for (const wxString& path : refused)
-            words << ' ' << path.AfterLast(wxFILE_SEP_PATH);
-        return words.utf8_string();
-    }
-};
+using testing::IsSupersetOf;
 
 class ScreeningTest : public testing::Test {
 protected:
     ScreeningTest() { m_plugin->Initialize(wxString()); }
+    ~ScreeningTest() override { ForgetOutcome(); }
 
     /// Writes a compound file with one stream.
     void WriteCompound(const char* name, const char16_t* stream) {
         CompoundFile file;
-        file.AddStream(stream, "content");
+        file.AddStream(u"Another", "content");
+        file.AddStream(stream, std::string(5000, 'd'));
         m_folder.Write(name, file.Bytes());
     }
 
     /// Screens files of the folder by their names; an empty name stays an empty path.
-    std::string Screen(const std::vector<std::string>& names) {
+    std::string Screen(const std::vector<wxString>& names) {
         wxArrayString files;
-        for (const std::string& name : names)
-            files.Add(name.empty() ? wxString() : wxString((m_folder / name).wstring()));
-        Outcome outcome;
-        outcome.spare.Add("old");
-        outcome.code = m_plugin->ScreenFiles(files, outcome.spare, outcome.refused, outcome.items);
-        EXPECT_TRUE(outcome.spare.empty());
-        return outcome.InWords();
+        for (const wxString& name : names)
+            files.Add(name.empty() ? name
+                                   : wxFileName(m_folder.Path().wstring(), name).GetFullPath());
+        return OutcomeInWords(ScreenPaths(files));
+    }
+
+    int ScreenPaths(const wxArrayString& paths) {
+        ForgetOutcome();
+        wxArrayString spare;
+        spare.Add("old");
+        const int code = m_plugin->ScreenFiles(paths, spare, m_refused, m_items);
+        EXPECT_TRUE(spare.empty());
+        return code;
+    }
+
+    /// "code | names of the accepted | names of the refused"
+    std::string OutcomeInWords(int code) const {
+        wxString words;
+        words << code << " |";
+        for (const JobItem* item : m_items)
+            words << ' ' << item->fileName;
+        words << " |";
+        for (const wxString& path : m_refused)
+            words << ' ' << path.AfterLast(wxFILE_SEP_PATH);
+        return words.utf8_string();
+    }
+
+    /// Deletes the items, as the host does.
+    void ForgetOutcome() {
+        WX_CLEAR_ARRAY(m_items);
+        m_refused.Clear();
     }
 
     TemporaryFolder m_folder;
@@ -62,33 +71,32 @@ protected:
     std::optional<TestPrinter> m_printer{std::in_place, L"Printer", L"Test driver",
                                          m_folder.Write("a.ppd", "x").wstring()};
     PluginUnderTest m_plugin;
+    wxArrayString m_refused;
+    JobItemArray m_items;
 };
 
-TEST_F(ScreeningTest, TakesEachKindOfDocument) {
-    WriteCompound("a.doc", u"WordDocument");
-    WriteCompound("a.xls", u"Book");
-    WriteCompound("a.ppt", u"PowerPoint Document");
-    WriteCompound("a.pps", u"PP40");
-    WriteCompound("a.PUB", u"Contents");
-    for (const char* name :
-         {"a.doc", "a.docx", "a.xls", "a.XLSX", "a.ppt", "a.pps", "a.pptx", "a.ppsx", "a.PUB"})
-        EXPECT_EQ(std::string("0 | ") + name + " |", Screen({name}));
+TEST_F(ScreeningTest, KnowsALegacyDocumentByItsStream) {
+    const std::pair<const char16_t*, const char*> cases[] = {
+        {u"WordDocument", "-1005 | a.doc |"},
+        {u"Workbook", "-1005 | a.xls |"},
+        {u"Book", "-1005 | a.xls |"},
+        {u"PowerPoint Document", "-1005 | a.ppt a.pps |"},
+        {u"PP40", "-1005 | a.ppt a.pps |"},
+        {u"Contents", "0 | a.PUB |"},
+        {u"Other", "-1005 | |"},
+    };
+    for (const auto& [stream, outcome] : cases) {
+        for (const char* name : {"a.doc", "a.xls", "a.ppt", "a.pps", "a.PUB"})
+            WriteCompound(name, stream);
+        EXPECT_EQ(outcome, Screen({"a.doc", "a.xls", "a.ppt", "a.pps", "a.PUB"}));
+    }
 }
 
-TEST_F(ScreeningTest, FillsTheItem) {
-    WriteCompound("report.final.DOC", u"WordDocument");
-    wxArrayString files;
-    files.Add((m_folder / "report.final.DOC").wstring());
-    Outcome outcome;
-    ASSERT_EQ(0, m_plugin->ScreenFiles(files, outcome.spare, outcome.refused, outcome.items));
-    ASSERT_EQ(1U, outcome.items.size());
-    const JobItem& item = *outcome.items[0];
-    EXPECT_EQ("ORV.MSOffice.1", item.pluginIdentifier);
-    EXPECT_EQ("report.final.DOC", item.fileName);
-    ASSERT_EQ(1U, item.paths.size());
-    EXPECT_EQ(files[0], item.paths[0]);
-    EXPECT_TRUE(item.spareText.empty());
-    EXPECT_EQ(0, item.spareValue);
+TEST_F(ScreeningTest, HasAnOpenXmlDocumentOpenedByItsApplication) {
+    EXPECT_EQ("0 | a.docx a.XLSX a.pptx a.ppsx |",
+              Screen({"a.docx", "a.XLSX", "a.pptx", "a.ppsx"}));
+    EXPECT_THAT(m_office->JournalInShort(),
+                IsSupersetOf({"Documents.15", "Workbooks.682", "Presentations.2004"}));
 }
 
 TEST_F(ScreeningTest, RefusesGoesOnAndStopsByTheKindOfFault) {
@@ -100,7 +108,7 @@ TEST_F(ScreeningTest, RefusesGoesOnAndStopsByTheKindOfFault) {
     m_office->On("Documents", 15, [](const auto&) { throw RecordingOffice::Raise{L"broken"}; });
 
     const struct {
-        std::vector<std::string> files;
+        std::vector<wxString> files;
         const char* outcome;
     } runs[] = {
         {{"good.doc", "note.txt"}, "-1005 | good.doc | note.txt"},
@@ -108,81 +116,80 @@ TEST_F(ScreeningTest, RefusesGoesOnAndStopsByTheKindOfFault) {
         {{"bad.doc", "good.xls"}, "0 | good.xls |"},
         {{"good.xls", "bad.doc"}, "-1005 | good.xls |"},
         {{"package.doc"}, "-1005 | |"},
-        {{"missing.doc"}, "-1005 | |"},
         {{"broken.docx"}, "-1005 | |"},
         {{"good.doc.bak", "good", ".doc", "rtf.rtf"}, "-1005 | | good.doc.bak good .doc rtf.rtf"},
         {{"good.doc", "", "good.xls"}, "-1002 | good.doc |"},
         {{}, "-1002 | |"}, // an empty list leaves the result of the run before
     };
     for (const auto& run : runs)
-        EXPECT_EQ(run.outcome, Screen(run.files)) << testing::PrintToString(run.files);
+        EXPECT_EQ(run.outcome, Screen(run.files));
 }
 
-TEST_F(ScreeningTest, RefusesAPathThatUtf8CannotHold) {
+TEST_F(ScreeningTest, StopsAtANameThatUtf8CannotHold) {
     WriteCompound("good.doc", u"WordDocument");
     const wxString good((m_folder / "good.doc").wstring());
-    for (const wchar_t lone :
-         {wchar_t(0xD800), wchar_t(0xDBFF), wchar_t(0xDC00), wchar_t(0xDFFF)}) {
-        wxArrayString files;
-        files.Add(good);
-        files.Add(wxFileName(L"/in", std::wstring(L"a") + lone + L"b.doc").GetFullPath());
-        files.Add(good);
-        Outcome outcome;
-        EXPECT_EQ(-1005,
-                  m_plugin->ScreenFiles(files, outcome.spare, outcome.refused, outcome.items));
-        EXPECT_EQ(1U, outcome.items.size());
-        ASSERT_EQ(1U, outcome.refused.size());
-        EXPECT_EQ(files[1], outcome.refused[0]);
+    constexpr wchar_t LoneSurrogates[] = {0xD800, 0xDBFF, 0xDC00, 0xDFFF};
+    for (const wchar_t lone : LoneSurrogates) {
+        const wxString odd = wxFileName(L"/in", std::wstring(L"a") + lone + L"b.doc").GetFullPath();
+        const wxString paths[] = {good, odd, good};
+        EXPECT_EQ(-1005, ScreenPaths(wxArrayString(3, paths)));
+        EXPECT_EQ(1U, m_items.size());
+        EXPECT_EQ(wxArrayString(1, &odd), m_refused);
     }
-    const char* whole[] = {"\xf0\x9f\x98\x80.doc", "\xd0\x9f\xd1\x80\xd0\xb8.doc"};
-    for (const char* name : whole) {
-        WriteCompound(name, u"WordDocument");
-        wxArrayString files;
-        files.Add(wxString::FromUTF8((m_folder / name).string()));
-        Outcome outcome;
-        EXPECT_EQ(0, m_plugin->ScreenFiles(files, outcome.spare, outcome.refused, outcome.items));
-        EXPECT_EQ(1U, outcome.items.size());
+    for (const char* whole : {"\xf0\x9f\x98\x80.doc", "\xd0\x9f\xd1\x80\xd0\xb8.doc"}) {
+        WriteCompound(whole, u"WordDocument");
+        EXPECT_EQ(std::string("0 | ") + whole + " |", Screen({wxString::FromUTF8(whole)}));
     }
 }
 
-TEST_F(ScreeningTest, StopsWhereTheMachineCannotPrint) {
+TEST_F(ScreeningTest, StopsWhereThereIsNoPrinter) {
     WriteCompound("a.doc", u"WordDocument");
+    EXPECT_TRUE(m_plugin->IsReady());
     m_printer.reset();
-    m_plugin->Initialize(wxString());
+    EXPECT_EQ(0, m_plugin->Initialize("no XML"));
+    EXPECT_FALSE(m_plugin->IsReady());
     EXPECT_EQ("-1006 | | a.doc", Screen({"a.doc", "a.doc"}));
     EXPECT_EQ("-1006 | | note.txt a.docx", Screen({"note.txt", "a.docx", "a.doc"}));
+
+    const TestPrinter distiller(L"Distiller", L"AdobePS Acrobat Distiller",
+                                m_folder.Write("a.bin", "x").wstring()); // whatever its data file
+    EXPECT_FALSE(m_plugin->IsReady()); // printers are looked for by Initialize
+    m_plugin->Initialize(wxString());
+    EXPECT_TRUE(m_plugin->IsReady());
+    EXPECT_EQ("0 | a.doc |", Screen({"a.doc"}));
 }
 
 TEST_F(ScreeningTest, StopsWhereTheApplicationIsTooOldForTheFormat) {
     WriteCompound("a.doc", u"WordDocument");
+    WriteCompound("a.xls", u"Workbook");
     m_office.reset();
     m_office.emplace(std::vector<std::wstring>{L"Word.Application"}, 11);
     EXPECT_EQ("-1006 | a.doc | a.docx", Screen({"a.doc", "a.docx", "a.doc"}));
-    // A legacy document needs some Office application only, whichever it is.
-    WriteCompound("a.xls", u"Workbook");
-    EXPECT_EQ("0 | a.xls |", Screen({"a.xls"}));
+    EXPECT_EQ("0 | a.xls |", Screen({"a.xls"})); // a legacy document needs any application
     EXPECT_EQ("-1006 | | a.xlsx", Screen({"a.xlsx"}));
     m_office.reset();
+    EXPECT_FALSE(m_plugin->IsReady()); // Office is looked for at each call
     EXPECT_EQ("-1006 | | a.doc", Screen({"a.doc"}));
 }
 
 TEST_F(ScreeningTest, OfAFolderTakesItsOwnFilesOnly) {
     const std::filesystem::path jobs = m_folder / "jobs";
     std::filesystem::create_directories(jobs / "below");
-    WriteCompound("jobs/a.doc", u"WordDocument");
+    WriteCompound("jobs/report.final.DOC", u"WordDocument");
     WriteCompound("jobs/.hidden.doc", u"WordDocument");
     WriteCompound("jobs/below/b.doc", u"WordDocument");
+    EXPECT_EQ("0 | report.final.DOC |",
+              OutcomeInWords(m_plugin->ScreenFolder(jobs.wstring(), m_refused, m_items)));
+    const JobItem& item = *m_items.at(0);
+    EXPECT_EQ("ORV.MSOffice.1", item.pluginIdentifier);
+    ASSERT_EQ(1U, item.paths.size());
+    EXPECT_EQ(wxString((jobs / "report.final.DOC").wstring()), item.paths[0]);
+    EXPECT_TRUE(item.spareText.empty());
+    EXPECT_EQ(0, item.spareValue);
 
-    Outcome outcome;
-    outcome.code = m_plugin->ScreenFolder(jobs.wstring(), outcome.refused, outcome.items);
-    EXPECT_EQ("0 | a.doc |", outcome.InWords());
-    ASSERT_EQ(1U, outcome.items.size());
-    EXPECT_EQ(wxString((jobs / "a.doc").wstring()), outcome.items[0]->paths[0]);
-
-    Outcome missing;
-    missing.code =
-        m_plugin->ScreenFolder((m_folder / "nowhere").wstring(), missing.refused, missing.items);
-    EXPECT_EQ("0 | |", missing.InWords());
+    ForgetOutcome();
+    const std::wstring nowhere = (jobs / "nowhere").wstring();
+    EXPECT_EQ("0 | |", OutcomeInWords(m_plugin->ScreenFolder(nowhere, m_refused, m_items)));
 }
 
 TEST_F(ScreeningTest, OfAListTakesACopy) {
@@ -192,9 +199,8 @@ TEST_F(ScreeningTest, OfAListTakesACopy) {
     files.Add((m_folder / "b.txt").wstring());
     const wxArrayString before = files;
     wxArrayString* list = &files;
-    Outcome outcome;
-    outcome.code = m_plugin->ScreenFileList("not looked at", outcome.refused, outcome.items, &list);
-    EXPECT_EQ("-1005 | a.doc | b.txt", outcome.InWords());
+    EXPECT_EQ("-1005 | a.doc | b.txt",
+              OutcomeInWords(m_plugin->ScreenFileList("not looked at", m_refused, m_items, &list)));
     EXPECT_EQ(before, files);
 }
 
