@@ -24,7 +24,7 @@ protected:
         CompoundFile file;
         file.AddStream(u"Another", "content");
         file.AddStream(stream, std::string(5000, 'd'));
-        m_folder.Write(name, file.Bytes());
+        m_folder.Write(std::filesystem::u8path(name), file.Bytes());
     }
 
     /// Screens files of the folder by their names; an empty name stays an empty path.
