@@ -103,6 +103,9 @@ TEST_F(Files, PositionsGoBeyondFourGibibytes) {
         LONGLONG position;
     } moves[] = {
         {0x100000005, FILE_BEGIN, ERROR_SUCCESS, 0x100000005},
+        {2, FILE_CURRENT, ERROR_SUCCESS, 0x100000007},
+        {-5, FILE_END, ERROR_SUCCESS, 5},
+        {0x100000000, FILE_CURRENT, ERROR_SUCCESS, 0x100000005},
         {-1, FILE_BEGIN, ERROR_NEGATIVE_SEEK, 0},
         {0, 7, ERROR_INVALID_PARAMETER, 0},
     };
@@ -140,22 +143,33 @@ TEST_F(Files, AClosedHandleIsInvalid) {
     EXPECT_EQ(ERROR_INVALID_HANDLE, ErrorOf(CloseHandle(handle)));
 }
 
-TEST(SplitPath, TheExtensionIsOfTheNameAlone) {
+TEST(SplitPath, FindsTheParts) {
     const struct {
         const wchar_t* path;
+        const wchar_t* drive;
+        const wchar_t* dir;
+        const wchar_t* name;
         const wchar_t* extension;
     } cases[] = {
-        {L"/etc/cups/ppd/a.PPD", L".PPD"},
-        {L"C:\\drivers\\x64/b.ppd.bak", L".bak"},
-        {L"/no.dot/here", L""},
-        {L"C:\\no.dot\\here", L""},
-        {L"/.hidden", L".hidden"},
-        {L"", L""},
+        {L"/etc/cups/ppd/a.PPD", L"", L"/etc/cups/ppd/", L"a", L".PPD"},
+        {L"C:\\drivers\\x64/b.ppd.bak", L"C:", L"\\drivers\\x64/", L"b.ppd", L".bak"},
+        {L"c.ppd", L"", L"", L"c", L".ppd"},
+        {L"/no.dot/here", L"", L"/no.dot/", L"here", L""},
+        {L"/.hidden", L"", L"/", L"", L".hidden"},
+        {L"", L"", L"", L"", L""},
     };
     for (const auto& expected : cases) {
+        wchar_t drive[_MAX_DRIVE];
+        wchar_t dir[_MAX_DIR];
+        wchar_t name[_MAX_FNAME];
         wchar_t extension[_MAX_EXT];
+        _wsplitpath(expected.path, drive, dir, name, extension);
+        EXPECT_STREQ(expected.drive, drive);
+        EXPECT_STREQ(expected.dir, dir);
+        EXPECT_STREQ(expected.name, name);
+        EXPECT_STREQ(expected.extension, extension);
         _wsplitpath(expected.path, nullptr, nullptr, nullptr, extension);
-        EXPECT_STREQ(expected.extension, extension) << expected.path;
+        EXPECT_STREQ(expected.extension, extension);
     }
 }
 

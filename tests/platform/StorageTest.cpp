@@ -113,8 +113,8 @@ TEST_F(Storages, StreamsAreReadFromTheirPosition) {
     LARGE_INTEGER distance{};
     ULARGE_INTEGER position{};
     EXPECT_EQ("ww", Read(stream, 2));
-    distance.QuadPart = 4998;
-    ASSERT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_CUR, &position));
+    distance.QuadPart = -3;
+    ASSERT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_END, &position));
     EXPECT_EQ(5000U, position.QuadPart);
     distance.QuadPart = -1;
     ASSERT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_CUR, &position));
@@ -130,6 +130,9 @@ TEST_F(Storages, StreamsAreReadFromTheirPosition) {
     EXPECT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_CUR, &position));
     EXPECT_EQ(105003U, position.QuadPart);
     EXPECT_EQ("", Read(stream, 16));
+    distance.QuadPart = 5002;
+    EXPECT_EQ(S_OK, stream->Seek(distance, STREAM_SEEK_SET, nullptr));
+    EXPECT_EQ("d", Read(stream, 16));
 }
 
 TEST_F(Storages, StreamsAreOpenedAloneAndForReading) {

@@ -1,29 +1,57 @@
 #include "platform/win32/errors/ErrorCodes.h"
 #include "platform/win32/files/OpenFile.h"
-#include "platform/win32/log/LogSink.h"
 
 #include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
+#include <limits>
 
 using win32::OpenFile;
+
+namespace {
+
+/// @return the size in bytes, or -1 with errno set
+off_t SizeOf(const OpenFile& file) {
+    struct stat status {};
+    return fstat(file.Descriptor(), &status) == 0 ? status.st_size : -1;
+}
+
+/// Where a move from `method` on leads, without going there.
+/// @return a system error code
+DWORD FindPosition(const OpenFile& file, LONGLONG distance, DWORD method, off_t& position) {
+    off_t start = 0;
+    if (method == FILE_CURRENT)
+        start = lseek(file.Descriptor(), 0, SEEK_CUR);
+    else if (method == FILE_END)
+        start = SizeOf(file);
+    else if (method != FILE_BEGIN)
+        return ERROR_INVALID_PARAMETER;
+    if (start < 0)
+        return win32::ErrorFromErrno(errno);
+    if (distance < -start)
+        return ERROR_NEGATIVE_SEEK;
+    if (distance > std::numeric_limits<LONGLONG>::max() - start)
+        return ERROR_INVALID_PARAMETER;
+    position = start + distance;
+    return ERROR_SUCCESS;
+}
+
+} // namespace
 
 BOOL WINAPI SetFilePointerEx(HANDLE file, LARGE_INTEGER distance, PLARGE_INTEGER newPosition,
                              DWORD moveMethod) {
     const std::shared_ptr<OpenFile> opened = win32::FileHandles().Find(file);
     if (!opened)
         return win32::Fail(ERROR_INVALID_HANDLE);
-    if (moveMethod != FILE_BEGIN) {
-        win32::Log("SetFilePointerEx: only distances from the beginning are supported");
-        return win32::Fail(ERROR_INVALID_PARAMETER);
-    }
-    if (distance.QuadPart < 0)
-        return win32::Fail(ERROR_NEGATIVE_SEEK);
-    if (lseek(opened->Descriptor(), distance.QuadPart, SEEK_SET) < 0)
+    off_t position = 0;
+    const DWORD error = FindPosition(*opened, distance.QuadPart, moveMethod, position);
+    if (error != ERROR_SUCCESS)
+        return win32::Fail(error);
+    if (lseek(opened->Descriptor(), position, SEEK_SET) < 0)
         return win32::Fail(win32::ErrorFromErrno(errno));
     if (newPosition)
-        *newPosition = distance;
+        newPosition->QuadPart = position;
     return TRUE;
 }
 
@@ -45,9 +73,6 @@ BOOL WINAPI GetFileSizeEx(HANDLE file, PLARGE_INTEGER size) {
         return win32::Fail(ERROR_INVALID_HANDLE);
     if (!size)
         return win32::Fail(ERROR_INVALID_PARAMETER);
-    struct stat status {};
-    if (fstat(opened->Descriptor(), &status) != 0)
-        return win32::Fail(win32::ErrorFromErrno(errno));
-    size->QuadPart = status.st_size;
-    return TRUE;
+    size->QuadPart = SizeOf(*opened);
+    return size->QuadPart >= 0 || win32::Fail(win32::ErrorFromErrno(errno));
 }

@@ -1,10 +1,20 @@
-#include "platform/win32/log/LogSink.h"
 #include "platform/win32/text/Utf8.h"
 
 #include <sys/stat.h>
 #include <wchar.h> // NOLINT(modernize-deprecated-headers): Microsoft's wide functions are in it
 
 #include <cerrno>
+#include <string_view>
+
+namespace {
+
+struct PathPart {
+    wchar_t* buffer; // may be null
+    std::size_t size;
+    std::wstring_view text;
+};
+
+} // namespace
 
 int _wstat64(const wchar_t* path, struct __stat64* status) {
     if (!path || !status) {
@@ -25,12 +35,23 @@ int _wstat64(const wchar_t* path, struct __stat64* status) {
 
 void _wsplitpath(const wchar_t* path, wchar_t* drive, wchar_t* dir, wchar_t* name,
                  wchar_t* extension) {
-    if (drive || dir || name)
-        win32::Log("_wsplitpath: only the extension can be had");
-    const std::wstring_view whole(path ? path : L"");
-    const std::wstring_view file = whole.substr(whole.find_last_of(L"/\\") + 1);
-    const std::size_t dot = file.find_last_of(L'.');
-    const std::wstring_view found = dot == std::wstring_view::npos ? L"" : file.substr(dot);
-    const std::size_t length = found.size() < _MAX_EXT ? found.copy(extension, _MAX_EXT) : 0;
-    extension[length] = L'\0';
+    std::wstring_view rest(path ? path : L"");
+    const std::size_t driveLength = rest.size() > 1 && rest[1] == L':' ? 2 : 0;
+    const std::wstring_view driveText = rest.substr(0, driveLength);
+    rest.remove_prefix(driveLength);
+    const std::wstring_view dirText = rest.substr(0, rest.find_last_of(L"/\\") + 1);
+    rest.remove_prefix(dirText.size());
+    const std::wstring_view nameText = rest.substr(0, rest.find_last_of(L'.'));
+    rest.remove_prefix(nameText.size());
+
+    const PathPart parts[] = {{drive, _MAX_DRIVE, driveText},
+                              {dir, _MAX_DIR, dirText},
+                              {name, _MAX_FNAME, nameText},
+                              {extension, _MAX_EXT, rest}};
+    bool allFit = true;
+    for (const PathPart& part : parts)
+        allFit = allFit && (!part.buffer || part.text.size() < part.size);
+    for (const PathPart& part : parts)
+        if (part.buffer) // a part that does not fit leaves them all empty
+            part.buffer[allFit ? part.text.copy(part.buffer, part.size - 1) : 0] = L'\0';
 }

@@ -17,13 +17,16 @@ struct __stat64 {
 /// Fills `status` for the file at `path`; answers 0, or -1 with errno set.
 int _wstat64(const wchar_t* path, struct __stat64* status);
 
-/// Takes the extension of a path, with its dot; both kinds of slash count.
-/// @param drive must be null, like `dir` and `name`
-/// @param extension receives at most _MAX_EXT characters; empty when it is longer
+/// Splits a path into drive, folder, name and extension (with its dot); both kinds of slash count.
+/// Each part may be null, and holds at least _MAX_DRIVE, _MAX_DIR, _MAX_FNAME or _MAX_EXT
+/// characters.
 void _wsplitpath(const wchar_t* path, wchar_t* drive, wchar_t* dir, wchar_t* name,
                  wchar_t* extension);
 }
 
+#        define _MAX_DRIVE 3
+#        define _MAX_DIR 256
+#        define _MAX_FNAME 256
 #        define _MAX_EXT 256
 
 #    endif

@@ -81,6 +81,12 @@ void Document::CloseStream(GsfInputPointer stream, const std::wstring& key) {
     m_openStreams.erase(key);
 }
 
+HRESULT Document::GetLength(GsfInput* stream, std::uint64_t& length) {
+    const std::lock_guard lock(m_mutex);
+    length = static_cast<std::uint64_t>(gsf_input_size(stream));
+    return m_reverted ? STG_E_REVERTED : S_OK;
+}
+
 HRESULT Document::Read(GsfInput* stream, std::uint64_t position, void* buffer, ULONG size,
                        ULONG& read) {
     const std::lock_guard lock(m_mutex);
@@ -97,11 +103,6 @@ HRESULT Document::Read(GsfInput* stream, std::uint64_t position, void* buffer, U
         return STG_E_READFAULT;
     read = static_cast<ULONG>(count);
     return S_OK;
-}
-
-bool Document::IsReverted() {
-    const std::lock_guard lock(m_mutex);
-    return m_reverted;
 }
 
 void Document::Revert() {

@@ -33,13 +33,14 @@ public:
     HRESULT OpenStream(const std::wstring& name, GsfInputPointer& stream, std::wstring& key);
     void CloseStream(GsfInputPointer stream, const std::wstring& key);
 
+    HRESULT GetLength(GsfInput* stream, std::uint64_t& length);
+
     /// @param position in the stream, in bytes
     /// @param read receives the number of bytes read, less than `size` at the stream's end
     HRESULT Read(GsfInput* stream, std::uint64_t position, void* buffer, ULONG size, ULONG& read);
 
     /// The storage is gone: closes the file, and the streams answer STG_E_REVERTED from now on.
     void Revert();
-    bool IsReverted();
 
 private:
     int FindChild(const std::wstring& name) const;

@@ -31,15 +31,20 @@ public:
 
     HRESULT STDMETHODCALLTYPE Seek(LARGE_INTEGER distance, DWORD origin,
                                    ULARGE_INTEGER* newPosition) override {
-        if (m_document->IsReverted())
-            return STG_E_REVERTED;
-        if (origin != STREAM_SEEK_CUR) {
-            win32::Log("IStream::Seek: only distances from where the stream is are supported");
+        std::uint64_t length = 0;
+        const HRESULT known = m_document->GetLength(m_input.get(), length);
+        if (FAILED(known))
+            return known;
+        std::uint64_t start = 0;
+        if (origin == STREAM_SEEK_CUR)
+            start = m_position;
+        else if (origin == STREAM_SEEK_END)
+            start = length;
+        else if (origin != STREAM_SEEK_SET)
             return STG_E_INVALIDFUNCTION;
-        }
-        const std::uint64_t position = m_position + static_cast<std::uint64_t>(distance.QuadPart);
-        const bool isBeforeStart = distance.QuadPart < 0 && position > m_position;
-        const bool isBeyondReach = distance.QuadPart > 0 && position < m_position;
+        const std::uint64_t position = start + static_cast<std::uint64_t>(distance.QuadPart);
+        const bool isBeforeStart = distance.QuadPart < 0 && position > start;
+        const bool isBeyondReach = distance.QuadPart > 0 && position < start;
         if (isBeforeStart || isBeyondReach)
             return STG_E_INVALIDFUNCTION;
         m_position = position;
