@@ -8,4 +8,7 @@ namespace standins {
 constexpr const wchar_t* DistillerSettingsKey = L"SOFTWARE\\Orvanta\\Distiller Stand-In";
 constexpr const wchar_t* DistillerEngineValue = L"Engine";
 
+/// The kind of the engine's work folders.
+constexpr const char* DistillerFolderKind = "distiller";
+
 } // namespace standins

@@ -1,8 +1,6 @@
 #include "standins/module/SupervisedRun.h"
 
 #include "standins/process/ChildProcess.h"
-#include "standins/process/ProcessTable.h"
-#include "standins/process/WorkFolder.h"
 
 #include <fcntl.h>
 #include <poll.h>
@@ -78,11 +76,10 @@ std::optional<Message> AwaitResult(const Channel& channel, const TimeLimits& lim
 }
 
 /// After a supervisor that did not do its work to the end. Its engine dies with it.
-void ClearAfter(ChildProcess& supervisor, const std::string& folder) {
+void ClearAfter(ChildProcess& supervisor, const SupervisedRun& run) {
     supervisor.Kill();
     supervisor.Wait();
-    EndProcessesAtHome(folder);
-    WorkFolder::Remove(folder);
+    WorkFolder::Discard(run.folder, run.clearOutside);
 }
 
 } // namespace
@@ -101,7 +98,7 @@ Message RunSupervised(const SupervisedRun& run) {
     std::optional<Message> result = AwaitResult(channel, run.limits, lost);
     if (result)
         return std::move(*result);
-    ClearAfter(*supervisor, run.folder);
+    ClearAfter(*supervisor, run);
     return Failure(run, lost);
 }
 

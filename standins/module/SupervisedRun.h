@@ -2,6 +2,7 @@
 
 #include "standins/process/Channel.h"
 #include "standins/process/Clocks.h"
+#include "standins/process/WorkFolder.h"
 
 #include <string>
 #include <vector>
@@ -15,6 +16,7 @@ struct SupervisedRun {
     std::vector<std::string> arguments; ///< beside those that every supervisor gets
     std::vector<int> descriptors;       ///< what is handed to it, in its order
     std::string folder;                 ///< the work folder, not made yet
+    WorkFolder::ClearOutside clearOutside = nullptr;
     TimeLimits limits{};
 };
 

@@ -10,10 +10,10 @@ namespace standins {
 
 namespace {
 
-/// The name that LibreOffice gives to the socket by which a second start with the same profile
-/// finds the first: the MD5 sum of the profile's address in UTF-16, each byte in as few hexadecimal
-/// digits as it needs.
-std::string SocketName(const std::string& profileUrl) {
+/// How LibreOffice tells the profile in the name of the socket by which a second start with the
+/// same profile finds the first: by the MD5 sum of the profile's address in UTF-16, each byte in as
+/// few hexadecimal digits as it needs.
+std::string SocketId(const std::string& profileUrl) {
     const std::u16string address(profileUrl.begin(), profileUrl.end());
     const std::unique_ptr<GChecksum, decltype(&g_checksum_free)> sum(g_checksum_new(G_CHECKSUM_MD5),
                                                                      g_checksum_free);
@@ -22,13 +22,13 @@ std::string SocketName(const std::string& profileUrl) {
     guint8 digest[16];
     gsize size = sizeof digest;
     g_checksum_get_digest(sum.get(), digest, &size);
-    std::string name = "OSL_PIPE_" + std::to_string(getuid()) + "_SingleOfficeIPC_";
+    std::string id;
     for (const guint8 byte : digest) {
         char digits[3];
         std::snprintf(digits, sizeof digits, "%x", byte);
-        name += digits;
+        id += digits;
     }
-    return name;
+    return id;
 }
 
 } // namespace
@@ -41,9 +41,11 @@ std::string UserInstallationUrl(const std::string& workFolder) {
 }
 
 void RemoveSocket(const std::string& workFolder) {
-    const std::string socket = SocketName(UserInstallationUrl(workFolder));
-    for (const char* folder : {"/tmp/", "/var/tmp/"})
-        unlink((folder + socket).c_str());
+    const std::string name = "SingleOfficeIPC_" + SocketId(UserInstallationUrl(workFolder));
+    // The user's number is not in it where the system has no entry for the user.
+    for (const std::string& user : {std::to_string(getuid()) + "_", std::string()})
+        for (const char* folder : {"/tmp/OSL_PIPE_", "/var/tmp/OSL_PIPE_"})
+            unlink((folder + user + name).c_str());
 }
 
 } // namespace standins

@@ -1,31 +1,123 @@
 #include "standins/process/WorkFolder.h"
 
+#include "standins/process/ProcessTable.h"
+
+#include <dirent.h>
+#include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <cerrno>
+#include <ctime>
 #include <filesystem>
+#include <memory>
 #include <random>
+#include <regex>
+#include <string_view>
 
 namespace fs = std::filesystem;
 
 namespace standins {
 
-std::string WorkFolder::NewPath(const std::string& kind) {
+namespace {
+
+constexpr const char* MarkName = "in use";
+
+/// How long a folder may be without its mark. From one to the other is a moment, unless the process
+/// is stopped in between: then its run fails.
+constexpr std::time_t LongestUnmarked = 3600; // seconds
+
+/// One path for one folder, however the environment spells it: LibreOffice names its socket by it.
+fs::path TemporaryFolder() {
     std::error_code error;
-    fs::path base = fs::temp_directory_path(error);
-    if (error)
-        base = "/tmp";
-    std::random_device random;
-    const std::uint64_t number = (static_cast<std::uint64_t>(random()) << 32) | random();
-    return fs::absolute(
-        base / ("quillon-" + kind + "-" + std::to_string(getpid()) + "-" + std::to_string(number)));
+    const fs::path folder = fs::canonical(fs::temp_directory_path(error), error);
+    return error ? fs::path("/tmp") : folder;
 }
 
-WorkFolder::WorkFolder(std::string path)
-    : m_path(std::move(path)), m_isMade(mkdir(m_path.c_str(), S_IRWXU) == 0) {}
+std::string NamePrefix(const std::string& kind) {
+    return "quillon-" + kind + "-";
+}
+
+/// Whether NewPath gives such names.
+bool IsName(std::string_view name, const std::string& prefix) {
+    static const std::regex s_numbers("[0-9]+-[0-9]+");
+    return name.substr(0, prefix.size()) == prefix &&
+           std::regex_match(name.begin() + prefix.size(), name.end(), s_numbers);
+}
+
+/// The mark gets its name when it is locked, so that an unlocked one is always an abandoned one.
+/// Where a file system has no locks, nobody can lock it, and the folder is left alone.
+/// @return closed, with errno set, when it cannot be made
+Descriptor MakeMark(const std::string& folder) {
+    const std::string mark = folder + "/" + MarkName;
+    const std::string unlocked = mark + " soon";
+    Descriptor file(
+        open(unlocked.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, S_IRUSR | S_IWUSR));
+    if (!file.IsOpen())
+        return file;
+    flock(file.Get(), LOCK_EX | LOCK_NB);
+    return rename(unlocked.c_str(), mark.c_str()) == 0 ? std::move(file) : Descriptor();
+}
+
+/// An engine may have put something else in its place.
+bool LacksMark(int folder) {
+    struct stat status {};
+    const int found = fstatat(folder, MarkName, &status, AT_SYMLINK_NOFOLLOW);
+    return found == 0 ? !S_ISREG(status.st_mode) : errno == ENOENT;
+}
+
+/// Looks whether a folder is this user's and abandoned.
+/// @param mark receives its mark, locked, if it has one
+bool IsAbandoned(int folder, Descriptor& mark) {
+    struct stat status {};
+    if (fstat(folder, &status) != 0 || status.st_uid != geteuid())
+        return false;
+    if (LacksMark(folder))
+        return std::time(nullptr) - status.st_mtime > LongestUnmarked;
+    mark = Descriptor(openat(folder, MarkName, O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC));
+    return mark.IsOpen() && flock(mark.Get(), LOCK_EX | LOCK_NB) == 0;
+}
+
+struct CloseFolder {
+    void operator()(DIR* folder) const { closedir(folder); }
+};
+
+/// The mark goes last: what is left when this process is killed meanwhile can still be told. Links
+/// are removed and not followed, also those that are put in place meanwhile.
+void Remove(const std::string& path) {
+    std::error_code ignored; // nobody is left to be told
+    for (fs::directory_iterator entry(path, ignored), end; !ignored && entry != end;
+         entry.increment(ignored)) {
+        std::error_code alsoIgnored;
+        if (entry->path().filename() != MarkName)
+            fs::remove_all(entry->path(), alsoIgnored);
+    }
+    fs::remove_all(path, ignored);
+}
+
+} // namespace
+
+std::string WorkFolder::NewPath(const std::string& kind) {
+    std::random_device random;
+    const std::uint64_t number = (static_cast<std::uint64_t>(random()) << 32) | random();
+    return TemporaryFolder() /
+           (NamePrefix(kind) + std::to_string(getpid()) + "-" + std::to_string(number));
+}
+
+WorkFolder::WorkFolder(std::string path) : m_path(std::move(path)) {
+    if (mkdir(m_path.c_str(), S_IRWXU) != 0)
+        return;
+    m_mark = MakeMark(m_path);
+    if (!m_mark.IsOpen()) {
+        const int error = errno;
+        Remove(m_path);
+        errno = error;
+    }
+}
 
 WorkFolder::~WorkFolder() {
-    if (m_isMade)
+    if (IsMade())
         Remove(m_path);
 }
 
@@ -42,9 +134,29 @@ std::uint64_t WorkFolder::Size() const {
     return sum;
 }
 
-void WorkFolder::Remove(const std::string& path) {
-    std::error_code ignored; // nobody is left to be told
-    fs::remove_all(path, ignored);
+void WorkFolder::Discard(const std::string& path, ClearOutside clearOutside) {
+    EndProcessesAtHome(path);
+    if (clearOutside)
+        clearOutside(path); // first: what is outside is found by the folder
+    Remove(path);
+}
+
+/// Names alone are looked at, without a thing asked of the system for each: there may be very many
+/// temporary files.
+void WorkFolder::DiscardAbandoned(const std::string& kind, ClearOutside clearOutside) {
+    const fs::path base = TemporaryFolder();
+    const std::string prefix = NamePrefix(kind);
+    const std::unique_ptr<DIR, CloseFolder> all(opendir(base.c_str()));
+    while (const dirent* entry = all ? readdir(all.get()) : nullptr) {
+        if (!IsName(entry->d_name, prefix))
+            continue;
+        const std::string path = base / entry->d_name;
+        const Descriptor folder(
+            open(path.c_str(), O_RDONLY | O_DIRECTORY | O_NOFOLLOW | O_CLOEXEC));
+        Descriptor mark;
+        if (folder.IsOpen() && IsAbandoned(folder.Get(), mark))
+            Discard(path, clearOutside);
+    }
 }
 
 } // namespace standins

@@ -79,15 +79,26 @@ void StandInTest::Signal(pid_t process, int number) {
 
 void StandInTest::ExpectNothingOutlivesAKilledClient(
     const std::function<void()>& work, const std::function<pid_t()>& awaitEngine) const {
-    const pid_t client = fork();
-    if (client == 0) {
-        work();
-        _exit(0);
+    for (const bool withSupervisor : {false, true}) {
+        const pid_t client = fork();
+        if (client == 0) {
+            work();
+            _exit(0);
+        }
+        EXPECT_GT(awaitEngine(), 0);
+        const pid_t supervisor = withSupervisor ? AwaitSupervisor() : 0;
+        if (withSupervisor)
+            Signal(supervisor, SIGSTOP); // it does nothing when it sees the client go
+        Signal(client, SIGKILL);
+        waitpid(client, nullptr, 0);
+        if (withSupervisor) {
+            Signal(supervisor, SIGKILL);
+            EXPECT_TRUE(Await([&] { return SupervisorsIn(m_temporary.Path()).empty(); }));
+            EXPECT_NE("", Leftovers()) << "there must be something for the next start to do";
+            Call("DllRegisterServer");
+        }
+        EXPECT_TRUE(Await([&] { return Leftovers().empty(); })) << Leftovers();
     }
-    EXPECT_GT(awaitEngine(), 0);
-    Signal(client, SIGKILL);
-    waitpid(client, nullptr, 0);
-    EXPECT_TRUE(Await([&] { return Leftovers().empty(); })) << Leftovers();
 }
 
 std::string StandInTest::Leftovers() const {

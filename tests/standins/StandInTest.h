@@ -41,7 +41,8 @@ protected:
     /// @param process has been waited for; the test fails when it is 0
     static void Signal(pid_t process, int number);
     /// Has a process of its own do `work`, kills it when `awaitEngine` has found an engine, and
-    /// expects that nothing is left.
+    /// expects that nothing is left. Then the same with the supervisor killed along: what it leaves
+    /// is to be gone with the next start of a client.
     void ExpectNothingOutlivesAKilledClient(const std::function<void()>& work,
                                             const std::function<pid_t()>& awaitEngine) const;
 

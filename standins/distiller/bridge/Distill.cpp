@@ -80,7 +80,7 @@ SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
         run.arguments.emplace_back("--profile");
         run.descriptors.push_back(profile.Get());
     }
-    run.folder = WorkFolder::NewPath("distiller");
+    run.folder = WorkFolder::NewPath(DistillerFolderKind);
     run.limits = ReadTimeLimits(DistillerSettingsKey, {60s, 600s});
     return run;
 }

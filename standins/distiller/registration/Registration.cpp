@@ -6,6 +6,7 @@
 #include "standins/module/ModulePath.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
+#include "standins/process/WorkFolder.h"
 
 #include <objbase.h>
 #include <windows.h>
@@ -33,6 +34,7 @@ HRESULT Unregister() {
 }
 
 HRESULT Register() {
+    WorkFolder::DiscardAbandoned(DistillerFolderKind, nullptr); // a client starts
     Unregister();
     const std::optional<Ghostscript> ghostscript = FindGhostscript();
     if (!ghostscript)

@@ -42,6 +42,7 @@ std::string RunEngine(const EngineJob& job, const WorkFolder& folder, EngineWatc
             return DescribeError("LibreOffice cannot be started", errno);
         std::string ended = watch.Await(engine, [&] { return folder.Size(); });
         status = engine.End();
+        RemoveSocket(job.folder); // while the folder tells of it, whatever happens to this process
         if (!ended.empty())
             return ended;
         if (!WIFEXITED(status) || WEXITSTATUS(status) != WantsRestart)
@@ -79,7 +80,6 @@ Message ConvertInFolder(const EngineJob& job, int document, const Channel& serve
 
 void Supervise(const EngineJob& job, int document, const Channel& server) {
     const Message result = ConvertInFolder(job, document, server);
-    RemoveSocket(job.folder);
     server.Send(result.kind, result.text, result.attachment.Get());
 }
 

@@ -9,6 +9,12 @@
 
 namespace standins {
 
+namespace {
+
+constexpr const char* FolderKind = "office";
+
+} // namespace
+
 EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format) {
     const std::string program = ReadEnginePath();
     if (program.empty())
@@ -23,14 +29,18 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
         "--export=" + format.exportTo,
     };
     run.descriptors = {document.descriptor.Get()};
-    run.folder = WorkFolder::NewPath("office");
+    run.folder = WorkFolder::NewPath(FolderKind);
+    run.clearOutside = RemoveSocket;
     run.limits = ReadTimeLimits();
 
     Message result = RunSupervised(run);
-    RemoveSocket(run.folder); // the supervisor may have been killed before it could
     if (result.kind != MessageKind::Done || !result.attachment.IsOpen())
         return {Descriptor(), {}, FromUtf8(result.text)};
     return {std::move(result.attachment), result.text, {}};
+}
+
+void ClearAfterKilledRuns() {
+    WorkFolder::DiscardAbandoned(FolderKind, RemoveSocket);
 }
 
 } // namespace standins

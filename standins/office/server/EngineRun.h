@@ -19,4 +19,7 @@ struct EngineResult {
 /// supervisor itself ends is seen to here.
 EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format);
 
+/// Clears away what is left of runs whose processes were all killed.
+void ClearAfterKilledRuns();
+
 } // namespace standins

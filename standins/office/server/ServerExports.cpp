@@ -1,6 +1,7 @@
 // What COM asks of an in-process server.
 
 #include "standins/office/server/ClassFactory.h"
+#include "standins/office/server/EngineRun.h"
 #include "standins/office/server/ExportCache.h"
 #include "standins/office/server/Registration.h"
 
@@ -46,7 +47,10 @@ STDAPI DllCanUnloadNow() {
 }
 
 STDAPI DllRegisterServer() {
-    return Guarded(standins::RegisterApplications);
+    return Guarded([] {
+        standins::ClearAfterKilledRuns(); // a client starts
+        return standins::RegisterApplications();
+    });
 }
 
 STDAPI DllUnregisterServer() {
