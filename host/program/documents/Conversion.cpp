@@ -42,7 +42,7 @@ void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
 }
 
 /// Moves the output, and what else the filter has made of the document, to the output folder.
-/// @return whether the output is there
+/// @return whether the output is there for certain
 bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wxString& baseName,
                 wxString& fault) {
     const wxString ownBase = wxFileName(outputName).GetName();
@@ -54,7 +54,8 @@ bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wx
         if (name != outputName && name.StartsWith(ownBase + '.', &ending))
             workplace.Deliver(name, baseName + '.' + ending, ignored);
     }
-    return workplace.Deliver(outputName, baseName + '.' + wxFileName(outputName).GetExt(), fault);
+    return workplace.Deliver(outputName, baseName + '.' + wxFileName(outputName).GetExt(), fault) &&
+           workplace.ConfirmDelivery(fault);
 }
 
 /// Runs the filter in the workplace and takes over what it made.

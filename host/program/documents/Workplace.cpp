@@ -1,17 +1,26 @@
 #include "host/program/documents/Workplace.h"
 
 #include "host/program/PathText.h"
+#include "host/program/system/DurableMove.h"
 
 #include <windows.h>
 
 #include <wx/utils.h>
 
+#include <chrono>
+#include <regex>
+
 namespace fs = std::filesystem;
+using namespace std::chrono_literals;
 
 namespace {
 
 constexpr const char* NamePrefix = ".quillon-";
 constexpr const char* MarkName = "in use";
+
+/// How long a workplace may be without its mark. From one to the other is a moment, unless the
+/// program is stopped in between: then it makes another workplace.
+constexpr std::chrono::hours LongestUnmarked = 1h;
 
 /// Opens the file that marks a workplace as in use; nobody else can while this one has it.
 /// @param disposition CREATE_NEW for one's own, OPEN_EXISTING to see whether another is abandoned
@@ -21,6 +30,45 @@ std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
     HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, disposition,
                               FILE_ATTRIBUTE_NORMAL, nullptr);
     return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
+}
+
+/// Whether it is a folder, and no link to one, with a name such as Create gives.
+bool IsWorkplace(const fs::directory_entry& entry) {
+    static const std::regex s_names(R"(\.quillon-[0-9]+-[0-9]+)");
+    const std::string name = entry.path().filename().u8string();
+    std::error_code error;
+    return name.rfind(NamePrefix, 0) == 0 && std::regex_match(name, s_names) &&
+           fs::is_directory(entry.symlink_status(error));
+}
+
+/// Whether nobody else can open the mark that this process has opened. Where a file system has no
+/// locks, another may have it as well.
+bool IsLocked(const fs::path& workplace) {
+    return !OpenMark(workplace, OPEN_EXISTING);
+}
+
+/// Whether its program was ended between the making of the workplace and of its mark.
+bool IsLeftUnmarked(const fs::path& workplace) {
+    std::error_code error;
+    const bool isMarked = fs::exists(workplace / MarkName, error);
+    if (isMarked || error)
+        return false;
+    const fs::file_time_type changed = fs::last_write_time(workplace, error);
+    return !error && fs::file_time_type::clock::now() - changed > LongestUnmarked;
+}
+
+/// The mark goes last: what is left when this program is ended meanwhile can still be told.
+void Remove(const fs::path& workplace, std::shared_ptr<void> mark) {
+    std::error_code ignored;
+    for (fs::directory_iterator entry(workplace, ignored), end; !ignored && entry != end;
+         entry.increment(ignored)) {
+        std::error_code alsoIgnored;
+        if (entry->path().filename() != MarkName)
+            fs::remove_all(entry->path(), alsoIgnored);
+    }
+    fs::remove_all(workplace, ignored); // while nobody else can mark it
+    mark.reset();
+    fs::remove_all(workplace, ignored); // an open file could not be removed everywhere
 }
 
 } // namespace
@@ -48,14 +96,12 @@ void Workplace::RemoveAbandoned(const fs::path& outputFolder) {
     std::error_code error;
     for (fs::directory_iterator entry(outputFolder, error), end; !error && entry != end;
          entry.increment(error)) {
-        const bool isWorkplace = entry->path().filename().u8string().rfind(NamePrefix, 0) == 0;
-        std::shared_ptr<void> mark = isWorkplace ? OpenMark(entry->path(), OPEN_EXISTING) : nullptr;
-        if (!mark)
+        if (!IsWorkplace(*entry))
             continue;
-        std::error_code ignored;
-        fs::remove_all(entry->path(), ignored); // while nobody else can mark it
-        mark.reset();
-        fs::remove_all(entry->path(), ignored); // an open file could not be removed everywhere
+        std::shared_ptr<void> mark = OpenMark(entry->path(), OPEN_EXISTING);
+        if (mark ? !IsLocked(entry->path()) : !IsLeftUnmarked(entry->path()))
+            continue;
+        Remove(entry->path(), std::move(mark));
     }
 }
 
@@ -75,18 +121,24 @@ Workplace::Workplace(Workplace&& other) noexcept
 }
 
 Workplace::~Workplace() {
-    m_mark.reset(); // an open file could not be removed everywhere
-    std::error_code ignored;
     if (!m_path.empty())
-        fs::remove_all(m_path, ignored);
+        Remove(m_path, std::move(m_mark));
 }
 
 bool Workplace::Deliver(const wxString& name, const wxString& newName, wxString& fault) const {
     const fs::path from = m_path / FromText(name);
     const fs::path to = m_path.parent_path() / FromText(newName);
-    std::error_code error;
-    fs::rename(from, to, error);
+    const std::error_code error = MoveDurably(from, to);
     if (error)
         fault = "the output could not be put in place as " + Shown(to) + ": " + Because(error);
+    return !error;
+}
+
+bool Workplace::ConfirmDelivery(wxString& fault) const {
+    const fs::path outputFolder = m_path.parent_path();
+    const std::error_code error = SyncFolder(outputFolder);
+    if (error)
+        fault = "the output is in " + Shown(outputFolder) +
+                ", but may be lost if the power fails: " + Because(error);
     return !error;
 }

@@ -14,7 +14,8 @@ public:
     static std::optional<Workplace> Create(const std::filesystem::path& outputFolder,
                                            wxString& fault);
 
-    /// Removes the workplaces of programs that were ended before they could do it.
+    /// Removes the workplaces of programs that were ended before they could do it: those whose mark
+    /// nobody has, and old ones that have none.
     static void RemoveAbandoned(const std::filesystem::path& outputFolder);
 
     Workplace(Workplace&& other) noexcept;
@@ -23,12 +24,17 @@ public:
 
     const std::filesystem::path& Path() const { return m_path; }
 
-    /// Moves a file to the output folder, in place of an older one.
+    /// Moves a file to the output folder, in place of an older one, when its bytes are on the disk.
     /// @param name of the file here
     /// @param newName of the file there
     /// @param fault receives why it is not there, for people
     /// @return whether it is
     bool Deliver(const wxString& name, const wxString& newName, wxString& fault) const;
+
+    /// Waits until all that was delivered is on the disk under its names.
+    /// @param fault receives why that is not certain, for people
+    /// @return whether it is
+    bool ConfirmDelivery(wxString& fault) const;
 
 private:
     explicit Workplace(std::filesystem::path path);
