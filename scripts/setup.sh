@@ -8,7 +8,6 @@ build_packages=(
     libwxgtk3.2-dev libgsf-1-dev libcups2-dev libexpat1-dev
     libpoppler-glib-dev libcairo2-dev libpango1.0-dev libglib2.0-dev libseccomp-dev
     libcli11-dev nlohmann-json3-dev gettext
-    libgtest-dev libgmock-dev libbenchmark-dev
 )
 run_packages=(
     'libreoffice-writer|libreoffice-writer-nogui'
@@ -18,19 +17,27 @@ run_packages=(
     ghostscript
     fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
 )
-test_packages=(poppler-utils xvfb xauth)
+test_packages=(libgtest-dev libgmock-dev poppler-utils xvfb xauth)
 # The compiler and the zlib for Windows, Wine, and what builds wxWidgets and expat from source.
 windows_packages=(
     g++-mingw-w64-x86-64-posix gcc-mingw-w64-x86-64-posix libz-mingw-w64 libz-mingw-w64-dev
     googletest wine64
     dpkg-dev autoconf automake libtool make patch xz-utils
 )
-lint_packages=(clang-format clang-tidy)
-bench_packages=(hyperfine python3)
+lint_packages=(clang-format clang-tidy libbenchmark-dev)
+bench_packages=(libgtest-dev libgmock-dev libbenchmark-dev hyperfine python3)
 
 fail() {
     printf '%s\n' "$*" >&2
     exit 2
+}
+
+# Locks an open file; says what it waits for when somebody else has it.
+# lock DESCRIPTOR WHAT
+lock() {
+    flock -n "$1" && return
+    printf 'Waiting for another %s to end.\n' "$2" >&2
+    flock "$1"
 }
 
 # Installs those of the packages given that are not there. Says nothing when all are.
@@ -51,30 +58,59 @@ ensure_packages() {
 Install them as root: apt-get install --no-install-recommends ${missing[*]}"
         as_root=(sudo)
     fi
+    mkdir -p "$project/build"
+    exec 7>"$project/build/.packages.lock"
+    lock 7 'installation of packages'
     printf 'Installing %s\n' "${missing[*]}" >&2
     {
         "${as_root[@]}" apt-get -q update &&
             "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
-                apt-get -qy install --no-install-recommends "${missing[@]}"
-    } >&2 || fail "The packages could not be installed. Install them by hand: ${missing[*]}"
+                apt-get -qy -o DPkg::Lock::Timeout=-1 install --no-install-recommends "${missing[@]}"
+    } >&2 7>&- || fail "The packages could not be installed. Install them by hand: ${missing[*]}"
+    flock -u 7
 }
 
-# Builds a target of a preset, one builder at a time; quiet unless it fails.
-# build PRESET TARGET
+# Builds a target of a preset, one builder at a time; quiet unless it fails. A folder is configured
+# for the program alone, and again when a target wants more: QUILLON_TESTS or QUILLON_BENCHMARKS.
+# build PRESET TARGET [OPTION]…
 build() {
     local preset=$1 target=$2 folder="$project/build/$1" log
+    shift 2
     log="$folder/build.log"
     mkdir -p "$folder" && [[ -w $folder ]] ||
         fail "$folder cannot be written to. It may belong to another user: remove it, or run as that user."
     exec 9>"$folder/.lock"
-    flock 9
-    if [[ ! -f $folder/build.ninja ]]; then
+    lock 9 "build in $folder"
+    if ! is_configured "$folder" "$@"; then
         printf 'Building in %s; the first time takes a few minutes.\n' "$folder" >&2
-        (cd "$project" && cmake --preset "$preset") >"$log" 2>&1 || show_failure "$log"
+        configure "$preset" "$@" >"$log" 2>&1 || show_failure "$log"
     fi
     cmake --build "$folder" --target "$target" >"$log" 2>&1 || show_failure "$log"
     flock -u 9
 }
+
+# Whether a build folder is ready, with all of the options given.
+is_configured() {
+    local folder=$1 option
+    shift
+    [[ -f $folder/build.ninja ]] || return
+    for option in "$@"; do
+        grep -q "^$option:BOOL=ON$" "$folder/CMakeCache.txt" || return
+    done
+}
+
+# What has been configured before stays: only a new folder begins with the program alone.
+configure() (
+    preset=$1 options=()
+    shift
+    [[ -f $project/build/$preset/build.ninja ]] ||
+        options=(-DQUILLON_TESTS=OFF -DQUILLON_BENCHMARKS=OFF)
+    for option in "$@"; do
+        options+=("-D$option=ON")
+    done
+    cd "$project"
+    cmake --preset "$preset" "${options[@]}"
+)
 
 # Where the libraries for Windows lie that Debian has no package of: outside the tree, since they
 # take long and serve every checkout.
@@ -85,7 +121,7 @@ build_windows_libraries() {
     local log="$project/build/windows-libraries.log"
     mkdir -p "$project/build" "${windows_libraries%/*}"
     exec 8>"${windows_libraries%/*}/.lock"
-    flock 8
+    lock 8 'build of the libraries for Windows'
     "$project/scripts/windows/libraries" "$windows_libraries" >"$log" 2>&1 || show_failure "$log"
     exec 8>&-
 }

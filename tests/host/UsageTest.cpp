@@ -3,11 +3,15 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 namespace fs = std::filesystem;
 
 namespace {
 
 using Arguments = std::vector<std::string>;
+
+constexpr int ScreenLines = 24;
 
 /// A run that cannot begin: it must end with code 3, say why, and convert nothing.
 class UsageTest : public testing::Test {
@@ -97,10 +101,7 @@ TEST_F(UsageTest, OfARecordReader) {
 }
 
 TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
-    const RunResult bare = RunProgram({QUILLON_PROGRAM});
-    EXPECT_EQ(bare.exitCode, 3);
     const std::string help = RunQuillon({"--help"}).out;
-    EXPECT_EQ(bare.err, help);
     for (const char* word :
          {"status", "screen", "convert", "--settings", "--engine-stall", "SLIDESPERPAGE",
           "Exit codes", "budget.xls.pdf", "--lang", "--profile", "settings"})
@@ -108,6 +109,21 @@ TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
     const RunResult ofCommand = RunQuillon({"convert", "--help"});
     EXPECT_EQ(ofCommand.exitCode, 0);
     EXPECT_EQ(ofCommand.out, help);
+}
+
+TEST_F(UsageTest, NothingAskedForShowsOneScreenOfHelp) {
+    const RunResult bare = RunProgram({QUILLON_PROGRAM});
+    EXPECT_EQ(bare.exitCode, 3);
+    EXPECT_EQ(bare.out, "");
+    EXPECT_LE(std::count(bare.err.begin(), bare.err.end(), '\n'), ScreenLines) << bare.err;
+    for (const char* word : {"status", "screen", "convert", "settings", "quillon --help"})
+        EXPECT_NE(bare.err.find(word), std::string::npos) << word;
+}
+
+TEST_F(UsageTest, TellsTheVersion) {
+    const RunResult version = RunQuillon({"--version"});
+    EXPECT_EQ(version.exitCode, 0);
+    EXPECT_EQ(version.out, "quillon 1.0.0.1\n");
 }
 
 } // namespace

@@ -172,6 +172,13 @@ std::string HelpOf(CLI::App& app) {
     return app.help("", CLI::AppFormatMode::All);
 }
 
+/// The beginning of the help, for who has asked for nothing yet.
+std::string FirstScreenOf(CLI::App& app) {
+    app.clear();
+    app.footer("All options, settings and exit codes: quillon --help");
+    return app.help();
+}
+
 } // namespace
 
 std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& arguments,
@@ -179,6 +186,7 @@ std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& argum
     CommandLine line;
     CLI::App app(Description, "quillon");
     app.set_help_flag("-h,--help", "Print this help");
+    app.set_version_flag("--version", "quillon " QUILLON_VERSION, "Print the version");
     app.footer(Notes + SettingsTable() + ExitCodes);
     AddCommonOptions(app, line);
     AddCommands(app, line);
@@ -192,10 +200,13 @@ std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& argum
     } catch (const CLI::CallForHelp&) {
         std::cout << HelpOf(app) << std::flush;
         exitCode = static_cast<int>(ExitCode::Done);
+    } catch (const CLI::CallForVersion& version) {
+        std::cout << version.what() << std::endl;
+        exitCode = static_cast<int>(ExitCode::Done);
     } catch (const CLI::ParseError& error) {
         exitCode = static_cast<int>(ExitCode::WrongUsage);
         if (arguments.empty())
-            std::cerr << HelpOf(app) << std::flush;
+            std::cerr << FirstScreenOf(app) << std::flush;
         else
             std::cerr << "quillon: " << error.what() << "\nSee quillon --help.\n" << std::flush;
     }
