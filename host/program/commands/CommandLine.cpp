@@ -172,9 +172,11 @@ std::string HelpOf(CLI::App& app) {
     return app.help("", CLI::AppFormatMode::All);
 }
 
-/// The beginning of the help, for who has asked for nothing yet.
+/// What fits one screen, for who has asked for nothing yet.
 std::string FirstScreenOf(CLI::App& app) {
     app.clear();
+    for (CLI::Option* const option : app.get_options())
+        option->group("");
     app.footer("All options, settings and exit codes: quillon --help");
     return app.help();
 }
