@@ -43,9 +43,9 @@ std::string UserInstallationUrl(const std::string& workFolder) {
 void RemoveSocket(const std::string& workFolder) {
     const std::string name = "SingleOfficeIPC_" + SocketId(UserInstallationUrl(workFolder));
     // The user's number is not in it where the system has no entry for the user.
-    for (const std::string& user : {std::to_string(getuid()) + "_", std::string()})
-        for (const char* folder : {"/tmp/OSL_PIPE_", "/var/tmp/OSL_PIPE_"})
-            unlink((folder + user + name).c_str());
+    for (const std::string& socket : {std::to_string(getuid()) + "_" + name, name})
+        for (const char* start : {"/tmp/OSL_PIPE_", "/var/tmp/OSL_PIPE_"})
+            unlink((start + socket).c_str());
 }
 
 } // namespace standins

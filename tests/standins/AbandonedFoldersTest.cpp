@@ -29,7 +29,7 @@ protected:
     /// @return its path
     fs::path Make(const std::string& name, const std::string& mark = "in use",
                   std::chrono::hours age = 2h) const {
-        const fs::path folder = m_temporary / name;
+        fs::path folder = m_temporary / name;
         fs::create_directory(folder);
         m_temporary.Write(name + "/document.docx", "A copy");
         if (!mark.empty())
