@@ -1,6 +1,7 @@
 #include "host/program/documents/OutputFolder.h"
 
 #include "host/program/PathText.h"
+#include "host/program/system/DurableMove.h"
 
 #include <wx/filename.h>
 
@@ -35,7 +36,8 @@ std::optional<OutputFolder> OutputFolder::Open(const fs::path& path, wxString& f
             fault = "it is a file, not a folder";
         else if (!fs::is_directory(folder.parent_path(), error))
             fault = "the folder above it does not exist either; create that first";
-        else if (!fs::create_directory(folder, error))
+        else if (!fs::create_directory(folder, error) ||
+                 (error = SyncFolder(folder.parent_path()))) // or it is lost with what is in it
             fault = "it cannot be created: " + Because(error);
     } else if (!wxFileName::IsDirWritable(*ToText(folder))) {
         fault = "nothing can be written to it; choose another one or change its permissions";

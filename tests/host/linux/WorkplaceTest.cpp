@@ -94,8 +94,10 @@ TEST_F(WorkplaceTest, OnesThatNobodyHasAreRemovedAndNothingElse) {
 }
 
 TEST_F(WorkplaceTest, AnOutputIsToldWhenItIsOnTheDisk) {
+    fs::remove(Out()); // a new one must be on the disk, too
     EXPECT_EQ(Convert().state, State::Converted);
-    EXPECT_THAT(g_disk.synced, ElementsAre(EndsWith("-0/a.log"), EndsWith("-0/a.ps"), Out()));
+    EXPECT_THAT(g_disk.synced,
+                ElementsAre(m_folder.Path(), EndsWith("-0/a.log"), EndsWith("-0/a.ps"), Out()));
 }
 
 TEST_F(WorkplaceTest, AnOutputThatIsNotOnTheDiskIsAFailure) {
