@@ -106,30 +106,37 @@ TEST_F(ConvertTest, SettingsComeFromFileCommandLineAndDefaults) {
     const std::string pdf = "OUTPUTFILETYPEPS=0\nOUTPUTFILETYPEPDF=1\n";
     const std::string ps = "OUTPUTFILETYPEPS=1\nOUTPUTFILETYPEPDF=0\n";
     const std::string profile = "SELECTEDDISTILLERPROFILE=Press.joboptions\n";
+    const std::string across = "HANDOUTSHORIZONTAL=1\n";
+    const std::string slides = "PRINTOUTPUTTYPE=Slides\n";
+    const std::string colour = "COLOR=Color\n";
+    const std::string page = "SLIDESPERPAGE=6\nHANDOUTSVERTICAL=0\nSCALETOFITPAGE=0\n"
+                             "FRAMESLIDES=0\nPRINTHIDDENSLIDES=0\nPRINTCOMMENTSANDINKMARKUP=0\n";
+    const std::string rest = across + slides + colour + page + "HIGHQUALITY=0\n";
     struct Case {
         std::string file;
         Arguments options;
         std::string told;
     };
     const Case cases[] = {
-        {"<UI/>", {}, printer + pdf},
-        {"<UI/>", {"--ps"}, ps + printer},
-        {"<UI/>", {"--pdf", "--profile", "press"}, profile + pdf + printer},
+        {"<UI/>", {}, printer + pdf + rest},
+        {"<UI/>", {"--ps"}, ps + printer + rest},
+        {"<UI/>", {"--pdf", "--profile", "press"}, profile + pdf + printer + rest},
         {"<a><b><UI><PRINTER/><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS></UI></b></a>",
          {},
-         printer + ps},
+         printer + ps + rest},
         {"<UI><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS><SELECTEDDISTILLERPROFILE>Gone"
          "</SELECTEDDISTILLERPROFILE></UI>", // no PDF file, and so no need of it
          {},
-         "OUTPUTFILETYPEPS=1\nSELECTEDDISTILLERPROFILE=Gone\n" + printer + "OUTPUTFILETYPEPDF=0\n"},
+         "OUTPUTFILETYPEPS=1\nSELECTEDDISTILLERPROFILE=Gone\n" + printer + "OUTPUTFILETYPEPDF=0\n" +
+             rest},
         {"<a><b><UI><COLOR>a</COLOR></UI></b><UI><COLOR>near</COLOR></UI></a>", // which filters
                                                                                 // find
          {},
-         "COLOR=near\n" + printer + pdf},
+         "COLOR=near\n" + printer + pdf + across + slides + page + "HIGHQUALITY=0\n"},
         {"<UI><COLOR>one</COLOR><COLOR>two</COLOR><PRINTER>Nobody's</PRINTER></UI>",
          {"--set", "COLOR=Grau=\xC3\xA4", "--set", "HIGHQUALITY=1", "--set",
           "HIGHQUALITY=", "--printer", "Quillon PostScript File Printer"},
-         "COLOR=Grau=\xC3\xA4\n" + printer + "HIGHQUALITY=\n" + pdf},
+         "COLOR=Grau=\xC3\xA4\n" + printer + "HIGHQUALITY=0\n" + pdf + across + slides + page},
     };
     for (const Case& each : cases)
         for (const char* jobs : {"1", "2"}) { // in the process, or in one of its own

@@ -89,7 +89,8 @@ TEST_F(UsageTest, OfTheSettingsFile) {
         ExpectRefusal(Convert({"--settings", file}), reason);
     }
     ExpectRefusal(Convert({"--settings", (m_folder / "none.xml").u8string()}), "no such file");
-    ExpectRefusal(Convert({"--settings", "/dev/zero"}), "no such file");
+    ExpectRefusal(Convert({"--settings", m_folder.Path().u8string()}), "it is a folder");
+    ExpectRefusal(Convert({"--settings", "/dev/zero"}), "cannot be used");
 }
 
 TEST_F(UsageTest, OfARecordReader) {

@@ -1,7 +1,8 @@
 #include "host/program/PathText.h"
 #include "host/program/commands/Commands.h"
+#include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
-#include "host/program/settings/SettingsDialogue.h"
+#include "host/program/window/SettingsDialogue.h"
 
 ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filtersFolder,
                      Reporter& reporter) {
@@ -14,6 +15,7 @@ ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filte
         return ExitCode::WrongUsage;
     }
     FillIn(*settings);
+    TranslateChoices(*settings);
     const FilterSet filters(filtersFolder);
     SettingsDialogue dialogue(filters, *settings, file);
     if (!dialogue.HasPanel()) {

@@ -54,25 +54,27 @@ bool CheckPrinter(const Settings& settings, Obstacle& obstacle) {
     return false;
 }
 
-/// Completes the profile's name where a user has left out its ending.
+/// The profile's listed name, where a user may have left out its ending.
+/// @return empty when there is no such profile
+wxString FindProfile(const wxString& wanted, const std::vector<wxString>& names) {
+    const auto isMeant = [&wanted](const wxString& name) {
+        return name.Contains(".") && name.BeforeLast('.').IsSameAs(wanted, false);
+    };
+    if (wanted.empty() || std::find(names.begin(), names.end(), wanted) != names.end())
+        return wanted;
+    const auto meant = std::find_if(names.begin(), names.end(), isMeant);
+    return meant == names.end() ? wxString() : *meant;
+}
+
 /// @return whether the settings name a profile that there is, or none
-bool CheckProfile(Settings& settings, Obstacle& obstacle) {
+bool CheckProfile(const Settings& settings, Obstacle& obstacle) {
     const wxString wanted = settings.Value("SELECTEDDISTILLERPROFILE");
     const std::vector<wxString> names = ListDistillerProfiles();
-    const auto find = [&names](auto condition) {
-        return std::find_if(names.begin(), names.end(), condition);
-    };
-    if (wanted.empty() || find([&](const wxString& name) { return name == wanted; }) != names.end())
+    if (wanted.empty() || !FindProfile(wanted, names).empty())
         return true;
-    const auto meant = find([&](const wxString& name) {
-        return name.Contains(".") && name.BeforeLast('.').IsSameAs(wanted, false);
-    });
-    if (meant != names.end())
-        settings.Set("SELECTEDDISTILLERPROFILE", *meant);
-    else
-        obstacle = {ExitCode::WrongUsage, "there is no Distiller profile \"" + wanted +
-                                              "\"; the profiles are: " + ListOf(names)};
-    return meant != names.end();
+    obstacle = {ExitCode::WrongUsage, "there is no Distiller profile \"" + wanted +
+                                          "\"; the profiles are: " + ListOf(names)};
+    return false;
 }
 
 void ApplyOptions(const CommandLine& line, Settings& settings) {
@@ -93,28 +95,28 @@ void ApplyOptions(const CommandLine& line, Settings& settings) {
 
 const std::vector<SettingsKey>& KnownSettings() {
     static const std::vector<SettingsKey> s_settings = {
-        {"PRINTER", "name", "the printer to print on, as `quillon status` lists it"},
-        {"OUTPUTFILETYPEPS", "1 0", "1: PostScript files only; 0: PDF files too"},
-        {"OUTPUTFILETYPEPDF", "1 0", "the opposite, for the settings panel"},
-        {"SELECTEDDISTILLERPROFILE", "file name",
+        {"PRINTER", "name", "", "the printer to print on, as `quillon status` lists it"},
+        {"OUTPUTFILETYPEPS", "1 0", "0", "1: PostScript files only; 0: PDF files too"},
+        {"OUTPUTFILETYPEPDF", "1 0", "", "the opposite, for the settings panel"},
+        {"SELECTEDDISTILLERPROFILE", "file name", "",
          "the Distiller profile, as `quillon status` lists it"},
-        {"PRINTOUTPUTTYPE", "text", "Slides, Handouts, Notes Pages or Outline View"},
-        {"COLOR", "text", "Color, Grayscale or Pure Black and White"},
-        {"SLIDESPERPAGE", "1 2 3 4 6 9", "slides on a page of handouts"},
-        {"HANDOUTSHORIZONTAL", "1 0", "1: slides of a handout run across the page"},
-        {"HANDOUTSVERTICAL", "1 0", "1: slides of a handout run down the page"},
-        {"SCALETOFITPAGE", "1 0", "1: slides are scaled to fit the page"},
-        {"FRAMESLIDES", "1 0", "1: slides have a frame"},
-        {"PRINTHIDDENSLIDES", "1 0", "1: hidden slides are printed"},
-        {"PRINTCOMMENTSANDINKMARKUP", "1 0", "1: comments and ink are printed"},
-        {"HIGHQUALITY", "1 0", "1: slides are printed in high quality"},
+        {"PRINTOUTPUTTYPE", "text", "Slides", "Slides, Handouts, Notes Pages or Outline View"},
+        {"COLOR", "text", "Color", "Color, Grayscale or Pure Black and White"},
+        {"SLIDESPERPAGE", "1 2 3 4 6 9", "6", "slides on a page of handouts"},
+        {"HANDOUTSHORIZONTAL", "1 0", "1", "1: slides of a handout run across the page"},
+        {"HANDOUTSVERTICAL", "1 0", "0", "1: slides of a handout run down the page"},
+        {"SCALETOFITPAGE", "1 0", "0", "1: slides are scaled to fit the page"},
+        {"FRAMESLIDES", "1 0", "0", "1: slides have a frame"},
+        {"PRINTHIDDENSLIDES", "1 0", "0", "1: hidden slides are printed"},
+        {"PRINTCOMMENTSANDINKMARKUP", "1 0", "0", "1: comments and ink are printed"},
+        {"HIGHQUALITY", "1 0", "0", "1: slides are printed in high quality"},
     };
     return s_settings;
 }
 
 void FillIn(Settings& settings) {
     const auto fill = [&settings](const char* key, const wxString& value) {
-        if (settings.Value(key).empty())
+        if (settings.Value(key).empty() && !value.empty())
             settings.Set(key, value);
     };
     const std::vector<Printer> printers = ListPrinters();
@@ -122,6 +124,13 @@ void FillIn(Settings& settings) {
         fill("PRINTER", preferred->name);
     fill("OUTPUTFILETYPEPS", "0");
     fill("OUTPUTFILETYPEPDF", settings.Value("OUTPUTFILETYPEPS") == "1" ? "0" : "1");
+    fill("HANDOUTSHORIZONTAL", settings.Value("HANDOUTSVERTICAL") == "1" ? "0" : "1");
+    for (const SettingsKey& key : KnownSettings())
+        fill(key.name, key.standard);
+    const wxString profile =
+        FindProfile(settings.Value("SELECTEDDISTILLERPROFILE"), ListDistillerProfiles());
+    if (!profile.empty())
+        settings.Set("SELECTEDDISTILLERPROFILE", profile);
 }
 
 std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle) {

@@ -13,6 +13,7 @@
 struct SettingsKey {
     const char* name;
     const char* values;
+    const char* standard; ///< the value that holds without another; empty when it depends
     const char* meaning;
 };
 
@@ -24,7 +25,9 @@ struct Obstacle {
     wxString text;
 };
 
-/// Fills in what the settings do not say: PDF output on the preferred printer, if there is one.
+/// Fills in what the settings do not say: PDF output on the preferred printer, if there is one,
+/// and the standard values. So a window shows what a conversion with these settings does. Completes
+/// the profile's name where a user has left out its ending.
 void FillIn(Settings& settings);
 
 /// Puts together the settings of a run: the file's, the command line's in their place, and what

@@ -3,6 +3,7 @@
 #include "host/program/PathText.h"
 #include "host/program/settings/XmlCheck.h"
 
+#include <wx/intl.h>
 #include <wx/log.h>
 #include <wx/mstream.h>
 
@@ -31,12 +32,20 @@ wxXmlNode* FindUi(const wxXmlNode& parent) {
     return nullptr;
 }
 
+/// @return why this cannot be a settings file; empty when it is a file
+wxString FindFaultOf(const fs::file_status& status) {
+    if (!fs::exists(status))
+        return _("there is no such file");
+    if (fs::is_directory(status))
+        return _("it is a folder; name a file in it");
+    return fs::is_regular_file(status) ? wxString() : _("it is a device or a pipe, not a file");
+}
+
 std::optional<std::string> ReadBounded(const fs::path& file, wxString& fault) {
     std::error_code error;
-    if (!fs::is_regular_file(file, error)) {
-        fault = "there is no such file";
+    fault = FindFaultOf(fs::status(file, error));
+    if (!fault.empty())
         return std::nullopt;
-    }
     const std::uintmax_t size = fs::file_size(file, error);
     if (!error && size > LargestFile) {
         fault = wxString::Format("it is larger than %ju KiB, too much for settings",
@@ -124,8 +133,12 @@ std::optional<Settings> Settings::Load(const fs::path& file, wxString& fault) {
 
 std::optional<Settings> Settings::LoadForEditing(const fs::path& file, wxString& fault) {
     std::error_code ignored;
-    if (!fs::exists(file, ignored))
-        return Settings();
+    if (!fs::exists(file, ignored)) {
+        if (fs::is_directory(fs::absolute(file, ignored).parent_path(), ignored))
+            return Settings();
+        fault = _("its folder does not exist; create that first");
+        return std::nullopt;
+    }
     const std::optional<std::string> bytes = ReadBounded(file, fault);
     std::optional<Settings> settings = bytes ? Parse(*bytes, true, fault) : std::nullopt;
     if (settings)

@@ -18,7 +18,7 @@ public:
     static std::optional<Settings> Load(const std::filesystem::path& file, wxString& fault);
 
     /// Reads a settings file with its comments and its layout. Where the file, or the element "UI"
-    /// in it, is missing, there are no settings yet.
+    /// in it, is missing, there are no settings yet; the folder must be there.
     /// @param fault receives why there is no result, as above
     static std::optional<Settings> LoadForEditing(const std::filesystem::path& file,
                                                   wxString& fault);

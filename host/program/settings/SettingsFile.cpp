@@ -33,8 +33,6 @@ wxString Replace(const fs::path& file, const std::string& bytes) {
     const bool exists = fs::exists(file, error);
     if (exists && !wxFileName::IsFileWritable(ToText(file).value_or(wxString())))
         return _("it is write-protected");
-    if (!fs::is_directory(file.parent_path(), error))
-        return _("its folder does not exist");
     const fs::path newFile =
         file.parent_path() / FromText(wxString::Format(".quillon-settings-%lu", wxGetProcessId()));
     wxString fault = WriteNew(newFile, bytes);

@@ -18,7 +18,6 @@ protected:
     /// Collects what the window shows and what is no name of this machine's.
     void CollectFromWindow() {
         Open([this] {
-            Add(m_window->GetTitle());
             ForEachBelow(m_window, [this](wxWindow* each) {
                 const auto* choice = dynamic_cast<const wxChoice*>(each);
                 const bool holdsNames = each->GetId() == ControlId::Printer ||

@@ -1,4 +1,6 @@
-#include "host/program/settings/Settings.h"
+#include "host/program/machine/MachineStatus.h"
+#include "host/program/settings/RunSettings.h"
+#include "host/program/window/MessageBar.h"
 #include "tests/ui/settings/SettingsWindow.h"
 #include "ui/ControlIds.h"
 
@@ -28,17 +30,62 @@ protected:
     }
 
     bool HasClosed() const { return !m_window->IsShown(); }
+
+    void Save() {
+        Press(WXK_RETURN);
+        EXPECT_TRUE(Until([this] { return HasClosed(); }));
+    }
+
+    wxChoice* Choice(int id) const { return dynamic_cast<wxChoice*>(Find(id)); }
+
+    std::string Chosen(int id) const { return Choice(id)->GetStringSelection().utf8_string(); }
+
+    /// As on a small screen.
+    void MakeLow() {
+        m_window->SetMinSize(wxSize(1, 1));
+        m_window->SetSize(m_window->GetSize().x, 300);
+        EXPECT_TRUE(Until([this] { return m_window->GetSize().y == 300; }));
+    }
+
+    bool CanBeSeen(const wxWindow* control) const {
+        const wxWindow* const area = Find(ControlId::Printer)->GetParent()->GetParent();
+        const wxWindow* const around =
+            area->IsDescendant(const_cast<wxWindow*>(control)) ? area : control->GetParent();
+        return Place(around).Contains(Place(control));
+    }
+
+    /// What the window says in a bar, all of it to be seen, without its spaces, at which it wraps.
+    wxString Said() const {
+        wxString said;
+        ForEachBelow(m_window, [&](wxWindow* each) {
+            const bool isInBar = dynamic_cast<const MessageBar*>(each->GetParent());
+            if (!isInBar || !dynamic_cast<const wxStaticText*>(each) || !each->IsShownOnScreen())
+                return;
+            said = WithoutSpaces(each->GetLabel());
+            const wxSize needed = each->GetBestSize();
+            EXPECT_TRUE(needed.x <= each->GetSize().x && needed.y <= each->GetSize().y);
+            EXPECT_TRUE(Place(m_window).Contains(Place(each)));
+        });
+        return said;
+    }
+
+    static wxString WithoutSpaces(wxString text) {
+        text.Replace(" ", "");
+        text.Replace("\n", "");
+        return text;
+    }
 };
 
 TEST_F(SettingsDialogueTest, ReturnSavesWhatWasPicked) {
     const int end = Open([this] {
+        EXPECT_EQ(m_window->GetTitle(), "job.xml - Print Settings");
         Toggle(ControlId::FrameSlides);
         Choose(ControlId::Print, "Handouts");
         EXPECT_TRUE(Find(ControlId::SlidesPerPage)->IsEnabled());
         Choose(ControlId::SlidesPerPage, "4");
         Choose(ControlId::Printer, "Proofer");
-        Press(WXK_RETURN);
-        EXPECT_TRUE(Until([this] { return HasClosed(); }));
+        Choose(ControlId::DistillerProfile, "Print.joboptions");
+        Save();
     });
     EXPECT_EQ(end, wxID_SAVE);
     for (const auto& [key, value] : {std::pair("FRAMESLIDES", "1"),
@@ -46,15 +93,98 @@ TEST_F(SettingsDialogueTest, ReturnSavesWhatWasPicked) {
                                      {"SLIDESPERPAGE", "4"},
                                      {"PRINTER", "Proofer"},
                                      {"OUTPUTFILETYPEPDF", "1"},
-                                     {"SELECTEDDISTILLERPROFILE", "Press Quality.joboptions"}})
+                                     {"SELECTEDDISTILLERPROFILE", "Print.joboptions"}})
         EXPECT_EQ(Value(key), value) << key;
     EXPECT_EQ(Open([this] {
                   EXPECT_TRUE(IsTicked(ControlId::FrameSlides));
-                  EXPECT_EQ(dynamic_cast<wxChoice*>(Find(ControlId::Printer))->GetStringSelection(),
-                            "Proofer");
+                  EXPECT_EQ(Chosen(ControlId::Printer), "Proofer");
+                  EXPECT_EQ(Chosen(ControlId::DistillerProfile), "Print.joboptions");
               }),
               wxID_NONE)
         << "and the next window shows it";
+}
+
+TEST_F(SettingsDialogueTest, ANewFileAndRestoredDefaultsSayWhatHoldsWithoutAFile) {
+    Settings none;
+    FillIn(none);
+    const auto expectSame = [&](const char* when) {
+        for (const SettingsKey& key : KnownSettings())
+            EXPECT_EQ(Value(key.name), none.Value(key.name).utf8_string()) << when << key.name;
+    };
+    Open([this] { Save(); });
+    expectSame("a new file ");
+    m_folder.Write("job.xml", "<UI><PRINTER>Proofer</PRINTER><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS>"
+                              "<SELECTEDDISTILLERPROFILE>Print</SELECTEDDISTILLERPROFILE>"
+                              "<PRINTOUTPUTTYPE>Handouts</PRINTOUTPUTTYPE><COLOR>Farbe</COLOR>"
+                              "<HANDOUTSVERTICAL>1</HANDOUTSVERTICAL>"
+                              "<PRINTHIDDENSLIDES>1</PRINTHIDDENSLIDES></UI>");
+    Open([this] {
+        EXPECT_EQ(Chosen(ControlId::DistillerProfile), "Print.joboptions");
+        Activate(ButtonId::Restore);
+        EXPECT_TRUE(Until([this] { return Chosen(ControlId::Print) == "Slides"; }));
+        Find(ControlId::Print)->SetFocus();
+        Save();
+    });
+    expectSame("restored ");
+}
+
+TEST_F(SettingsDialogueTest, WhatIsNoLongerThereStaysChosenUnderItsName) {
+    m_folder.Write("job.xml", "<UI><PRINTER>Sold last year</PRINTER><SELECTEDDISTILLERPROFILE>Gone"
+                              "</SELECTEDDISTILLERPROFILE></UI>");
+    for (const bool touched : {false, true}) {
+        Open([this, touched] {
+            const std::tuple<int, const char*, const char*> choices[] = {
+                {ControlId::Printer, "Sold last year (not available)", "Proofer"},
+                {ControlId::DistillerProfile, "Gone (not available)", "Print.joboptions"}};
+            for (const auto& [id, marked, other] : choices) {
+                EXPECT_EQ(Chosen(id), marked);
+                EXPECT_LE(Choice(id)->GetTextExtent(marked).x, Choice(id)->GetSize().x);
+                if (touched) {
+                    Choose(id, other);
+                    Choose(id, marked);
+                }
+            }
+            Save();
+        });
+        EXPECT_EQ(Value("PRINTER"), "Sold last year");
+        EXPECT_EQ(Value("SELECTEDDISTILLERPROFILE"), "Gone");
+    }
+}
+
+TEST_F(SettingsDialogueTest, AChoiceOfAnotherLanguageIsTheSameOne) {
+    m_folder.Write("job.xml",
+                   "<UI><PRINTOUTPUTTYPE>\xE9\x85\x8D\xE5\xB8\x83\xE8\xB3\x87\xE6\x96\x99"
+                   "</PRINTOUTPUTTYPE><COLOR>Grayscale</COLOR></UI>");
+    Speak("de");
+    Open([this] {
+        EXPECT_EQ(Chosen(ControlId::Print), "Handzettel");
+        EXPECT_EQ(Chosen(ControlId::Colour), "Graustufen");
+        EXPECT_TRUE(Find(ControlId::SlidesPerPage)->IsEnabled());
+    });
+}
+
+TEST_F(SettingsDialogueTest, SaysWhyItIsGreyedOutAsStatusDoes) {
+    Open([this] { EXPECT_EQ(Said(), ""); });
+    m_office.reset();
+    Open([this] {
+        EXPECT_TRUE(Said().Contains(WithoutSpaces(LookAtMachine().panelObstacle))) << Said();
+        EXPECT_FALSE(Find(ButtonId::Restore)->IsEnabled());
+    });
+}
+
+TEST_F(SettingsDialogueTest, TheMouseWheelScrollsAndChangesNoChoice) {
+    Open([this] {
+        MakeLow();
+        wxChoice* const choice = Choice(ControlId::Printer);
+        const int top = Place(choice).y;
+        wxMouseEvent wheel(wxEVT_MOUSEWHEEL);
+        wheel.SetEventObject(choice);
+        wheel.m_wheelDelta = 120;
+        wheel.m_wheelRotation = -120;
+        wheel.m_linesPerAction = 3;
+        EXPECT_TRUE(choice->GetEventHandler()->ProcessEvent(wheel)) << "else the toolkit has it";
+        EXPECT_TRUE(Until([&] { return Place(choice).y < top; }));
+    });
 }
 
 TEST_F(SettingsDialogueTest, LeavesTheFileAloneUnlessItIsToldToSave) {
@@ -83,22 +213,21 @@ TEST_F(SettingsDialogueTest, LeavesTheFileAloneUnlessItIsToldToSave) {
 
 TEST_F(SettingsDialogueTest, StaysOpenWhenTheFileCannotBeWritten) {
     Speak("de");
-    const std::filesystem::path folder = m_folder / "later";
+    const std::filesystem::path folder = m_folder / std::string(100, 'w');
+    std::filesystem::create_directory(folder);
     m_file = folder / "job.xml";
     const int end = Open([this, &folder] {
+        std::filesystem::remove(folder);
         Toggle(ControlId::FrameSlides);
+        const int height = m_window->GetSize().y;
         Activate(ButtonId::Save);
-        const wxWindow* fault = nullptr;
-        ForEachBelow(m_window, [&fault](wxWindow* each) {
-            if (const auto* bar = dynamic_cast<const wxInfoBar*>(each))
-                fault = bar;
-        });
-        EXPECT_TRUE(Until([fault] { return fault->IsShown(); }));
+        EXPECT_TRUE(Until([&] { return m_window->GetSize().y > height; })) << "for the fault";
+        EXPECT_TRUE(Until([this] { return CanBeSeen(Find(ButtonId::Save)); }));
+        EXPECT_TRUE(Said().Contains(WithoutSpaces(m_file.wstring()))) << Said();
         EXPECT_FALSE(HasClosed());
         EXPECT_TRUE(IsTicked(ControlId::FrameSlides));
-        EXPECT_GE(m_window->GetClientSize().y,
-                  m_window->ScreenToClient(Place(Find(ButtonId::Save)).GetBottomRight()).y)
-            << "the buttons are still there";
+        Activate(ButtonId::Understood);
+        EXPECT_TRUE(Until([&] { return m_window->GetSize().y == height; }));
         std::filesystem::create_directory(folder);
         Activate(ButtonId::Save);
         EXPECT_TRUE(Until([this] { return HasClosed(); }));
@@ -112,9 +241,7 @@ TEST_F(SettingsDialogueTest, KeepsWhatItDoesNotUnderstand) {
     for (int i = 0; i < 10000; ++i)
         many += "<KEY" + std::to_string(i) + ">value</KEY" + std::to_string(i) + ">";
     const std::string kept[] = {
-        "<PRINTER>Sold last year</PRINTER>",
-        "<SELECTEDDISTILLERPROFILE>Gone.joboptions</SELECTEDDISTILLERPROFILE>",
-        "<PRINTOUTPUTTYPE>\xE9\x85\x8D\xE5\xB8\x83\xE8\xB3\x87\xE6\x96\x99</PRINTOUTPUTTYPE>",
+        "<PRINTOUTPUTTYPE>Posters</PRINTOUTPUTTYPE>",
         "<COLOR>Ultraviolet</COLOR>",
         "<SLIDESPERPAGE>-7</SLIDESPERPAGE>",
         "<HANDOUTSHORIZONTAL>1</HANDOUTSHORIZONTAL>",
@@ -126,8 +253,7 @@ TEST_F(SettingsDialogueTest, KeepsWhatItDoesNotUnderstand) {
     m_folder.Write("job.xml", file + "</UI></job>\n");
     const int end = Open([this] {
         Toggle(ControlId::HighQuality);
-        Press(WXK_RETURN);
-        EXPECT_TRUE(Until([this] { return HasClosed(); }));
+        Save();
     });
     EXPECT_EQ(end, wxID_SAVE);
     const std::string stored = Stored();
@@ -136,9 +262,10 @@ TEST_F(SettingsDialogueTest, KeepsWhatItDoesNotUnderstand) {
     EXPECT_EQ(Value("HIGHQUALITY"), "1");
 }
 
-TEST_F(SettingsDialogueTest, TheTabKeyFollowsTheEye) {
+TEST_F(SettingsDialogueTest, TheTabKeyFollowsTheEyeAndTheWindowTheTabKey) {
     Open([this] {
         Choose(ControlId::Print, "Handouts"); // enables all
+        MakeLow();
         Find(ControlId::Printer)->SetFocus();
         std::vector<wxWindow*> visited;
         for (wxWindow* now = Focused();
@@ -146,16 +273,17 @@ TEST_F(SettingsDialogueTest, TheTabKeyFollowsTheEye) {
              now = Focused()) {
             EXPECT_TRUE(dynamic_cast<const wxControl*>(now))
                 << "a stop at nothing: " << now->GetId();
+            EXPECT_TRUE(Until([&] { return CanBeSeen(now); })) << now->GetId();
+            if (!visited.empty()) {
+                const wxRect before = Place(visited.back());
+                const wxRect after = Place(now);
+                const bool sameLine = after.y < before.GetBottom() && before.y < after.GetBottom();
+                EXPECT_TRUE(sameLine ? before.x < after.x : before.y < after.y)
+                    << visited.back()->GetId() << " -> " << now->GetId();
+            }
             visited.push_back(now);
             Press(WXK_TAB);
             EXPECT_TRUE(Until([&] { return Focused() && Focused() != now; })) << now->GetId();
-        }
-        for (std::size_t i = 1; i < visited.size(); ++i) {
-            const wxRect before = Place(visited[i - 1]);
-            const wxRect after = Place(visited[i]);
-            const bool sameLine = after.y < before.GetBottom() && before.y < after.GetBottom();
-            EXPECT_TRUE(sameLine ? before.x < after.x : before.y < after.y)
-                << visited[i - 1]->GetId() << " -> " << visited[i]->GetId();
         }
         ForEachBelow(m_window, [&visited](wxWindow* each) {
             const bool takesPart =

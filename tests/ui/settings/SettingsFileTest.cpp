@@ -1,5 +1,6 @@
 #include "host/program/settings/SettingsFile.h"
 
+#include "host/program/settings/Settings.h"
 #include "tests/support/TemporaryFolder.h"
 
 #include <gtest/gtest.h>
@@ -68,10 +69,14 @@ TEST_F(SettingsFileTest, AFileThatCannotBeReplacedStaysWhole) {
     EXPECT_NE(StoreSettings(m_file, {{"COLOR", "new"}}), "") << "somebody may want to mend it";
     EXPECT_EQ(ReadBytes(m_file), broken);
 
-    EXPECT_EQ(StoreSettings(m_folder / "none" / "job.xml", {{"COLOR", "new"}}),
-              "its folder does not exist");
     fs::create_directory(m_folder / "folder");
-    EXPECT_NE(StoreSettings(m_folder / "folder", {{"COLOR", "new"}}), "");
+    for (const auto& [name, reason] :
+         {std::pair("none/job.xml", "its folder does not exist"), {"folder", "it is a folder"}}) {
+        EXPECT_TRUE(StoreSettings(m_folder / name, {{"COLOR", "new"}}).StartsWith(reason));
+        wxString fault; // and one is told before the work begins
+        EXPECT_FALSE(Settings::LoadForEditing(m_folder / name, fault));
+        EXPECT_TRUE(fault.StartsWith(reason)) << fault;
+    }
     EXPECT_EQ(FilesBeside(), 2U) << "no temporary file";
 }
 

@@ -1,5 +1,7 @@
 #include "tests/ui/settings/SettingsWindow.h"
 
+#include "common/WQServices.h"
+#include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/services/CatalogueLoader.h"
 #include "tests/support/RegistryText.h"
@@ -18,6 +20,7 @@ constexpr wchar_t DistillerKey[] = L"SOFTWARE\\Adobe\\Acrobat Distiller\\9.0";
 
 SettingsWindow::SettingsWindow() {
     Speak("en");
+    WQTranslations::GetInstance().ReadFolder(QUILLON_BIN "/locale");
     m_office.emplace(std::vector<std::wstring>{L"Word.Application", L"PowerPoint.Application"});
     const std::wstring ppd = m_folder.Write("a.ppd", "x").wstring();
     m_printers[0].emplace(L"Quillon PostScript File Printer", L"Test driver", ppd);
@@ -50,6 +53,7 @@ int SettingsWindow::Open(const std::function<void()>& user) {
     if (!settings)
         return wxID_NONE;
     FillIn(*settings);
+    TranslateChoices(*settings);
     SettingsDialogue window(filters, *settings, m_file);
     m_window = &window;
     window.CallAfter([this, &user] {

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/settings/SettingsDialogue.h"
+#include "host/program/window/SettingsDialogue.h"
 #include "tests/support/RecordingOffice.h"
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"

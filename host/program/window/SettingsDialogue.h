@@ -1,18 +1,20 @@
 #pragma once
 
 #include "host/program/filters/FilterSet.h"
-#include "host/program/settings/SettingsFile.h"
+#include "host/program/system/Toolkit.h"
+#include "host/program/window/PanelChoices.h"
 
 #include <wx/dialog.h>
-#include <wx/infobar.h>
 
+class MessageBar;
+class ScrolledArea;
 class Settings;
-class wxScrolledWindow;
+class wxSizer;
 
 /// The identifiers of the window's buttons.
 namespace ButtonId {
 
-enum : int { Save = wxID_HIGHEST + 1, Cancel, Understood };
+enum : int { Save = wxID_HIGHEST + 1, Cancel, Restore, Understood };
 
 } // namespace ButtonId
 
@@ -21,7 +23,7 @@ enum : int { Save = wxID_HIGHEST + 1, Cancel, Understood };
 class SettingsDialogue : public wxDialog {
 public:
     /// @param filters live as long as the dialogue
-    /// @param settings what the panels show at first
+    /// @param settings what the panels show at first, in the language of the texts
     /// @param file where they are stored
     SettingsDialogue(const FilterSet& filters, const Settings& settings,
                      const std::filesystem::path& file);
@@ -30,13 +32,25 @@ public:
     bool HasPanel() const { return m_hasPanel; }
 
 private:
-    wxScrolledWindow* NewPanels(const Settings& settings);
+    void ShowPanels(const Settings& settings);
+    void SizePanels();
+    void ExplainObstacle();
     wxSizer* NewButtons();
+    void FitToFault();
+
     void OnSave(wxCommandEvent& event);
+    void OnRestore(wxCommandEvent& event);
+    void OnUnderstood(wxCommandEvent& event);
     void OnKey(wxKeyEvent& event);
+    void OnSize(wxSizeEvent& event);
 
     const FilterSet& m_filters;
     const std::filesystem::path m_file;
-    wxInfoBar* m_fault = nullptr; ///< says why the settings could not be stored
+    ScrolledArea* m_area;
+    MessageBar* m_obstacle;              ///< says why the panels are greyed out
+    MessageBar* m_fault;                 ///< says why the settings could not be stored
+    int m_faultHeight = 0;               ///< by which the window has grown for it
+    std::vector<PanelChoices> m_choices; ///< of each panel
+    FocusWatch m_focusWatch;
     bool m_hasPanel = false;
 };
