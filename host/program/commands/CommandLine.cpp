@@ -33,8 +33,10 @@ Files and folders
 Settings
   A settings file is XML with an element UI that has one element for each setting; `quillon
   settings` shows and writes it. A --set goes before the file, and --printer, --ps, --pdf and
-  --profile go before both. Without OUTPUTFILETYPEPS there are PDF files too; without PRINTER, the
-  Distiller printer is used or else the program's own file printer.
+  --profile go before both. What is not set has the value in brackets, in the window as in a
+  conversion: a new file prints what none does. Without PRINTER, the Distiller printer is used or
+  else the program's own file printer; without a profile, Distiller makes PDF files in its own way.
+  The window's texts for PRINTOUTPUTTYPE and COLOR are understood in every language.
 )";
 
 constexpr const char* ExitCodes = R"(
@@ -58,9 +60,13 @@ Output
 
 std::string SettingsTable() {
     std::ostringstream table;
-    for (const SettingsKey& key : KnownSettings())
+    for (const SettingsKey& key : KnownSettings()) {
         table << "  " << std::left << std::setw(27) << key.name << std::setw(13) << key.values
-              << key.meaning << '\n';
+              << key.meaning;
+        if (*key.standard)
+            table << " (" << key.standard << ')';
+        table << '\n';
+    }
     return table.str();
 }
 

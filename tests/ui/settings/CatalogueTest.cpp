@@ -1,3 +1,4 @@
+#include "host/program/window/MessageBar.h"
 #include "host/services/CatalogueLoader.h"
 #include "tests/ui/settings/SettingsWindow.h"
 #include "ui/ControlIds.h"
@@ -15,6 +16,11 @@ const char* const Languages[] = {"de", "es", "fr", "ja"};
 
 class CatalogueTest : public SettingsWindow {
 protected:
+    /// What a bar says is put together.
+    static bool InBar(const wxWindow* window) {
+        return dynamic_cast<const MessageBar*>(window->GetParent());
+    }
+
     /// Collects what the window shows and what is no name of this machine's.
     void CollectFromWindow() {
         Open([this] {
@@ -28,7 +34,7 @@ protected:
                 if (choice)
                     for (const wxString& entry : choice->GetStrings())
                         Add(entry);
-                else if (dynamic_cast<const wxControl*>(each))
+                else if (dynamic_cast<const wxControl*>(each) && !InBar(each))
                     Add(each->GetLabel());
             });
         });
@@ -55,9 +61,6 @@ TEST_F(CatalogueTest, HasEveryTextThatTheProgramShows) {
     for (int code = -2000; code < 2000; ++code)
         Add(filters.ErrorText(code));
     EXPECT_GT(m_keys.size(), 60U) << "and result codes";
-    for (const char* said : {"The settings are not saved. %s cannot be written: %s.",
-                             "its folder does not exist", "it is write-protected"})
-        m_keys.insert(said);
     for (const char* language : Languages) {
         Speak(language);
         for (const wxString& key : m_keys)
