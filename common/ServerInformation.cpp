@@ -20,9 +20,12 @@ bool ServerVersionAtLeast(const wxString& serverInfo, std::int32_t minimum) {
     if (!element || !element->GetChildren())
         return false;
 
-    // ToLong leaves in `version` the number that the text begins with, whatever follows it.
+    // ToLong leaves in `version` the number that the text begins with, whatever follows it. One
+    // that does not fit a long it leaves out, and so do we where a long has more than 32 bits.
     using Limits = std::numeric_limits<std::int32_t>;
     long version = 0;
     element->GetChildren()->GetContent().ToLong(&version);
-    return std::clamp<long>(version, Limits::min(), Limits::max()) >= minimum;
+    if (std::clamp<long>(version, Limits::min(), Limits::max()) != version)
+        version = 0;
+    return version >= minimum;
 }

@@ -38,6 +38,10 @@ TEST(ServerVersionAtLeast, ReadsTheLeadingNumber) {
         {"<a><ServerVersion>15</ServerVersion></a>", false},
         {"<a><ServerVersion>v16</ServerVersion></a>", false},
         {"<a><ServerVersion>-17</ServerVersion></a>", false},
+        {"<a><ServerVersion>2147483648</ServerVersion></a>", false}, // no number of 32 bits
+        {"<a><ServerVersion>-2147483649</ServerVersion></a>", false},
+        {"<a><ServerVersion>99999999999999999999</ServerVersion></a>", false},
+        {"<a><ServerVersion>2147483647</ServerVersion></a>", true},
         {"<a><ServerVersion> 16.2</ServerVersion></a>", true},
         {"<a><b><c><ServerVersion>17 beta</ServerVersion></c></b></a>", true},
     };
