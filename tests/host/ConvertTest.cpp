@@ -169,6 +169,7 @@ TEST_F(ConvertTest, AnInterruptionFinishesTheDocumentAndReportsTheRest) {
         RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc", "b.doc"})));
         AwaitFile(started);
         (program.*ask)();
+        program.AwaitNote();
         m_folder.Write("go", "");
         const RunResult run = program.Wait();
         EXPECT_EQ(run.exitCode, 4) << run.err;

@@ -60,9 +60,14 @@ std::vector<nlohmann::json> RunResult::Records(const std::string& type) const {
 RunningProgram::RunningProgram(const std::vector<std::string>& command)
     : m_process(command, m_folder / "out", m_folder / "err") {}
 
+void RunningProgram::AwaitNote() const {
+    Await("the note",
+          [this] { return Err().find("finishing what is under way") != std::string::npos; });
+}
+
 void RunningProgram::InterruptTwice() const {
     Interrupt();
-    Await("the note", [this] { return Err().find("finishing") != std::string::npos; });
+    AwaitNote();
     Terminate();
 }
 

@@ -31,7 +31,9 @@ public:
     void Interrupt() const { m_process.Interrupt(); }
     /// Asks it to end in the other way that the system has, if it has one.
     void Terminate() const { m_process.Terminate(); }
-    /// Asks it to end, and when it has said that it will finish what is under way, once more.
+    /// Waits until it has said that it finishes what is under way, and so taken the request in.
+    void AwaitNote() const;
+    /// Asks it to end, and when it has taken that in, once more.
     void InterruptTwice() const;
     RunResult Wait();
 

@@ -92,7 +92,7 @@ TEST_F(WorkersTest, AnInterruptionFinishesWhatIsUnderWay) {
         QuillonCommand(ArgumentsFor({"a.doc", "b.doc", "c.doc"}, {"-j", "2", "--log", log})));
     AwaitStart();
     program.Interrupt();
-    Await("the note", [&program] { return program.Err().find("finishing") != std::string::npos; });
+    program.AwaitNote();
     m_folder.Write("go", "");
     const RunResult run = program.Wait();
     EXPECT_EQ(run.exitCode, 4) << run.err;
