@@ -1,20 +1,12 @@
 #pragma once
 
-#include <afxwin.h>
-
-#include <utility>
+#include "common/CatchAll.h"
 
 /// Runs the body of an operation that the host calls. No exception may cross the module's boundary:
 /// one that comes up (memory running out, in the end) becomes `fallback`.
 template <typename Answer, typename Body>
 Answer AtBoundary(Answer fallback, Body&& body) noexcept {
-    try {
-        return std::forward<Body>(body)();
-    } catch (CException* exception) {
-        exception->Delete();
-    } catch (...) { // NOLINT(bugprone-empty-catch): the fallback is the report
-    }
-    return fallback;
+    return CatchAll(fallback, std::forward<Body>(body));
 }
 
 /// The same for an operation without an answer.

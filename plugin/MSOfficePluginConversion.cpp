@@ -3,7 +3,6 @@
 #include "office/PowerPointDriver.h"
 #include "office/PublisherDriver.h"
 #include "office/WordDriver.h"
-#include "plugin/Boundary.h"
 #include "plugin/MSOfficePluginImpl.h"
 #include "pstools/PS2PDF.h"
 
@@ -12,14 +11,14 @@
 int MSOfficePluginImpl::Convert(void* /*reserved*/, const JobItem& item,
                                 const wxString& outputFolder, wxString& outputName,
                                 ProgressSink* progress) {
-    return AtBoundary(Result::Failure, [&] {
+    return RunOperation(Result::Failure, [&] {
         if (item.fileName.empty() || item.paths.empty())
-            return m_lastResult = Result::InputFileNotFound;
+            return Result::InputFileNotFound;
         const wxFileName document(item.paths[0]);
-        m_lastResult = PrintDocument(document, outputFolder, outputName, progress);
-        if (m_lastResult == Result::Success && !m_psOutput)
-            m_lastResult = DistillDocument(document, outputFolder, outputName);
-        return m_lastResult;
+        const ResultCode printed = PrintDocument(document, outputFolder, outputName, progress);
+        if (printed != Result::Success || m_psOutput)
+            return printed;
+        return DistillDocument(document, outputFolder, outputName);
     });
 }
 

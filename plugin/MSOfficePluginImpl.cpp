@@ -2,7 +2,6 @@
 
 #include "common/ServerInformation.h"
 #include "office/InstalledApplications.h"
-#include "plugin/Boundary.h"
 #include "plugin/PluginIdentity.h"
 #include "pstools/PrinterDiscovery.h"
 #include "ui/MSOfficePanel.h"
@@ -19,10 +18,10 @@ MSOfficePluginImpl::MSOfficePluginImpl() = default;
 MSOfficePluginImpl::~MSOfficePluginImpl() = default;
 
 int MSOfficePluginImpl::Initialize(const wxString& serverInfo) {
-    return AtBoundary(Result::Failure, [&] {
+    return RunOperation(Result::Failure, [&] {
         m_currentServer = ServerVersionAtLeast(serverInfo, CurrentServerVersion);
         FindPrinter();
-        return m_lastResult = Result::Success;
+        return Result::Success;
     });
 }
 

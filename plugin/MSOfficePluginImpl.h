@@ -1,5 +1,6 @@
 #pragma once
 
+#include "plugin/Boundary.h"
 #include "plugin/PowerPointOptions.h"
 #include "plugin/ResultCodes.h"
 #include "plugin/SettingsMap.h"
@@ -49,9 +50,16 @@ public:
 private:
     enum class Screening { GoOn, Stop };
 
+    /// Runs the body of an operation that answers a result code. That code is the object's last
+    /// result from then on, also where the body throws.
+    template <typename Body>
+    int RunOperation(ResultCode codeOfException, Body&& body) noexcept {
+        return m_lastResult = AtBoundary(codeOfException, std::forward<Body>(body));
+    }
+
     void FindPrinter();
     Screening ScreenFile(const wxString& path, wxArrayString& refused, JobItemArray& items);
-    void Accept(const wxString& path, JobItemArray& items);
+    void Accept(const wxFileName& document, JobItemArray& items);
     ResultCode PrintDocument(const wxFileName& document, const wxString& outputFolder,
                              wxString& outputName, ProgressSink* progress);
     ResultCode DistillDocument(const wxFileName& document, const wxString& outputFolder,

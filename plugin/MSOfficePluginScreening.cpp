@@ -1,4 +1,3 @@
-#include "plugin/Boundary.h"
 #include "plugin/MSOfficePluginImpl.h"
 #include "plugin/ScreeningRules.h"
 
@@ -6,7 +5,6 @@
 #include <wx/filename.h>
 
 #include <memory>
-#include <new>
 #include <type_traits>
 
 namespace {
@@ -44,7 +42,7 @@ bool IsRepresentableInUtf8(const wxString& text) {
 
 int MSOfficePluginImpl::ScreenFiles(const wxArrayString& files, wxArrayString& spare,
                                     wxArrayString& refused, JobItemArray& items) {
-    return AtBoundary(Result::Failure, [&] {
+    return RunOperation(Result::Failure, [&] {
         spare.Clear();
         for (const wxString& path : files)
             if (ScreenFile(path, refused, items) == Screening::Stop)
@@ -57,8 +55,9 @@ int MSOfficePluginImpl::ScreenFiles(const wxArrayString& files, wxArrayString& s
 /// later file too, and a list that is broken in itself, end the run.
 MSOfficePluginImpl::Screening
 MSOfficePluginImpl::ScreenFile(const wxString& path, wxArrayString& refused, JobItemArray& items) {
+    const wxFileName name(path);
     const auto refuse = [&](ResultCode code) {
-        refused.Add(wxFileName(path).GetFullPath());
+        refused.Add(name.GetFullPath());
         m_lastResult = code;
     };
 
@@ -70,7 +69,7 @@ MSOfficePluginImpl::ScreenFile(const wxString& path, wxArrayString& refused, Job
         refuse(Result::InvalidInputFile);
         return Screening::Stop;
     }
-    const ScreeningRule* rule = FindScreeningRule(wxFileName(path).GetExt());
+    const ScreeningRule* rule = FindScreeningRule(name.GetExt());
     if (!rule) {
         refuse(Result::InvalidInputFile);
         return Screening::GoOn;
@@ -83,29 +82,27 @@ MSOfficePluginImpl::ScreenFile(const wxString& path, wxArrayString& refused, Job
         return Screening::Stop;
     }
 
-    m_lastResult = rule->check(path);
+    m_lastResult = rule->check(name.GetFullPath());
     if (m_lastResult == Result::Success)
-        Accept(path, items);
+        Accept(name, items);
     return Screening::GoOn;
 }
 
-void MSOfficePluginImpl::Accept(const wxString& path, JobItemArray& items) {
-    const wxFileName name(path);
-    try {
+/// Where memory runs out this file gets no item; the others need not suffer for it.
+void MSOfficePluginImpl::Accept(const wxFileName& document, JobItemArray& items) {
+    AtBoundary([&] {
         auto item = std::make_unique<JobItem>();
         GetIdentifier(item->pluginIdentifier);
-        item->fileName = name.GetFullName();
-        item->paths.Add(name.GetFullPath());
+        item->fileName = document.GetFullName();
+        item->paths.Add(document.GetFullPath());
         items.Add(item.get());
-        item.release();               // NOLINT(bugprone-unused-return-value): the array has it now
-    } catch (const std::bad_alloc&) { // NOLINT(bugprone-empty-catch)
-        // This file gets no item; the others need not suffer for it.
-    }
+        item.release(); // NOLINT(bugprone-unused-return-value): the array has it now
+    });
 }
 
 int MSOfficePluginImpl::ScreenFolder(const wxString& folder, wxArrayString& refused,
                                      JobItemArray& items) {
-    return AtBoundary(Result::Failure, [&]() -> int {
+    return RunOperation(Result::Failure, [&] {
         wxArrayString files;
         if (wxDir::Exists(folder))
             wxDir::GetAllFiles(folder, &files, wxEmptyString, wxDIR_FILES);
@@ -116,7 +113,7 @@ int MSOfficePluginImpl::ScreenFolder(const wxString& folder, wxArrayString& refu
 
 int MSOfficePluginImpl::ScreenFileList(const wxString& /*folder*/, wxArrayString& refused,
                                        JobItemArray& items, wxArrayString** files) {
-    return AtBoundary(Result::Failure, [&]() -> int {
+    return RunOperation(Result::Failure, [&] {
         const wxArrayString copy = **files;
         wxArrayString spare;
         return ScreenFiles(copy, spare, refused, items);

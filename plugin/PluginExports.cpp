@@ -7,7 +7,7 @@
 #include <objbase.h>
 
 #include <memory>
-#include <new>
+#include <utility>
 
 namespace {
 
@@ -18,22 +18,21 @@ bool g_comInitialised = false;
 } // namespace
 
 void InitializePlugin() {
-    if (g_moduleToken)
-        return;
-    std::unique_ptr<char> token(new (std::nothrow) char{});
-    if (!token)
-        return;
-    g_comInitialised = InitializeMfcAndCom();
-    g_moduleToken = std::move(token);
+    AtBoundary([] {
+        if (g_moduleToken)
+            return;
+        auto token = std::make_unique<char>();
+        g_comInitialised = InitializeMfcAndCom();
+        g_moduleToken = std::move(token);
+    });
 }
 
 void UninitializePlugin() {
-    if (!g_moduleToken)
-        return;
-    if (g_comInitialised)
-        CoUninitialize();
-    g_comInitialised = false;
-    g_moduleToken.reset();
+    AtBoundary([] {
+        const std::unique_ptr<char> token = std::move(g_moduleToken);
+        if (token && g_comInitialised)
+            CoUninitialize();
+    });
 }
 
 void GetPluginInfo(PluginInfo* info) {
@@ -54,5 +53,5 @@ WQPlugin* GetPluginInstance(void* /*context*/) {
 }
 
 void ReleasePluginInstance(WQPlugin* plugin) {
-    const std::unique_ptr<WQPlugin> released(plugin);
+    AtBoundary([plugin] { const std::unique_ptr<WQPlugin> released(plugin); });
 }

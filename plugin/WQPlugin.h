@@ -21,7 +21,7 @@ public:
     virtual ~WQPlugin() = default;
 
     /// @param serverInfo the server information, an XML text; may be empty
-    /// @return 0
+    /// @return 0, or -1 where memory ran out
     virtual int Initialize(const wxString& serverInfo) = 0;
 
     /// Reads the element "UI" below `settings` and makes its values the ones to convert with.
@@ -87,7 +87,8 @@ public:
 /// What a filter module exports, undecorated.
 extern "C" {
 
-/// Initialises the module. Called once, before anything else of it.
+/// Initialises the module. Called once, before anything else of it, from a thread that is not in
+/// COM's multithreaded apartment, as no thread may be that calls an object's operations.
 void InitializePlugin();
 
 /// Describes the filter: sets the kind and the texts of `info`, appends to its extensions.

@@ -12,6 +12,8 @@
 
 namespace {
 
+using testing::Contains;
+using testing::HasSubstr;
 using testing::IsSupersetOf;
 
 class ScreeningTest : public testing::Test {
@@ -97,6 +99,11 @@ TEST_F(ScreeningTest, HasAnOpenXmlDocumentOpenedByItsApplication) {
               Screen({"a.docx", "a.XLSX", "a.pptx", "a.ppsx"}));
     EXPECT_THAT(m_office->JournalInShort(),
                 IsSupersetOf({"Documents.15", "Workbooks.682", "Presentations.2004"}));
+
+    const wxString roundabout = "/in//a.xlsx";
+    ScreenPaths(wxArrayString(1, &roundabout)); // the check is given what the conversion will be
+    EXPECT_THAT(m_office->Journal(),
+                Contains(HasSubstr('"' + m_items[0]->paths[0].utf8_string() + '"')));
 }
 
 TEST_F(ScreeningTest, RefusesGoesOnAndStopsByTheKindOfFault) {

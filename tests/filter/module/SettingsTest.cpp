@@ -58,10 +58,15 @@ TEST(Settings, AccumulateAndKeepWhatTheFilterDoesNotKnow) {
     plugin->LoadSettings(nullptr);
     EXPECT_EQ((Settings{{"MINE", "kept"}, {"COLOR", "Grayscale"}}), Saved(plugin));
 
-    EXPECT_EQ(0, plugin->ApplySettings(nullptr)); // enters every key that the filter knows
+    EXPECT_EQ(0, plugin->ApplySettings(nullptr)); // enters every key that it asks for
     EXPECT_EQ(14U, Saved(plugin).size());
     EXPECT_EQ("", Saved(plugin).at("HIGHQUALITY"));
     EXPECT_EQ("Grayscale", Saved(plugin).at("COLOR"));
+
+    const PluginUnderTest horizontal; // one order is enough
+    horizontal->ApplySettings(
+        XmlText("<r><UI><HANDOUTSHORIZONTAL>1</HANDOUTSHORIZONTAL></UI></r>").GetRoot());
+    EXPECT_EQ(0U, Saved(horizontal).count("HANDOUTSVERTICAL"));
 }
 
 /// Settings as they reach PowerPoint.
