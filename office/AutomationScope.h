@@ -1,7 +1,8 @@
 #pragma once
 
-/// Initialises MFC for the process and COM, single-threaded, for the calling thread. When MFC
-/// refuses, says so on standard output and leaves COM alone.
+/// Initialises MFC for the process and COM, single-threaded, for the calling thread, which must not
+/// be in COM's multithreaded apartment. When MFC refuses, says so on standard output and leaves COM
+/// alone. Throws nothing.
 /// @return whether COM was initialised, so that CoUninitialize is owed
 bool InitializeMfcAndCom();
 

@@ -9,11 +9,20 @@
 #include "office/StandardArguments.h"
 #include "office/dispatch/ExcelObjects.h"
 
+#include <optional>
+
 namespace {
 
 using namespace std::chrono_literals;
 
 constexpr OutputWait Wait{100ms, false, 4s};
+
+/// What the driver holds of Excel. Released in the opposite order.
+struct ExcelObjects {
+    excel::Application application;
+    excel::Workbooks workbooks;
+    excel::Workbook workbook;
+};
 
 /// Prints the whole workbook once into the file. The printer is named in the call, and nothing of
 /// Excel's own is changed.
@@ -32,18 +41,21 @@ void PrintIntoFile(excel::Workbook& workbook, const wxString& path, const wxStri
                       prToFileName);  // PrToFileName
 }
 
-/// From the running application to the printed file and Excel told to quit.
-bool PrintThroughExcel(excel::Application& application, const wxString& inputPath,
-                       const PSOutput& output, const wxString& printer, StandardArguments& arg,
-                       const ProgressReporter& report) {
-    excel::Workbooks workbooks = application.GetWorkbooks();
+/// From Excel's start to the printed file and Excel told to quit.
+ResultCode PrintThroughExcel(ExcelObjects& objects, const wxString& inputPath,
+                             const PSOutput& output, const wxString& printer,
+                             StandardArguments& arg, const ProgressReporter& report) {
+    auto& [application, workbooks, workbook] = objects;
+    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Excel)))
+        return Result::ExcelStartFailed;
+    report(15);
+    workbooks = application.GetWorkbooks();
     report(20);
-    excel::Workbook workbook =
-        workbooks.OpenReadOnly(inputPath.wc_str(), arg.ArgTrue, arg.ArgOmitted);
+    workbook = workbooks.OpenReadOnly(inputPath.wc_str(), arg.ArgTrue, arg.ArgOmitted);
     report(30);
     PrintIntoFile(workbook, output.path, printer, arg);
     if (!WaitForOutput(output.path, Wait))
-        return false;
+        return Result::PrintFailed;
     report(85);
 
     workbook.Close(arg.ArgFalse, arg.ArgOmitted, arg.ArgOmitted);
@@ -52,7 +64,7 @@ bool PrintThroughExcel(excel::Application& application, const wxString& inputPat
     workbooks.ReleaseDispatch();
     application.Quit();
     report(95);
-    return true;
+    return Result::Success;
 }
 
 } // namespace
@@ -60,6 +72,7 @@ bool PrintThroughExcel(excel::Application& application, const wxString& inputPat
 ResultCode PrintExcelWorkbook(const wxString& inputPath, const wxString& outputFolder,
                               wxString& psFileName, ProgressSink* progress,
                               const wxString* printer) {
+    std::optional<AFX_MAINTAIN_STATE2> moduleState; // switched back when the scope has been closed
     const AutomationScope scope;
     if (inputPath.empty())
         return Result::InputFileNotFound;
@@ -68,7 +81,7 @@ ResultCode PrintExcelWorkbook(const wxString& inputPath, const wxString& outputF
     const PSOutput output(workbook, outputFolder);
     const ProgressReporter report(progress, workbook.GetName());
     psFileName = output.fileName;
-    const AFX_MAINTAIN_STATE2 moduleState(AfxGetStaticModuleState());
+    moduleState.emplace(AfxGetStaticModuleState());
     const bool isInstalled = IsApplicationInstalledForExtension(workbook.GetExt());
     report(5);
     if (!isInstalled)
@@ -79,18 +92,16 @@ ResultCode PrintExcelWorkbook(const wxString& inputPath, const wxString& outputF
         return Result::DistillerNotInstalled;
     report(10);
 
-    excel::Application application;
+    // An Excel that fails is told to quit while the workbook is still held, and then released.
+    ExcelObjects objects;
     StandardArguments arg;
-    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Excel)))
-        return Result::ExcelStartFailed;
-    report(15);
-    const bool isPrinted = RunAutomation([&] {
-        return PrintThroughExcel(application, inputPath, output, chosenPrinter, arg, report);
+    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+        return PrintThroughExcel(objects, inputPath, output, chosenPrinter, arg, report);
     });
-    if (!isPrinted) {
-        QuitAfterFailure(application);
-        return Result::PrintFailed;
-    }
+    if (printed == Result::PrintFailed)
+        QuitAfterFailure(objects.application);
+    if (printed != Result::Success)
+        return printed;
 
     const ResultCode result = RepairOutput(output);
     report(100);

@@ -23,8 +23,8 @@ int CheckBy(bool (*tryOpen)(wxString), const wxString& path) {
 // be asked of one that may be in any state.
 
 bool TryOpenInWord(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    const AutomationScope scope;
-    return RunAutomation([&] {
+    return RunAutomation(false, [&] {
+        const AutomationScope scope;
         StandardArguments arg;
         word::Application application;
         if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Word)))
@@ -41,8 +41,8 @@ bool TryOpenInWord(wxString path) { // NOLINT(performance-unnecessary-value-para
 }
 
 bool TryOpenInExcel(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    const AutomationScope scope;
-    return RunAutomation([&] {
+    return RunAutomation(false, [&] {
+        const AutomationScope scope;
         StandardArguments arg;
         excel::Application application;
         if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Excel)))
@@ -57,8 +57,8 @@ bool TryOpenInExcel(wxString path) { // NOLINT(performance-unnecessary-value-par
 }
 
 bool TryOpenInPowerPoint(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    const AutomationScope scope;
-    return RunAutomation([&] {
+    return RunAutomation(false, [&] {
+        const AutomationScope scope;
         powerpoint::Application application;
         if (!application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint)))
             return false;

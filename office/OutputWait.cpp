@@ -21,7 +21,7 @@ bool WaitForOutput(const wxString& path, const OutputWait& wait) {
     QueryFileSize(path, size);
     for (;;) {
         Sleep(static_cast<DWORD>(wait.pollInterval.count()));
-        std::uint64_t newSize = size; // a reading that fails changes nothing
+        std::uint64_t newSize = wait.emptyIsStable ? 0 : size; // where the reading fails
         QueryFileSize(path, newSize);
         if (newSize == size && (size != 0 || wait.emptyIsStable))
             break;

@@ -9,7 +9,8 @@
 /// until two readings agree.
 struct OutputWait {
     std::chrono::milliseconds pollInterval;
-    /// Whether two readings of 0, or of no file, agree too; a later step then finds out.
+    /// Whether a file that cannot be read counts as empty, and two readings of 0 agree too; a later
+    /// step then finds out. Otherwise a reading that fails changes nothing.
     bool emptyIsStable;
     /// How long a large file, which may pause while it grows, is left alone afterwards.
     std::chrono::seconds settleTimeOfLargeFile;

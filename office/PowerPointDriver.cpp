@@ -19,10 +19,14 @@ constexpr DWORD MillisecondsBeforeRelease = 2000;
 
 constexpr LONG WholePresentation = -1;
 
-/// From the running application to the printed file and the presentation closed.
-bool PrintThroughPowerPoint(powerpoint::Application& application, const wxString& inputPath,
-                            const PSOutput& output, const wxString& printer,
-                            const PowerPointOptions& options, const ProgressReporter& report) {
+/// From PowerPoint's start to the printed file and the presentation closed.
+ResultCode PrintThroughPowerPoint(powerpoint::Application& application, const wxString& inputPath,
+                                  const PSOutput& output, const wxString& printer,
+                                  const PowerPointOptions& options,
+                                  const ProgressReporter& report) {
+    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint)))
+        return Result::PowerPointStartFailed;
+    report(15);
     powerpoint::Presentations presentations = application.GetPresentations();
     report(20);
     powerpoint::Presentation presentation = presentations.Open(inputPath.wc_str(), 1, 1, 0);
@@ -36,7 +40,7 @@ bool PrintThroughPowerPoint(powerpoint::Application& application, const wxString
     PutSwitches(printOptions, options);
     presentation.PrintOut(WholePresentation, WholePresentation, output.path.wc_str(), 1, 1);
     if (!WaitForOutput(output.path, Wait))
-        return false;
+        return Result::PrintFailed;
     report(85);
 
     presentation.Close();
@@ -44,7 +48,7 @@ bool PrintThroughPowerPoint(powerpoint::Application& application, const wxString
     printOptions.ReleaseDispatch();
     presentation.ReleaseDispatch();
     presentations.ReleaseDispatch();
-    return true;
+    return Result::Success;
 }
 
 } // namespace
@@ -72,17 +76,15 @@ ResultCode PrintPowerPointPresentation(const wxString& inputPath, const wxString
 
     HighQualityDefault highQuality;
     highQuality.Install(options->highQuality);
-    powerpoint::Application application;
-    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint)))
-        return Result::PowerPointStartFailed;
-    report(15);
     // PowerPoint is one process for all its users, and never told to quit: the user may be working
     // in it. Where it fails, the high-quality default stays with it as it was installed.
-    if (!RunAutomation([&] {
-            return PrintThroughPowerPoint(application, inputPath, output, chosenPrinter, *options,
-                                          report);
-        }))
-        return Result::PrintFailed;
+    powerpoint::Application application;
+    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+        return PrintThroughPowerPoint(application, inputPath, output, chosenPrinter, *options,
+                                      report);
+    });
+    if (printed != Result::Success)
+        return printed;
     highQuality.Restore();
     Sleep(MillisecondsBeforeRelease); // PowerPoint is still busy with the presentation it closed
     application.ReleaseDispatch();

@@ -20,18 +20,27 @@ constexpr OutputWait Wait{100ms, true, 0s};
 constexpr LONG DoNotSaveChanges = 3; // pbDoNotSaveChanges
 constexpr LONG WholePublication = -1;
 
-/// From the running application to the printed file and Publisher told to quit.
-bool PrintThroughPublisher(publisher::Application& application, const wxString& inputPath,
-                           const PSOutput& output, const wxString& printer,
-                           const ProgressReporter& report) {
-    publisher::Document publication =
-        application.Open(inputPath.wc_str(), TRUE, FALSE, DoNotSaveChanges);
+/// What the driver holds of Publisher. Released in the opposite order.
+struct PublisherObjects {
+    publisher::Application application;
+    publisher::Document publication;
+};
+
+/// From Publisher's start to the printed file and Publisher told to quit.
+ResultCode PrintThroughPublisher(PublisherObjects& objects, const wxString& inputPath,
+                                 const PSOutput& output, const wxString& printer,
+                                 const ProgressReporter& report) {
+    auto& [application, publication] = objects;
+    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Publisher)))
+        return Result::PublisherStartFailed;
+    report(20);
+    publication = application.Open(inputPath.wc_str(), TRUE, FALSE, DoNotSaveChanges);
     report(30);
     publication.PutActivePrinter(printer.wc_str());
     report(35);
     publication.PrintOut(WholePublication, WholePublication, output.path.wc_str(), 1, FALSE);
     if (!WaitForOutput(output.path, Wait))
-        return false;
+        return Result::PrintFailed;
     report(85);
 
     publication.Close();
@@ -39,7 +48,7 @@ bool PrintThroughPublisher(publisher::Application& application, const wxString& 
     publication.ReleaseDispatch();
     application.Quit();
     report(95);
-    return true;
+    return Result::Success;
 }
 
 } // namespace
@@ -73,19 +82,17 @@ ResultCode PrintPublisherDocument(const wxString& inputPath, const wxString& out
         return Result::PublisherTooOld;
 
     // From the application's start to the repaired file the user's defaults for the Distiller
-    // printer are the filter's own. Publisher is released before they are the user's again.
+    // printer are the filter's own. Publisher is released before they are the user's again; one
+    // that fails is told to quit while the publication is still held.
     const DistillerDevModeGuard guard;
-    publisher::Application application;
-    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Publisher)))
-        return Result::PublisherStartFailed;
-    report(20);
-    const bool isPrinted = RunAutomation([&] {
-        return PrintThroughPublisher(application, inputPath, output, chosenPrinter, report);
+    PublisherObjects objects;
+    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+        return PrintThroughPublisher(objects, inputPath, output, chosenPrinter, report);
     });
-    if (!isPrinted) {
-        QuitAfterFailure(application);
-        return Result::PrintFailed;
-    }
+    if (printed == Result::PrintFailed)
+        QuitAfterFailure(objects.application);
+    if (printed != Result::Success)
+        return printed;
 
     const ResultCode result = RepairOutput(output);
     report(100);

@@ -1,28 +1,20 @@
 #pragma once
 
-#include <afxwin.h>
+#include "common/CatchAll.h"
 
-#include <utility>
-
-/// Runs automation steps. The one place where what they throw is caught: a document that is
-/// refused, a printer that is not there, an application that went away.
-/// @param steps answers whether they succeeded
-/// @return that answer, or false when an exception ended them
-template <typename Steps>
-bool RunAutomation(Steps&& steps) noexcept {
-    try {
-        return std::forward<Steps>(steps)();
-    } catch (CException* exception) {
-        exception->Delete();
-    } catch (...) { // NOLINT(bugprone-empty-catch): false is the report
-    }
-    return false;
+/// Runs automation steps and catches what they throw: a document that is refused, a printer that is
+/// not there, an application that went away.
+/// @param onException what is answered then; otherwise it is what the steps answer
+template <typename Answer, typename Steps>
+Answer RunAutomation(Answer onException, Steps&& steps) noexcept {
+    return CatchAll(onException, std::forward<Steps>(steps));
 }
 
-/// Tells an application to quit that failed half-way; it may be past listening.
+/// Tells an application to quit that failed half-way; it may be past listening, or not have come
+/// up at all.
 template <typename Application>
 void QuitAfterFailure(Application& application) noexcept {
-    RunAutomation([&] {
+    RunAutomation(false, [&] {
         application.Quit();
         return true;
     });

@@ -16,6 +16,15 @@ using namespace std::chrono_literals;
 
 constexpr OutputWait Wait{100ms, false, 4s};
 
+/// What the driver holds of Word. Released in the opposite order.
+struct WordObjects {
+    word::Application application;
+    word::Documents documents;
+    word::Document document;
+    word::Dialogs dialogs;
+    word::PrintSetupDialog setup;
+};
+
 /// Makes the printer Word's own without making it the system's default for every other program.
 void SelectPrinter(word::PrintSetupDialog& setup, const wxString& printer) {
     setup.PutDoNotSetAsSysDefault(TRUE);
@@ -47,30 +56,33 @@ void PrintIntoFile(word::Document& document, const wxString& path, StandardArgum
                       arg.ArgFalse);  // PrintZoomPaperHeight
 }
 
-/// From the running application to the printed file and Word told to quit.
-bool PrintThroughWord(word::Application& application, const wxString& inputPath,
-                      const PSOutput& output, const wxString& printer, StandardArguments& arg,
-                      const ProgressReporter& report) {
-    word::Documents documents = application.GetDocuments();
+/// From Word's start to the printed file and Word told to quit.
+ResultCode PrintThroughWord(WordObjects& objects, const wxString& inputPath, const PSOutput& output,
+                            const wxString& printer, StandardArguments& arg,
+                            const ProgressReporter& report) {
+    auto& [application, documents, document, dialogs, setup] = objects;
+    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Word)))
+        return Result::WordStartFailed;
+    report(15);
+    documents = application.GetDocuments();
     report(20);
-    word::Document document =
-        documents.Add(arg.ArgOmitted, arg.ArgOmitted, arg.ArgOmitted, arg.ArgOmitted);
+    document = documents.Add(arg.ArgOmitted, arg.ArgOmitted, arg.ArgOmitted, arg.ArgOmitted);
     report(25);
     COleVariant fileName(inputPath.wc_str());
     COleVariant readOnly(static_cast<SHORT>(1));
     document = documents.OpenReadOnly(fileName, readOnly, arg.ArgOmitted);
     report(30);
 
-    word::Dialogs dialogs = application.GetDialogs();
+    dialogs = application.GetDialogs();
     report(35);
-    word::PrintSetupDialog setup = dialogs.GetPrintSetup();
+    setup = dialogs.GetPrintSetup();
     report(40);
     SelectPrinter(setup, printer);
     report(55);
     application.PutActivePrinter(printer.wc_str());
     PrintIntoFile(document, output.path, arg);
     if (!WaitForOutput(output.path, Wait))
-        return false;
+        return Result::PrintFailed;
     report(85);
 
     document.Close(arg.ArgFalse, arg.ArgOmitted, arg.ArgOmitted);
@@ -81,7 +93,7 @@ bool PrintThroughWord(word::Application& application, const wxString& inputPath,
     documents.ReleaseDispatch();
     application.Quit(arg.ArgFalse, arg.ArgOmitted, arg.ArgOmitted);
     report(95);
-    return true;
+    return Result::Success;
 }
 
 } // namespace
@@ -108,18 +120,16 @@ ResultCode PrintWordDocument(const wxString& inputPath, const wxString& outputFo
     report(10);
 
     // From the application's start to the repaired file the user's defaults for the Distiller
-    // printer are the filter's own. Word is released before COM goes, and after the guard.
-    word::Application application;
+    // printer are the filter's own. Word is released before COM goes, and after the guard. It is
+    // not told to quit when it fails: it may be in any state, and is only released.
+    WordObjects objects;
     StandardArguments arg;
     const DistillerDevModeGuard guard;
-    if (!application.CreateDispatch(ProgIdOf(OfficeApplication::Word)))
-        return Result::WordStartFailed;
-    report(15);
-    // Word is not told to quit when it fails: it may be in any state, and is only released.
-    if (!RunAutomation([&] {
-            return PrintThroughWord(application, inputPath, output, chosenPrinter, arg, report);
-        }))
-        return Result::PrintFailed;
+    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+        return PrintThroughWord(objects, inputPath, output, chosenPrinter, arg, report);
+    });
+    if (printed != Result::Success)
+        return printed;
 
     const ResultCode result = RepairOutput(output);
     report(100);

@@ -2,6 +2,7 @@
 
 #include "office/CompoundFileCheck.h"
 #include "plugin/ResultCodes.h"
+#include "plugin/WQPlugin.h"
 #include "tests/filter/ComOnThisThread.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
@@ -10,21 +11,25 @@
 
 namespace {
 
-bool g_mfcRefuses = false;
+enum class Mfc { Starts, Refuses, Throws };
+
+Mfc g_mfc = Mfc::Starts;
 
 } // namespace
 
 // In the place of MFC's own.
 BOOL AfxWinInit(HINSTANCE /*instance*/, HINSTANCE /*previous*/, LPTSTR /*commandLine*/,
                 int /*show*/) {
-    return g_mfcRefuses ? FALSE : TRUE;
+    if (g_mfc == Mfc::Throws)
+        AfxThrowMemoryException();
+    return g_mfc == Mfc::Starts ? TRUE : FALSE;
 }
 
 namespace {
 
 class AutomationScopeTest : public testing::Test {
 protected:
-    void TearDown() override { g_mfcRefuses = false; }
+    void TearDown() override { g_mfc = Mfc::Starts; }
 };
 
 TEST_F(AutomationScopeTest, GivesComToTheThreadForItsLife) {
@@ -39,12 +44,20 @@ TEST_F(AutomationScopeTest, GivesComToTheThreadForItsLife) {
 }
 
 TEST_F(AutomationScopeTest, SaysThatMfcRefusedAndLeavesComAlone) {
-    g_mfcRefuses = true;
+    const std::string message = "Fatal Error: MFC initialization failed\n";
     CoInitialize(nullptr);
-    testing::internal::CaptureStdout();
-    EXPECT_FALSE(AutomationScope().IsComInitialised());
-    EXPECT_EQ("Fatal Error: MFC initialization failed\n", testing::internal::GetCapturedStdout());
-    EXPECT_TRUE(IsComInitialised()); // what the thread had is still there
+    for (const Mfc refusal : {Mfc::Refuses, Mfc::Throws}) {
+        g_mfc = refusal;
+        testing::internal::CaptureStdout();
+        EXPECT_FALSE(AutomationScope().IsComInitialised());
+        EXPECT_EQ(message, testing::internal::GetCapturedStdout());
+        testing::internal::CaptureStdout();
+        InitializePlugin();
+        InitializePlugin(); // the module does not ask again
+        UninitializePlugin();
+        EXPECT_EQ(message, testing::internal::GetCapturedStdout());
+        EXPECT_TRUE(IsComInitialised()); // what the thread had is still there
+    }
     CoUninitialize();
 }
 
@@ -55,7 +68,7 @@ TEST_F(AutomationScopeTest, ExcelFilesAloneAreNotLookedAtWithoutMfc) {
     file.AddStream(u"WordDocument", "words");
     const std::wstring path = folder.Write("a.doc", file.Bytes()).wstring();
     EXPECT_EQ(Result::Success, CheckExcelCompoundFile(path));
-    g_mfcRefuses = true;
+    g_mfc = Mfc::Refuses;
     EXPECT_EQ(Result::InvalidInputFile, CheckExcelCompoundFile(path));
     EXPECT_EQ(Result::Success, CheckWordCompoundFile(path));
 }

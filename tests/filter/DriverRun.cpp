@@ -18,9 +18,10 @@ DriverRun::DriverRun(const Driver& driver)
     : office({wxString(driver.application + ".Application").ToStdWstring()}), input(driver.input),
       m_driver(driver) {
     user.Set(REG_BINARY, UsersRecord);
+    office.NoteAtReleases([this] { return IsGuarded() ? " guarded" : ""; });
     const auto print = std::find_if(driver.steps.begin(), driver.steps.end(), Prints);
     OnCall(office, print->line, [this](const std::vector<std::wstring>& texts) {
-        m_recordWhilePrinting = user.Bytes();
+        wasGuardedWhilePrinting = IsGuarded();
         if (printed)
             folder.Write(std::filesystem::path(texts.back()).filename(), *printed);
     });
@@ -37,9 +38,8 @@ std::vector<std::string> DriverRun::ExpectedJournal(const char* printerUsed) con
     return journal;
 }
 
-bool DriverRun::WasGuardedWhilePrinting() const {
-    return std::equal(DistillerDevMode.begin(), DistillerDevMode.end(),
-                      m_recordWhilePrinting.begin(), m_recordWhilePrinting.end());
+bool DriverRun::IsGuarded() const {
+    return user.Bytes() == std::vector<BYTE>(DistillerDevMode.begin(), DistillerDevMode.end());
 }
 
 void DriverRun::ExpectNothingLeftBehind() const {

@@ -14,7 +14,8 @@
 #include <functional>
 #include <optional>
 
-/// A line of the journal that a driver leaves with its application.
+/// A line of the journal that a driver leaves with its application. Releases while the preferences
+/// for Distiller's printer are the filter's own are marked as guarded.
 struct DriverStep {
     std::string line; ///< <printer> stands for the printer, <output> for the path of the file
     int percent = 0;  ///< what the driver has reported before the call; none for a release
@@ -30,9 +31,10 @@ struct Driver {
 
     std::vector<DriverStep> steps; ///< when all goes well
     std::vector<int> percents;
-    wxString reportedName;        ///< what the reports are about
-    bool isGuarded = false;       ///< the preferences for Distiller's printer are ours meanwhile
-    std::string callAfterFailure; ///< empty when the application is only released
+    wxString reportedName;  ///< what the reports are about
+    bool isGuarded = false; ///< the preferences for Distiller's printer are ours meanwhile
+    /// What follows a call that failed; of the releases those of the objects that there are.
+    std::vector<std::string> afterFailure;
 
     ResultCode notInstalled = 0;
     ResultCode startFailed = 0;
@@ -57,7 +59,8 @@ public:
     /// The journal after the driver's steps, with the printer and this run's file in them.
     std::vector<std::string> ExpectedJournal(const char* printerUsed = "Proofer") const;
 
-    bool WasGuardedWhilePrinting() const;
+    /// Whether the preferences for Distiller's printer are the filter's own now.
+    bool IsGuarded() const;
 
     /// The user's preferences are what they were, and no object of the application is left.
     void ExpectNothingLeftBehind() const;
@@ -71,10 +74,10 @@ public:
     wxString printer = "Proofer";                     ///< the user's choice
     std::optional<std::string> printed = PrintedFile; ///< none: the application writes no file
     wxString psName;                                  ///< what the driver calls its output
+    bool wasGuardedWhilePrinting = false;
 
 private:
     const Driver m_driver;
-    std::vector<BYTE> m_recordWhilePrinting;
 };
 
 /// What all drivers do; instantiated for each beside what it does alone. A file that is not there

@@ -25,7 +25,7 @@ Driver Excel() {
         {"~Excel"},
     };
     driver.reportedName = "Report.final";
-    driver.callAfterFailure = "Excel.302 method";
+    driver.afterFailure = {"Excel.302 method", "~Workbook", "~Workbooks", "~Excel"};
     driver.notInstalled = Result::ExcelNotInstalled;
     driver.startFailed = Result::ExcelStartFailed;
     driver.percentsWithoutPrinter = {5};

@@ -58,7 +58,7 @@ TEST(OpenXmlCheck, RefusesWhereTheApplicationCannotBeStarted) {
     for (const TrialOpen& trial : TrialOpens) {
         EXPECT_EQ(Result::InvalidInputFile, trial.check("/in/a.docx")); // not installed
         RecordingOffice office({trial.progId});
-        office.RefuseToStart();
+        office.OnStart(DenyAccess);
         EXPECT_EQ(Result::InvalidInputFile, trial.check("/in/a.docx"));
         EXPECT_EQ(Result::InputFileNotFound, trial.check(wxString()));
         EXPECT_TRUE(office.Journal().empty());

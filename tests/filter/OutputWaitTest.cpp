@@ -1,69 +1,89 @@
 #include "office/OutputWait.h"
 
-#include "tests/support/TemporaryFolder.h"
+#include "pstools/FileProbe.h"
 
 #include <gtest/gtest.h>
 
-#include <atomic>
-#include <fstream>
-#include <thread>
+#include <functional>
+#include <optional>
+#include <vector>
 
 namespace {
 
 using namespace std::chrono_literals;
 using Clock = std::chrono::steady_clock;
+using Reading = std::optional<std::uint64_t>; // none: the file cannot be read
 
-/// Makes a file grow as fast as it can be appended to, for some time or until the object goes.
-class GrowingFile {
-public:
-    GrowingFile(const std::filesystem::path& path, std::chrono::milliseconds time)
-        : m_writer([this, path, end = Clock::now() + time] {
-              std::ofstream file(path, std::ios::app);
-              while (!m_stop && Clock::now() < end)
-                  file << "more" << std::flush;
-          }) {}
-    ~GrowingFile() {
-        m_stop = true;
-        m_writer.join();
-    }
+std::size_t g_readings = 0;
+std::function<Reading(std::size_t index)> g_read;
 
-private:
-    std::atomic<bool> m_stop = false;
-    std::thread m_writer;
-};
+} // namespace
+
+// In the place of the filter's own.
+void QueryFileSize(const wxString& /*path*/, std::uint64_t& size) {
+    size = g_read(g_readings++).value_or(size);
+}
+
+namespace {
+
+constexpr OutputWait Patient{1ms, false, 0s};
+constexpr OutputWait Trusting{1ms, true, 0s};
 
 class OutputWaitTest : public testing::Test {
 protected:
     void TearDown() override { GetOutputWaitLimits() = {}; }
 
-    TemporaryFolder m_folder;
-    std::filesystem::path m_path = m_folder.Write("a.ps", "");
+    static bool Wait(const OutputWait& wait, std::function<Reading(std::size_t)> read) {
+        g_readings = 0;
+        g_read = std::move(read);
+        return WaitForOutput("a.ps", wait);
+    }
 };
 
+TEST_F(OutputWaitTest, EndsWithTwoReadingsThatAgree) {
+    constexpr auto NoFile = std::nullopt;
+    const struct {
+        OutputWait wait;
+        std::vector<Reading> readings;
+    } cases[] = {
+        {Patient, {5, 5}},
+        {Patient, {NoFile, NoFile, 0, 0, 5, 9, 9}},
+        {Patient, {5, NoFile}},
+        {Trusting, {5, 6, 6}},
+        {Trusting, {0, 0}},
+        {Trusting, {NoFile, 0}},
+        {Trusting, {5, NoFile, NoFile}},
+        {Trusting, {5, NoFile, 5, 5}},
+    };
+    for (const auto& each : cases) {
+        EXPECT_TRUE(Wait(each.wait, [&](std::size_t i) {
+            return i < each.readings.size() ? each.readings[i] : 1000 + i;
+        }));
+        EXPECT_EQ(each.readings.size(), g_readings) << &each - cases;
+    }
+}
+
 TEST_F(OutputWaitTest, LastsWhileTheFileGrows) {
-    GetOutputWaitLimits() = {200ms, 1h};
-    const auto start = Clock::now();
-    const GrowingFile growing(m_path, 350ms);
-    EXPECT_TRUE(WaitForOutput(m_path.wstring(), {100ms, false, 0s}));
-    EXPECT_GE(Clock::now() - start, 350ms);
+    GetOutputWaitLimits() = {20ms, 1h};
+    const auto end = Clock::now() + 100ms;
+    EXPECT_TRUE(Wait(Patient, [end](std::size_t i) { return Clock::now() < end ? i : 1000; }));
+    EXPECT_GE(Clock::now(), end);
 }
 
 TEST_F(OutputWaitTest, EndsByItsLimits) {
-    GetOutputWaitLimits() = {200ms, 1h};
-    EXPECT_FALSE(WaitForOutput(m_path.wstring(), {5ms, false, 0s})); // it stays empty
-
-    GetOutputWaitLimits() = {1h, 200ms};
-    const GrowingFile growing(m_path, 1min);
-    EXPECT_FALSE(WaitForOutput(m_path.wstring(), {50ms, false, 0s}));
+    GetOutputWaitLimits() = {20ms, 1h};
+    EXPECT_FALSE(Wait(Patient, [](std::size_t) { return 0; }));
+    GetOutputWaitLimits() = {1h, 20ms};
+    EXPECT_FALSE(Wait(Patient, [](std::size_t i) { return i; }));
 }
 
 TEST_F(OutputWaitTest, LetsALargeFileSettle) {
-    for (const auto& [size, settles] :
-         {std::pair{LargeOutputSize - 1, false}, {LargeOutputSize, true}}) {
-        std::filesystem::resize_file(m_path, size);
+    for (const auto& [size, settleTime] :
+         {std::pair{LargeOutputSize - 1, 20s}, {LargeOutputSize, 1s}}) {
         const auto start = Clock::now();
-        EXPECT_TRUE(WaitForOutput(m_path.wstring(), {5ms, false, 1s}));
-        EXPECT_EQ(settles, Clock::now() - start >= 1s) << size;
+        const OutputWait wait{1ms, false, settleTime};
+        EXPECT_TRUE(Wait(wait, [size = size](std::size_t) { return size; }));
+        EXPECT_EQ(size >= LargeOutputSize, Clock::now() - start >= settleTime) << size;
     }
 }
 

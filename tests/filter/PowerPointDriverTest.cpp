@@ -39,6 +39,7 @@ Driver PowerPoint(const PowerPointOptions& options) {
     driver.reportedName = "Report.final";
     driver.notInstalled = Result::PowerPointNotInstalled;
     driver.startFailed = Result::PowerPointStartFailed;
+    driver.afterFailure = {"~PrintOptions", "~Presentation", "~Presentations", "~PowerPoint"};
     driver.percentsWithoutPrinter = {5, 10};
     return driver;
 }
@@ -84,7 +85,7 @@ TEST_F(HighQualityDefaultTest, IsLentForThePrintAndStaysWhereItFails) {
     using Prepare = void (*)(DriverRun&);
     const Prepare nothing = [](DriverRun&) {};
     const Prepare noPrinter = [](DriverRun& run) { run.printer.clear(); };
-    const Prepare noStart = [](DriverRun& run) { run.office.RefuseToStart(); };
+    const Prepare noStart = [](DriverRun& run) { run.office.OnStart(DenyAccess); };
     const Prepare noOpening = [](DriverRun& run) {
         run.office.On("Presentations", 2004, [](const auto&) { Raise(); });
     };

@@ -20,13 +20,13 @@ Driver Publisher() {
         {"Publication.1 put (\"<printer>\")", 30},
         {"Publication.54 method (I4 -1, I4 -1, \"<output>\", I4 1, false)", 35},
         {"Publication.48 method", 85},
-        {"~Publication"},
+        {"~Publication guarded"},
         {"Publisher.39 method", 90},
-        {"~Publisher"},
+        {"~Publisher guarded"},
     };
     driver.reportedName = "Report.final";
     driver.isGuarded = true;
-    driver.callAfterFailure = "Publisher.39 method";
+    driver.afterFailure = {"Publisher.39 method", "~Publication guarded", "~Publisher guarded"};
     driver.notInstalled = Result::PublisherNotInstalled;
     driver.startFailed = Result::PublisherStartFailed;
     driver.fileNeverComes = Result::OutputFileNotFound; // it is not waited for

@@ -16,7 +16,7 @@ Driver Word() {
         {"Documents.15 method (&\"/in/Report.final.docx\", &omitted, &I2 1, &omitted, &omitted, "
          "&omitted, &omitted, &omitted, &omitted, &omitted, &omitted, &omitted)",
          25},
-        {"~AddedDocument"},
+        {"~AddedDocument guarded"},
         {"Word.19 get", 30},
         {"Dialogs.0 method (I4 97)", 35},
         {"Dialog.4 put (true)", 40},
@@ -28,15 +28,17 @@ Driver Word() {
          "&I2 1, &omitted, &omitted, &I2 1, &I2 0, &omitted, &I2 0, &I2 0, &I2 0, &I2 0, &I2 0)",
          55},
         {"Document.1105 method (&I2 0, &omitted, &omitted)", 85},
-        {"~Dialog"},
-        {"~Dialogs"},
-        {"~Document"},
-        {"~Documents"},
+        {"~Dialog guarded"},
+        {"~Dialogs guarded"},
+        {"~Document guarded"},
+        {"~Documents guarded"},
         {"Word.1105 method (&I2 0, &omitted, &omitted)", 90},
         {"~Word"},
     };
     driver.reportedName = driver.input;
     driver.isGuarded = true;
+    driver.afterFailure = {"~Dialog",        "~Dialogs",   "~Document",
+                           "~AddedDocument", "~Documents", "~Word"};
     driver.notInstalled = Result::WordNotInstalled;
     driver.startFailed = Result::WordStartFailed;
     driver.percentsWithoutPrinter = {5};

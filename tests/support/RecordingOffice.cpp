@@ -13,7 +13,8 @@ struct RecordingOffice::State {
     std::vector<std::string> journal;
     std::map<std::pair<std::string, DISPID>, Action> actions;
     std::size_t liveObjects = 0;
-    bool refusesToStart = false;
+    std::function<void()> onStart = [] {};
+    std::function<std::string()> noteAtReleases = [] { return std::string(); };
 };
 
 namespace {
@@ -117,7 +118,7 @@ public:
 
 private:
     void LastReferenceGone() override {
-        m_state->journal.push_back("~" + m_name);
+        m_state->journal.push_back("~" + m_name + m_state->noteAtReleases());
         --m_state->liveObjects;
         delete this;
     }
@@ -157,8 +158,11 @@ public:
 
     HRESULT STDMETHODCALLTYPE CreateInstance(IUnknown* /*outer*/, REFIID iid,
                                              void** object) override {
-        if (m_state->refusesToStart)
-            return E_FAIL;
+        try {
+            m_state->onStart();
+        } catch (const RecordingOffice::Fail& failed) {
+            return failed.result;
+        }
         auto* created = new RecordingObject(m_name, m_state);
         const HRESULT result = created->QueryInterface(iid, object);
         created->Release();
@@ -221,8 +225,12 @@ void RecordingOffice::On(const std::string& object, DISPID member, Action action
     m_state->actions[{object, member}] = std::move(action);
 }
 
-void RecordingOffice::RefuseToStart() {
-    m_state->refusesToStart = true;
+void RecordingOffice::OnStart(std::function<void()> action) {
+    m_state->onStart = std::move(action);
+}
+
+void RecordingOffice::NoteAtReleases(std::function<std::string()> note) {
+    m_state->noteAtReleases = std::move(note);
 }
 
 const std::vector<std::string>& RecordingOffice::Journal() const {

@@ -16,7 +16,7 @@
 ///
 ///     Documents.15 method (&"C:\in.doc", &omitted, &I2 1)
 ///
-/// and the end of an object, with its last reference:
+/// and the release of an object's last reference:
 ///
 ///     ~Documents
 ///
@@ -45,8 +45,11 @@ public:
     /// @param action runs on each call of that member; it is given the call's text arguments
     void On(const std::string& object, DISPID member, Action action);
 
-    /// From now on no application can be started.
-    void RefuseToStart();
+    /// @param action runs whenever an application is started, and may throw
+    void OnStart(std::function<void()> action);
+
+    /// @param note says what stands behind the releases in the journal, at the time of each
+    void NoteAtReleases(std::function<std::string()> note);
 
     const std::vector<std::string>& Journal() const;
     /// The journal without arguments and kinds: "Documents.15", "~Documents".
