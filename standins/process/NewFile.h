@@ -21,7 +21,8 @@ public:
     int Get() const { return m_file.Get(); }
     int Error() const { return m_error; }
 
-    /// Gives the file its name, in place of a file that had it before.
+    /// Gives the file its name, in place of a file that had it before. Its bytes may still be on
+    /// their way to the disk: whoever delivers the file waits for them.
     /// @return 0, or the errno of what failed: then the file before is as it was
     int Appear();
 
