@@ -40,7 +40,7 @@ ResultCode PrintByDriver(const wxString& document, const wxString& folder,
 bool PrintPresentation(const wxString& document, const wxString& output,
                        const PowerPointOptions& options) {
     const AutomationScope scope;
-    return RunAutomation([&] {
+    return RunAutomation(false, [&] {
         powerpoint::Application application;
         application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint));
         powerpoint::Presentation presentation =
