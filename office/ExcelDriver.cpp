@@ -1,8 +1,8 @@
 #include "office/ExcelDriver.h"
 
+#include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/InstalledApplications.h"
-#include "office/OfficeApplication.h"
 #include "office/OutputWait.h"
 #include "office/PrintJob.h"
 #include "office/RunAutomation.h"

@@ -16,9 +16,6 @@ int GetPublisherInstallLevel();
 /// Whether there is any Publisher, be it one that cannot be driven.
 bool IsPublisherInstalled();
 
-/// Whether any of the four applications is installed.
-bool IsOfficeInstalled();
-
 /// @param extension without the dot, in any case
 /// @return false also for an extension that no application serves
 bool IsApplicationInstalledForExtension(const wxString& extension);

@@ -1,7 +1,7 @@
 #include "office/OpenXmlCheck.h"
 
+#include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
-#include "office/OfficeApplication.h"
 #include "office/RunAutomation.h"
 #include "office/StandardArguments.h"
 #include "office/dispatch/ExcelObjects.h"

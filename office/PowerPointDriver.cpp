@@ -1,9 +1,9 @@
 #include "office/PowerPointDriver.h"
 
+#include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/HighQualityDefault.h"
 #include "office/InstalledApplications.h"
-#include "office/OfficeApplication.h"
 #include "office/OutputWait.h"
 #include "office/PowerPointPrintOptions.h"
 #include "office/PrintJob.h"

@@ -1,5 +1,5 @@
+#include "machine/OfficeApplication.h"
 #include "office/ExcelDriver.h"
-#include "office/OfficeApplication.h"
 #include "office/PowerPointDriver.h"
 #include "office/PublisherDriver.h"
 #include "office/WordDriver.h"

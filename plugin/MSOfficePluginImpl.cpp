@@ -1,7 +1,7 @@
 #include "plugin/MSOfficePluginImpl.h"
 
 #include "common/ServerInformation.h"
-#include "office/InstalledApplications.h"
+#include "machine/InstalledOffice.h"
 #include "plugin/PluginIdentity.h"
 #include "pstools/PrinterDiscovery.h"
 #include "ui/MSOfficePanel.h"

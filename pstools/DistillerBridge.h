@@ -19,5 +19,4 @@ static_assert(sizeof(DistillerRequest) == 40, "the bridge reads this record by i
 /// @return 0 when the PDF file was made
 using DistConvertFile = std::int32_t(const DistillerRequest* request);
 
-constexpr char DistillerBridgeFile[] = "orv_dist.dll";
 constexpr char DistillerBridgeExport[] = "DIST_convertFile";

@@ -2,6 +2,7 @@
 
 #include "common/LoadedModule.h"
 #include "common/WQServices.h"
+#include "machine/FiltersFolder.h"
 #include "pstools/DistillerBridge.h"
 #include "pstools/DistillerDiscovery.h"
 

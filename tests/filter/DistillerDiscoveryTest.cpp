@@ -55,7 +55,10 @@ TEST_F(DistillerDiscoveryTest, AsksTheNewestDistillerOnly) {
     }
 }
 
-TEST_F(DistillerDiscoveryTest, TakesNoPathLongerThanWindowsAllows) {
+TEST_F(DistillerDiscoveryTest, TakesAPathAsItStandsAndNoneLongerThanWindowsAllows) {
+    WriteRegistryText(HKEY_LOCAL_MACHINE, std::wstring(Adobe) + L"\\Acrobat Distiller\\9.0",
+                      L"JobOptionsFolder", L"%PATH%", REG_EXPAND_SZ);
+    EXPECT_EQ("%PATH%", JobOptionsFolder());
     EnterDistiller(L"9.0", L"JobOptionsFolder", std::wstring(259, L'p'));
     EXPECT_EQ(wxString(259, 'p'), JobOptionsFolder());
     EnterDistiller(L"9.0", L"JobOptionsFolder", std::wstring(260, L'p'));

@@ -1,6 +1,9 @@
 #include "office/InstalledApplications.h"
 
+#include "machine/InstalledOffice.h"
 #include "tests/support/RegistryText.h"
+
+#include <wx/log.h>
 
 #include <gtest/gtest.h>
 
@@ -85,14 +88,23 @@ TEST_F(InstalledApplicationsTest, ReadsTheVersionAtTheEndOfCurVer) {
         {L"16", true},
         {L"", false},
     };
+    class FailingLog : public wxLog { // wxWidgets would show a window
+        void DoLogRecord(wxLogLevel, const wxString& record, const wxLogRecordInfo&) override {
+            ADD_FAILURE() << record;
+        }
+    } log;
+    wxLog* const target = wxLog::SetActiveTarget(&log);
     for (const auto& [application, is12OrLater] : VersionQueries) {
         Register(application);
         EXPECT_FALSE(is12OrLater()); // no CurVer
+        RegisterNameless(application + L"\\CurVer");
+        EXPECT_FALSE(is12OrLater());
         for (const auto& [currentVersion, expected] : cases) {
             WriteRegistryText(HKEY_CLASSES_ROOT, application + L"\\CurVer", L"", currentVersion);
             EXPECT_EQ(expected, is12OrLater()) << currentVersion;
         }
     }
+    wxLog::SetActiveTarget(target);
 }
 
 } // namespace

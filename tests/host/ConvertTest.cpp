@@ -124,6 +124,9 @@ TEST_F(ConvertTest, SettingsComeFromFileCommandLineAndDefaults) {
         {"<a><b><UI><PRINTER/><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS></UI></b></a>",
          {},
          printer + ps + rest},
+        {"<UI><OUTPUTFILETYPEPDF>0</OUTPUTFILETYPEPDF></UI>",
+         {},
+         "OUTPUTFILETYPEPDF=0\n" + printer + "OUTPUTFILETYPEPS=1\n" + rest},
         {"<UI><OUTPUTFILETYPEPS>1</OUTPUTFILETYPEPS><SELECTEDDISTILLERPROFILE>Gone"
          "</SELECTEDDISTILLERPROFILE></UI>", // no PDF file, and so no need of it
          {},

@@ -1,5 +1,7 @@
 #include "tests/host/ConvertRun.h"
 
+#include <wx/utils.h>
+
 #include <tuple>
 
 namespace fs = std::filesystem;
@@ -11,26 +13,31 @@ namespace {
 class EndToEndTest : public ConvertRun {
 protected:
     void TearDown() override {
-        UnregisterStandIn(TEST_OFFICE "/PrintingWord");
-        UnregisterStandIn(TEST_OFFICE "/PrintingDistiller");
+        for (const char* module : {"PrintingWord", "PrintingDistiller", "ScriptedMachine"})
+            UnregisterStandIn(TEST_OFFICE "/" + std::string(module));
+        wxUnsetEnv("SCRIPTED_MACHINE");
     }
 
-    RunResult ConvertByFilter(const std::string& document, const Arguments& options) const {
-        Arguments command = {
-            QUILLON_PROGRAM, "convert", "--json", "--stand-ins",
-            TEST_OFFICE,     "--out",   Out(),    (m_folder / document).u8string()};
-        command.insert(command.end(), options.begin(), options.end());
+    static RunResult Run(const Arguments& arguments) {
+        Arguments command = {QUILLON_PROGRAM, "--json", "--stand-ins", TEST_OFFICE};
+        command.insert(command.end(), arguments.begin(), arguments.end());
         return RunProgram(command);
+    }
+
+    RunResult ConvertByFilter(const fs::path& document, const Arguments& options) const {
+        Arguments arguments = {"convert", "--out", Out(), document.u8string()};
+        arguments.insert(arguments.end(), options.begin(), options.end());
+        return Run(arguments);
     }
 };
 
 TEST_F(EndToEndTest, ADocumentComesOutAsPostScriptAndAsPdf) {
     const std::string printed = "%!PS-Adobe-3.0";
-    fs::copy_file(TEST_DOCUMENT, m_folder / "letter.docx");
+    fs::copy_file(TEST_SAMPLES "/letter.docx", m_folder / "letter.docx");
     for (const auto& [options, output, head] :
          {std::tuple(Arguments{"--ps"}, "letter.ps", printed),
           {{"--pdf", "--profile", "press"}, "letter.pdf", "%PDF-1.4\n%" + printed}}) {
-        const RunResult run = ConvertByFilter("letter.docx", options);
+        const RunResult run = ConvertByFilter(m_folder / "letter.docx", options);
         EXPECT_EQ(run.exitCode, 0) << run.out << run.err;
         const nlohmann::json document = run.Records("document").at(0);
         EXPECT_EQ(document["state"], "converted") << document;
@@ -40,9 +47,67 @@ TEST_F(EndToEndTest, ADocumentComesOutAsPostScriptAndAsPdf) {
 }
 
 TEST_F(EndToEndTest, ADocumentThatIsNoneIsRefused) {
-    m_folder.Write("broken.doc", "no compound file");
-    EXPECT_EQ(ConvertByFilter("broken.doc", {}).Records("document").at(0)["code"], -1005);
+    const fs::path broken = m_folder.Write("broken.doc", "no compound file");
+    EXPECT_EQ(ConvertByFilter(broken, {}).Records("document").at(0)["code"], -1005);
     EXPECT_EQ(Outputs(), Names{});
+}
+
+TEST_F(EndToEndTest, TheBridgeFindsTheProfilesThatTheFilterLists) {
+    const fs::path bin = fs::u8path(QUILLON_PROGRAM).parent_path();
+    if (!fs::exists(bin / "Filters/orv_dist.dll"))
+        GTEST_SKIP() << "there is no stand-in for Distiller on this system";
+    m_folder.Write("Old.joboptions", "<< /CompatibilityLevel 1.3 >> setdistillerparams");
+    wxSetEnv("SCRIPTED_MACHINE",
+             "text HKLM\\SOFTWARE\\Orvanta\\Marlo Quillon|InstallPath|" + bin.string() +
+                 "\ntext HKLM\\SOFTWARE\\Orvanta\\Distiller Stand-In|Engine|Ghostscript" +
+                 "\ntext HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\9.0|JobOptionsFolder|" +
+                 m_folder.Path().string());
+    const RunResult run = ConvertByFilter(TEST_SAMPLES "/letter.docx", {"--profile", "old"});
+    EXPECT_EQ(run.exitCode, 0) << run.err;
+    EXPECT_EQ(Output("letter.pdf").substr(0, 8), "%PDF-1.3");
+}
+
+TEST_F(EndToEndTest, NothingContradictsWhatStatusSays) {
+    fs::create_directories(m_folder / "Distiller/Settings");
+    m_folder.Write("Distiller/Settings/Old.joboptions", "");
+    const std::string noWord = "delete HKCR\\Word.Application\n";
+    const std::string adobe = " HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\";
+    const struct {
+        std::string machine; ///< what becomes of the one with Word and Distiller
+        bool isReady;        ///< the filter's word
+        int statusCode;
+        const char* told; ///< by status
+        const char* document;
+        int code;
+        int exitCode; ///< for the document
+    } cases[] = {
+        {"", true, 0, "Ready to convert doc docx.", "letter.doc", 0, 0},
+        {noWord + "key HKCR\\Word.Application", false, 2, "No Office application is installed",
+         "letter.doc", -1006, 2}, // what an uninstaller leaves
+        {"delete" + adobe + "9.0\ntext" + adobe + "5.0|InstallPath|" +
+             (m_folder / "Distiller").u8string(),
+         true, 0, "profile Old.joboptions", "letter.docx", 0, 0},
+        {noWord + "key HKLM\\SOFTWARE\\Microsoft\\Office\\8.0\\Publisher", true, 2,
+         "too old to be driven", "publication.pub", 1023, 2},
+        {"text HKCR\\Word.Application\\CurVer||Word.Application.11", true, 0,
+         "Ready to convert doc.", "letter.docx", -1006, 2},
+        {"", true, 0, "Ready to convert doc docx.", "book.xls", 1014, 2},
+    };
+    for (const auto& each : cases) {
+        wxSetEnv("SCRIPTED_MACHINE", wxString::FromUTF8(each.machine));
+        const RunResult status = Run({"status"});
+        EXPECT_EQ(status.exitCode, each.statusCode) << status.err;
+        EXPECT_EQ(status.Records("filter").at(0)["ready"], each.isReady) << status.err;
+        EXPECT_NE(status.err.find(each.told), std::string::npos) << status.err;
+        const fs::path document = fs::u8path(TEST_SAMPLES) / each.document;
+        const RunResult screen = Run({"screen", document.u8string()});
+        const RunResult convert = ConvertByFilter(document, {});
+        for (const RunResult& run : {screen, convert}) {
+            EXPECT_EQ(run.Records("document").at(0)["code"], each.code) << run.err;
+            EXPECT_EQ(run.exitCode, each.exitCode) << each.machine;
+        }
+        UnregisterStandIn(TEST_OFFICE "/ScriptedMachine");
+    }
 }
 
 } // namespace

@@ -1,5 +1,7 @@
 #include "tests/host/ScreenRun.h"
 
+#include <wx/utils.h>
+
 #include <gtest/gtest.h>
 
 namespace fs = std::filesystem;
@@ -15,6 +17,7 @@ TEST_F(ScreenTest, TellsWhatIsWrongWithAFile) {
     ExpectRefused(m_folder.Write("note.txt", "text"), -1005,
                   "no filter takes files ending in .txt");
     ExpectRefused(m_folder.Write("noending", "text"), -1005, "without an ending");
+    ExpectRefused(m_folder.Write("a.pubx", "text"), -1005, "no filter takes files ending in .pubx");
 }
 
 TEST_F(ScreenTest, TellsWhatAnInvalidFileIsInstead) {
@@ -35,6 +38,11 @@ TEST_F(ScreenTest, AMissingApplicationIsTheMachinesFault) {
     for (const char* code : {"-1006", "-1010", "1012", "1019", "1023"})
         EXPECT_EQ(Screen(m_folder.Write("a.doc", "screen="s + code), 2)["code"], std::stoi(code));
     EXPECT_EQ(Screen(m_folder.Write("a.doc", "screen=1020"), 1)["code"], 1020);
+    // What the filter's screening does not look at.
+    EXPECT_EQ(Screen(m_folder.Write("a.pub", "script"), 2)["code"], 1015);
+    wxSetEnv("SCRIPTED_FILTER_UNREADY", "1");
+    EXPECT_EQ(Screen(m_folder.Write("a.doc", "script"), 2)["code"], -1006);
+    wxUnsetEnv("SCRIPTED_FILTER_UNREADY");
 }
 
 TEST_F(ScreenTest, AnyNameComesBackExactAndIsShownOnOneLine) {

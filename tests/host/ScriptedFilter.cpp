@@ -10,7 +10,6 @@
 
 #include <wx/file.h>
 #include <wx/filename.h>
-#include <wx/msw/registry.h>
 #include <wx/tokenzr.h>
 #include <wx/utils.h>
 #include <wx/xml/xml.h>
@@ -123,7 +122,7 @@ public:
         return Number(script, "convert");
     }
 
-    bool IsReady() override { return wxRegKey(wxRegKey::HKCR, "Word.Application").Exists(); }
+    bool IsReady() override { return !wxGetEnv("SCRIPTED_FILTER_UNREADY", nullptr); }
 
 private:
     static std::unique_ptr<JobItem> ItemFor(const wxString& path) {
@@ -151,6 +150,7 @@ void GetPluginInfo(PluginInfo* info) {
     info->version = "7.0";
     info->extensions.Add("doc");
     info->extensions.Add("xls");
+    info->extensions.Add("pub");
 }
 
 WQPlugin* GetPluginInstance(void*) {

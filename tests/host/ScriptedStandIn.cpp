@@ -1,5 +1,5 @@
-// A stand-in for tests of the host: enters a Word and its engine, and tells the engine's clocks by
-// way of the engine's name; and a Distiller.
+// A stand-in for tests of the host: enters a Word, an Excel and their engine, and tells the
+// engine's clocks by way of the engine's name; and a Distiller with its bridge.
 
 #include <objbase.h>
 #include <windows.h>
@@ -11,16 +11,25 @@
 namespace {
 
 const wxString OwnKey = "SOFTWARE\\Orvanta\\Office Stand-Ins";
+const wxString InstallationKey = "SOFTWARE\\Orvanta\\Marlo Quillon";
 const wxString DistillerStandInKey = "SOFTWARE\\Orvanta\\Distiller Stand-In";
 const wxString DistillerKey = "SOFTWARE\\Adobe\\Acrobat Distiller\\9.0";
+const wxString ProgIds[] = {"Word.Application", "Excel.Application"};
+
+void EnterText(wxRegKey::StdKey root, const wxString& keyName, const char* valueName,
+               const wxString& text) {
+    wxRegKey key(root, keyName);
+    key.Create();
+    key.SetValue(valueName, text);
+}
 
 } // namespace
 
 STDAPI DllRegisterServer() {
-    wxRegKey(wxRegKey::HKCR, "Word.Application").Create();
-    wxRegKey current(wxRegKey::HKCR, "Word.Application\\CurVer");
-    current.Create();
-    current.SetValue(wxEmptyString, wxString("Word.Application.16"));
+    for (const wxString& progId : ProgIds) {
+        EnterText(wxRegKey::HKCR, progId, "", "Scripted");
+        EnterText(wxRegKey::HKCR, progId + "\\CurVer", "", progId + ".16");
+    }
 
     long stall = 0;
     long total = 0;
@@ -29,23 +38,20 @@ STDAPI DllRegisterServer() {
         clocks.QueryValue("StallSeconds", &stall);
         clocks.QueryValue("TotalSeconds", &total);
     }
-    wxRegKey self(wxRegKey::HKLM, OwnKey);
-    self.Create();
-    self.SetValue("Engine", wxString::Format("Scripted engine, %ld of %ld s", stall, total));
-
-    wxRegKey distiller(wxRegKey::HKLM, DistillerStandInKey);
-    distiller.Create();
-    distiller.SetValue("Engine", wxString("Scripted Distiller"));
-    wxRegKey version(wxRegKey::HKLM, DistillerKey);
-    version.Create();
-    version.SetValue("JobOptionsFolder", wxString(TEST_PROFILES));
+    EnterText(wxRegKey::HKLM, OwnKey, "Engine",
+              wxString::Format("Scripted engine, %ld of %ld s", stall, total));
+    EnterText(wxRegKey::HKLM, InstallationKey, "InstallPath", TEST_INSTALLATION);
+    EnterText(wxRegKey::HKLM, DistillerStandInKey, "Engine", "Scripted Distiller");
+    EnterText(wxRegKey::HKLM, DistillerKey, "JobOptionsFolder", TEST_PROFILES);
     return S_OK;
 }
 
 STDAPI DllUnregisterServer() {
-    wxRegKey(wxRegKey::HKCR, "Word.Application").DeleteSelf();
-    for (const wxString& key : {OwnKey, DistillerStandInKey, DistillerKey})
+    for (const wxString& progId : ProgIds)
+        wxRegKey(wxRegKey::HKCR, progId).DeleteSelf();
+    for (const wxString& key : {OwnKey, InstallationKey, DistillerStandInKey, DistillerKey})
         wxRegKey(wxRegKey::HKLM, key).DeleteSelf();
-    wxRegKey(wxRegKey::HKCU, OwnKey).DeleteSelf();
+    for (const wxString& key : {OwnKey, DistillerStandInKey})
+        wxRegKey(wxRegKey::HKCU, key).DeleteSelf();
     return S_OK;
 }

@@ -2,6 +2,8 @@
 #include "tests/host/System.h"
 #include "tests/support/TemporaryFolder.h"
 
+#include <wx/utils.h>
+
 #include <gtest/gtest.h>
 
 namespace {
@@ -19,15 +21,17 @@ TEST(Status, TellsWhatThereIs) {
     const json filter = run.Records("filter")[0];
     EXPECT_EQ(filter["identifier"], "Scripted");
     EXPECT_EQ(filter["version"], "7.0");
-    EXPECT_EQ(filter["extensions"], (json{"doc", "xls"}));
+    EXPECT_EQ(filter["extensions"], (json{"doc", "docx", "xls", "xlsx", "pub"}));
     EXPECT_EQ(filter["ready"], true);
+    EXPECT_EQ(filter["text"], "");
 
     const std::vector<json> applications = run.Records("application");
     ASSERT_EQ(applications.size(), 4U);
     EXPECT_EQ(applications[0]["name"], "Word");
     EXPECT_EQ(applications[0]["version"], "16");
-    EXPECT_EQ(applications[1]["installed"], false);
-    EXPECT_TRUE(Contains(applications[1]["advice"], System::ExcelAdvice));
+    EXPECT_EQ(applications[0]["usable"], true);
+    EXPECT_EQ(applications[2]["installed"], false);
+    EXPECT_TRUE(Contains(applications[2]["advice"], System::PowerPointAdvice));
 
     std::vector<json> preferred;
     for (const json& printer : run.Records("printer"))
@@ -39,7 +43,8 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(run.Records("distiller").at(0)["profiles"], json{"Press.joboptions"});
     EXPECT_EQ(run.Records("panel").at(0)["enabled"], true);
     EXPECT_TRUE(run.Records("missing").empty()) << run.out;
-    EXPECT_TRUE(Contains(run.err, "Ready to convert.")) << run.err;
+    EXPECT_TRUE(Contains(run.err, "Ready to convert doc docx xls xlsx.")) << run.err;
+    EXPECT_EQ(run.Records("summary").at(0)["convertible"], (json{"doc", "docx", "xls", "xlsx"}));
 }
 
 TEST(Status, HandsTheClocksToTheEngines) {
@@ -56,14 +61,23 @@ TEST(Status, TellsWhatIsMissingAndWhatToDo) {
     EXPECT_EQ(noOffice.exitCode, 2);
     EXPECT_TRUE(Contains(noOffice.out, "No Office application is installed")) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, System::OfficeAdvice)) << noOffice.out;
-    EXPECT_TRUE(Contains(noOffice.out, "not ready")) << noOffice.out;
     EXPECT_TRUE(Contains(noOffice.out, "disabled: no Office application is installed"));
-    EXPECT_TRUE(Contains(noOffice.out, "nothing to make PDF files with")) << noOffice.out;
+    EXPECT_TRUE(Contains(noOffice.out, "ask for PostScript with --ps")) << noOffice.out;
 
     const RunResult noFilter =
         RunProgram({QUILLON_PROGRAM, "status", "--filters", folder, "--stand-ins", TEST_STAND_INS});
     EXPECT_EQ(noFilter.exitCode, 2);
     EXPECT_TRUE(Contains(noFilter.out, "There is no filter")) << noFilter.out;
+}
+
+TEST(Status, TakesTheFiltersWordForIt) {
+    wxSetEnv("SCRIPTED_FILTER_UNREADY", "1");
+    const RunResult run = RunQuillon({"status"});
+    wxUnsetEnv("SCRIPTED_FILTER_UNREADY");
+    EXPECT_EQ(run.exitCode, 2);
+    EXPECT_TRUE(Contains(run.out, "not ready, text of -1006")) << run.out;
+    EXPECT_TRUE(Contains(run.out, "Missing: The filter Scripted is not ready")) << run.out;
+    EXPECT_FALSE(Contains(run.out, "Ready to convert")) << run.out;
 }
 
 TEST(Status, PassesOverWhatIsNoFilter) {

@@ -8,14 +8,14 @@ namespace System {
 /// registry.
 constexpr bool ConvertsSideBySide = false;
 constexpr char ModuleSuffix[] = ".dll";
-/// What is said to install where Office, Word or Excel is missing.
+/// What is said to install where Office or PowerPoint is missing.
 constexpr char OfficeAdvice[] = "Install Microsoft Office";
-constexpr char ExcelAdvice[] = "Install Microsoft Excel";
+constexpr char PowerPointAdvice[] = "Install Microsoft PowerPoint";
 #else
 constexpr bool ConvertsSideBySide = true;
 constexpr char ModuleSuffix[] = ".so";
 constexpr char OfficeAdvice[] = "apt-get install libreoffice-writer-nogui";
-constexpr char ExcelAdvice[] = "libreoffice-calc-nogui";
+constexpr char PowerPointAdvice[] = "libreoffice-impress-nogui";
 #endif
 
 /// Has this process do nothing any more, as one that hangs for good.

@@ -1,9 +1,9 @@
 #include "tests/standins/OfficeTest.h"
 
+#include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/ExcelDriver.h"
 #include "office/InstalledApplications.h"
-#include "office/OfficeApplication.h"
 #include "office/OpenXmlCheck.h"
 #include "office/PowerPointDriver.h"
 #include "office/PowerPointPrintOptions.h"

@@ -34,9 +34,10 @@ Settings
   A settings file is XML with an element UI that has one element for each setting; `quillon
   settings` shows and writes it. A --set goes before the file, and --printer, --ps, --pdf and
   --profile go before both. What is not set has the value in brackets, in the window as in a
-  conversion: a new file prints what none does. Without PRINTER, the Distiller printer is used or
-  else the program's own file printer; without a profile, Distiller makes PDF files in its own way.
-  The window's texts for PRINTOUTPUTTYPE and COLOR are understood in every language.
+  conversion: a new file prints what none does. Without PRINTER, the program's own file printer
+  is used; a Distiller printer, where there is one, is used whatever is chosen. Without a profile,
+  Distiller makes PDF files in its own way. The window's texts for PRINTOUTPUTTYPE and COLOR are
+  understood in every language.
 )";
 
 constexpr const char* ExitCodes = R"(

@@ -14,7 +14,7 @@ ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filters
     std::vector<Outcome> outcomes;
     for (const Input& input : inputs) {
         outcomes.push_back(Interruption::Requested() ? NotReached(filters, input)
-                                                     : Screen(filters, input).outcome);
+                                                     : ScreenOnly(filters, input));
         Tell(outcomes.back(), reporter);
     }
     return TellSummary(outcomes, reporter);

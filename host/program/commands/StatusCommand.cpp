@@ -1,8 +1,13 @@
 #include "host/program/PathText.h"
 #include "host/program/commands/Commands.h"
 #include "host/program/filters/FilterSet.h"
-#include "host/program/machine/MachineStatus.h"
+#include "host/program/machine/Engines.h"
+#include "host/program/machine/FilePrinter.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/services/OneLine.h"
+#include "machine/Distiller.h"
+#include "machine/InstalledOffice.h"
+#include "plugin/ResultCodes.h"
 
 namespace {
 
@@ -14,20 +19,36 @@ wxString Entry(const wxString& name, const wxString& rest) {
     return line + "  " + OneLine(rest);
 }
 
+wxString OrNone(const wxString& text) {
+    return "  " + (text.empty() ? wxString("none") : OneLine(text));
+}
+
+template <typename Texts>
+Json ListOf(const Texts& texts) {
+    Json list = Json::array();
+    for (const wxString& text : texts)
+        list.push_back(JsonText(text));
+    return list;
+}
+
+/// Why the filter is not ready, in its own words.
+wxString Unreadiness(const Filter& filter) {
+    return filter.IsReady() ? wxString() : filter.ErrorText(Result::NotInitialized);
+}
+
 void TellFilter(const Filter& filter, Reporter& reporter) {
     const PluginInfo& info = filter.Info();
-    const wxString readiness = filter.IsReady() ? "ready" : "not ready";
+    const wxString fault = Unreadiness(filter);
     reporter.Line(Entry(info.identifier, info.version + ", " + info.vendor + ", for " +
-                                             wxJoin(info.extensions, ' ', 0) + ": " + readiness));
-    Json record = {{"type", "filter"},
-                   {"identifier", JsonText(info.identifier)},
-                   {"version", JsonText(info.version)},
-                   {"vendor", JsonText(info.vendor)},
-                   {"extensions", Json::array()},
-                   {"ready", filter.IsReady()}};
-    for (const wxString& extension : info.extensions)
-        record["extensions"].push_back(JsonText(extension));
-    reporter.Record(record);
+                                             wxJoin(filter.Extensions(), ' ', 0) + ": " +
+                                             (filter.IsReady() ? "ready" : "not ready, " + fault)));
+    reporter.Record({{"type", "filter"},
+                     {"identifier", JsonText(info.identifier)},
+                     {"version", JsonText(info.version)},
+                     {"vendor", JsonText(info.vendor)},
+                     {"extensions", ListOf(filter.Extensions())},
+                     {"ready", filter.IsReady()},
+                     {"text", JsonText(fault)}});
 }
 
 void TellFilters(const FilterSet& filters, const std::filesystem::path& folder,
@@ -40,91 +61,148 @@ void TellFilters(const FilterSet& filters, const std::filesystem::path& folder,
     reporter.Record({{"type", "folder"}, {"filters", folder.u8string()}});
 }
 
-void TellApplications(const MachineStatus& status, Reporter& reporter) {
-    reporter.Line("Office applications");
-    for (const OfficeApplication& application : status.applications) {
-        const wxString version =
-            application.version.empty() ? wxString("installed") : "version " + application.version;
-        const wxString absence = application.advice.empty()
-                                     ? wxString("not installed")
-                                     : "not installed. " + application.advice;
-        reporter.Line(Entry(application.name, application.installed ? version : absence));
-        reporter.Record({{"type", "application"},
-                         {"name", JsonText(application.name)},
-                         {"installed", application.installed},
-                         {"version", JsonText(application.version)},
-                         {"advice", JsonText(application.advice)}});
+/// How the application is there, on a line behind its name.
+wxString Describe(OfficeApplication application, const wxString& version) {
+    switch (InstallationOf(application)) {
+    case OfficeInstallation::None:
+        return "not installed";
+    case OfficeInstallation::TooOld:
+        return "of Office 97 or 2000, too old to be driven";
+    case OfficeInstallation::Drivable:
+        break;
     }
-    reporter.Line("Engine");
-    reporter.Line("  " + (status.engine.empty() ? wxString("none") : OneLine(status.engine)));
-    reporter.Record({{"type", "engine"}, {"version", JsonText(status.engine)}});
+    const bool isLimited =
+        application != OfficeApplication::Publisher && !ReadsOpenXml(application);
+    return (version.empty() ? wxString("installed") : "version " + version) +
+           (isLimited ? ", not for Office Open XML, which needs version 12 or later" : "");
 }
 
-void TellPrinters(const MachineStatus& status, Reporter& reporter) {
+void TellApplication(OfficeApplication application, Reporter& reporter) {
+    const unsigned long number = RegisteredVersionOf(application);
+    const wxString version = number ? wxString::Format("%lu", number) : wxString();
+    const std::optional<MissingPart> missing = FindMissingApplication(application);
+    const wxString advice = missing ? missing->advice : wxString();
+    reporter.Line(Entry(NameOf(application), Describe(application, version) +
+                                                 (advice.empty() ? advice : ". " + advice)));
+    reporter.Record({{"type", "application"},
+                     {"name", NameOf(application)},
+                     {"installed", IsInstalled(application)},
+                     {"usable", !missing},
+                     {"version", JsonText(version)},
+                     {"advice", JsonText(advice)}});
+}
+
+void TellApplications(Reporter& reporter) {
+    reporter.Line("Office applications");
+    for (const OfficeApplication application : AllOfficeApplications)
+        TellApplication(application, reporter);
+    const wxString engine = OfficeEngine();
+    reporter.Line("Engine");
+    reporter.Line(OrNone(engine));
+    reporter.Record({{"type", "engine"}, {"version", JsonText(engine)}});
+}
+
+void TellPrinters(Reporter& reporter) {
     reporter.Line("Printers");
-    const Printer* const preferred = PreferredPrinter(status.printers);
-    if (status.printers.empty())
+    const std::vector<Printer> printers = ListPrinters();
+    const Printer* const preferred = PreferredPrinter(printers);
+    if (printers.empty())
         reporter.Line("  none");
-    for (const Printer& printer : status.printers) {
-        wxString kind = printer.isPostScript ? "PostScript" : "not PostScript";
-        if (printer.isDistiller)
+    for (const Printer& printer : printers) {
+        const bool isPostScript = printer.IsPostScript();
+        wxString kind = isPostScript ? "PostScript" : "not PostScript";
+        if (printer.IsDistiller())
             kind += ", Acrobat Distiller";
         if (&printer == preferred)
-            kind += ", used unless another is chosen";
+            kind += printer.IsDistiller() ? ", used whichever is chosen"
+                                          : ", used unless another is chosen";
         reporter.Line(Entry(printer.name, kind));
         reporter.Record({{"type", "printer"},
                          {"name", JsonText(printer.name)},
                          {"driver", JsonText(printer.driver)},
-                         {"postScript", printer.isPostScript},
-                         {"distiller", printer.isDistiller},
+                         {"postScript", isPostScript},
+                         {"distiller", printer.IsDistiller()},
                          {"preferred", &printer == preferred}});
     }
 }
 
-void TellDistiller(const MachineStatus& status, Reporter& reporter) {
+void TellDistiller(Reporter& reporter) {
+    const wxString engine = PdfEngine();
+    const std::vector<wxString> profiles = ListDistillerProfiles();
     reporter.Line("Distiller");
-    reporter.Line("  " + (status.pdfEngine.empty() ? wxString("none") : OneLine(status.pdfEngine)));
-    Json record = {
-        {"type", "distiller"}, {"engine", JsonText(status.pdfEngine)}, {"profiles", Json::array()}};
-    for (const wxString& profile : status.profiles) {
+    reporter.Line(OrNone(engine));
+    for (const wxString& profile : profiles)
         reporter.Line("  profile " + OneLine(profile));
-        record["profiles"].push_back(JsonText(profile));
-    }
-    reporter.Record(record);
+    reporter.Record(
+        {{"type", "distiller"}, {"engine", JsonText(engine)}, {"profiles", ListOf(profiles)}});
 }
 
-void TellPanel(const MachineStatus& status, Reporter& reporter) {
+void TellPanel(const FilterSet& filters, Reporter& reporter) {
+    const wxString obstacle = filters.Filters().empty() ? "there is no filter" : PanelObstacle();
     reporter.Line("Settings panel");
-    const wxString& obstacle = status.panelObstacle;
     reporter.Line("  " + (obstacle.empty() ? wxString("can be used") : "disabled: " + obstacle));
     reporter.Record(
         {{"type", "panel"}, {"enabled", obstacle.empty()}, {"reason", JsonText(obstacle)}});
 }
 
-ExitCode TellMissing(std::vector<MissingPart> missing, bool hasFilter, Reporter& reporter) {
-    if (!hasFilter)
-        missing.push_back({"There is no filter", "Install the program anew"});
+/// The extensions of the files that a filter is ready for and the machine can print.
+wxArrayString ListConvertible(const FilterSet& filters) {
+    wxArrayString extensions;
+    for (const auto& filter : filters.Filters())
+        for (const wxString& extension : filter->Extensions())
+            if (filter->IsReady() && !FindMissingFor(extension))
+                extensions.Add(extension);
+    return extensions;
+}
+
+/// Why there is nothing that could be converted.
+std::vector<MissingPart> FindObstacles(const FilterSet& filters) {
+    std::vector<MissingPart> obstacles;
+    if (filters.Filters().empty())
+        obstacles.push_back({"There is no filter", "Install the program anew"});
+    for (const auto& part : {FindMissingOffice(), FindMissingPrinter()})
+        if (part)
+            obstacles.push_back(*part);
+    if (!obstacles.empty())
+        return obstacles;
+    for (const auto& filter : filters.Filters()) {
+        const wxString fault = filter->IsReady() ? wxString("has no use for what is installed")
+                                                 : "is not ready: " + Unreadiness(*filter);
+        obstacles.push_back({"The filter " + filter->Info().identifier + ' ' + fault, {}});
+    }
+    return obstacles;
+}
+
+ExitCode TellReadiness(const FilterSet& filters, Reporter& reporter) {
+    const wxArrayString convertible = ListConvertible(filters);
+    std::vector<MissingPart> missing;
+    if (convertible.empty())
+        missing = FindObstacles(filters);
+    if (const auto pdfMaker = FindMissingPdfMaker())
+        missing.push_back(*pdfMaker);
     for (const MissingPart& part : missing) {
-        reporter.Line("Missing: " + part.what + ". " + part.advice);
+        reporter.Line("Missing: " + part.Text());
         reporter.Record({{"type", "missing"},
                          {"text", JsonText(part.what)},
                          {"advice", JsonText(part.advice)}});
     }
-    if (!missing.empty())
-        return ExitCode::MachineAtFault;
-    reporter.Line("Ready to convert.");
-    return ExitCode::Done;
+    const ExitCode exitCode = missing.empty() ? ExitCode::Done : ExitCode::MachineAtFault;
+    if (missing.empty())
+        reporter.Line("Ready to convert " + wxJoin(convertible, ' ', 0) + '.');
+    reporter.Record({{"type", "summary"},
+                     {"convertible", ListOf(convertible)},
+                     {"exitCode", static_cast<int>(exitCode)}});
+    return exitCode;
 }
 
 } // namespace
 
 ExitCode RunStatus(const std::filesystem::path& filtersFolder, Reporter& reporter) {
     const FilterSet filters(filtersFolder);
-    const MachineStatus status = LookAtMachine();
     TellFilters(filters, filtersFolder, reporter);
-    TellApplications(status, reporter);
-    TellPrinters(status, reporter);
-    TellDistiller(status, reporter);
-    TellPanel(status, reporter);
-    return TellMissing(status.missing, !filters.Filters().empty(), reporter);
+    TellApplications(reporter);
+    TellPrinters(reporter);
+    TellDistiller(reporter);
+    TellPanel(filters, reporter);
+    return TellReadiness(filters, reporter);
 }

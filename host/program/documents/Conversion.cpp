@@ -3,9 +3,8 @@
 #include "host/program/PathText.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
-#include "host/program/machine/Distiller.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/system/ConversionTurn.h"
-#include "host/program/system/InstallAdvice.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>
@@ -25,15 +24,16 @@ void Fail(int code, const wxString& reason, const Filter& filter, Outcome& outco
 }
 
 /// What the host can see of why the filter failed.
-void Explain(const OutputFolder& outputFolder, Outcome& outcome) {
+void Explain(const JobItem& item, const OutputFolder& outputFolder, Outcome& outcome) {
+    const std::optional<MissingPart> pdfMaker =
+        outcome.code == Result::PdfConversionFailed ? FindMissingPdfMaker() : std::nullopt;
     if (outcome.machineAtFault) {
-        outcome.reason = MachineReason();
+        outcome.reason = MachineReason(wxFileName(item.fileName).GetExt());
     } else if (outputFolder.IsFull()) {
         outcome.reason = "there is no space left for the output or for temporary files";
         outcome.machineAtFault = true;
-    } else if (outcome.code == Result::PdfConversionFailed && DistillerEngine().empty()) {
-        outcome.reason = "there is nothing to make PDF files with. " + PdfInstallAdvice() +
-                         "; or ask for PostScript with --ps";
+    } else if (pdfMaker) {
+        outcome.reason = pdfMaker->Text();
         outcome.machineAtFault = true;
     } else if (outcome.code == Result::PrintFailed) {
         outcome.reason = "its application could not open or print it: it may be damaged or "
@@ -91,7 +91,7 @@ Outcome Convert(const ScreenedInput& screened, const wxString& baseName,
     else
         Fail(ConversionFailed, fault, *screened.filter, outcome);
     if (outcome.state == State::Failed && outcome.reason.empty())
-        Explain(outputFolder, outcome);
+        Explain(*screened.item, outputFolder, outcome);
     return outcome;
 }
 

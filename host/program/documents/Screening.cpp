@@ -2,7 +2,7 @@
 
 #include "host/program/PathText.h"
 #include "host/program/documents/InputCheck.h"
-#include "host/program/machine/MachineStatus.h"
+#include "host/program/machine/MissingParts.h"
 #include "plugin/ResultCodes.h"
 
 namespace {
@@ -22,7 +22,7 @@ void Refuse(const FilterSet& filters, const Refusal& refusal, Outcome& outcome) 
 
 wxString ReasonFor(int code, const Input& input) {
     if (IsMachineCode(code))
-        return MachineReason();
+        return MachineReason(ExtensionOf(input));
     return code == Result::InvalidInputFile ? DescribeInvalid(input.full) : wxString();
 }
 
@@ -41,6 +41,8 @@ ScreenedInput Screen(const FilterSet& filters, const Input& input) {
         Refuse(filters, {Result::InvalidInputFile, UnclaimedReason(extension)}, screened.outcome);
         if (!input.named)
             screened.outcome.state = State::Skipped;
+    } else if (!filter->IsReady()) { // which some of its screening does not look at
+        Refuse(filters, {Result::NotInitialized, MachineReason(extension)}, screened.outcome);
     } else {
         Filter::Screened answer = filter->Screen(*ToText(input.full));
         if (!answer.item) {
@@ -54,6 +56,15 @@ ScreenedInput Screen(const FilterSet& filters, const Input& input) {
     return screened;
 }
 
+Outcome ScreenOnly(const FilterSet& filters, const Input& input) {
+    ScreenedInput screened = Screen(filters, input);
+    const std::optional<MissingPart> missing =
+        screened.item ? FindMissingFor(ExtensionOf(input)) : std::nullopt;
+    if (missing)
+        Refuse(filters, {missing->code, missing->Text()}, screened.outcome);
+    return screened.outcome;
+}
+
 Outcome NotReached(const FilterSet& filters, const Input& input) {
     Outcome outcome;
     outcome.input = input.given;
@@ -64,9 +75,9 @@ Outcome NotReached(const FilterSet& filters, const Input& input) {
     return outcome;
 }
 
-wxString MachineReason() {
-    wxString reason;
-    for (const MissingPart& part : LookAtMachine().missing)
-        reason << (reason.empty() ? "" : "; ") << part.what << ". " << part.advice;
-    return reason.empty() ? "its application is missing or too old: see `quillon status`" : reason;
+wxString MachineReason(const wxString& extension) {
+    const std::optional<MissingPart> missing = FindMissingFor(extension);
+    return missing ? missing->Text()
+                   : wxString("see `quillon status`; if it finds nothing missing, repair the "
+                              "installation of its application");
 }

@@ -1,11 +1,10 @@
 #include "host/program/filters/Filter.h"
 
 #include "common/WQServices.h"
+#include "machine/OfficeApplication.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/xml/xml.h>
-
-#include <algorithm>
 
 namespace {
 
@@ -44,11 +43,18 @@ Filter::~Filter() {
     m_module->ReleaseInstance(m_plugin);
 }
 
+wxArrayString Filter::Extensions() const {
+    wxArrayString extensions;
+    for (const wxString& listed : m_info.extensions) {
+        extensions.Add(listed);
+        if (IsOpenXmlExtension(listed + 'x'))
+            extensions.Add(listed + 'x');
+    }
+    return extensions;
+}
+
 bool Filter::Claims(const wxString& extension) const {
-    return std::any_of(
-        m_info.extensions.begin(), m_info.extensions.end(), [&extension](const wxString& listed) {
-            return extension.IsSameAs(listed, false) || extension.IsSameAs(listed + 'x', false);
-        });
+    return Extensions().Index(extension, false) != wxNOT_FOUND;
 }
 
 wxWindow* Filter::CreatePanel(wxWindow* parent, const wxXmlNode& settings) {

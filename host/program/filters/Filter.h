@@ -17,8 +17,11 @@ public:
 
     const PluginInfo& Info() const { return m_info; }
 
-    /// Whether files with this extension are the filter's. The description lists the extensions
-    /// of the old formats; the Office Open XML one of each has an x behind it.
+    /// The extensions of the files that are the filter's, without dots: those that its description
+    /// lists and, behind each of an old format, that of the Office Open XML format in its place.
+    wxArrayString Extensions() const;
+
+    /// Whether files with this extension, in any case, are the filter's.
     bool Claims(const wxString& extension) const;
 
     bool IsReady() const { return m_plugin->IsReady(); }

@@ -11,6 +11,7 @@ constexpr Package Packages[] = {
     {"Word.Application", "libreoffice-writer-nogui"},
     {"Excel.Application", "libreoffice-calc-nogui"},
     {"PowerPoint.Application", "libreoffice-impress-nogui"},
+    {"Publisher.Application", "libreoffice-draw-nogui"},
 };
 
 } // namespace

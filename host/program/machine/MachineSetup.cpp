@@ -2,9 +2,12 @@
 
 #include "common/WQServices.h"
 #include "host/program/PathText.h"
-#include "host/program/machine/Printers.h"
+#include "host/program/machine/FilePrinter.h"
 #include "host/program/machine/ProgramFiles.h"
-#include "host/program/machine/Registry.h"
+#include "host/program/machine/StandInKeys.h"
+#include "machine/Distiller.h"
+#include "machine/FiltersFolder.h"
+#include "machine/RegistryText.h"
 
 #include <objbase.h>
 #include <windows.h>
@@ -34,11 +37,22 @@ void Register(const std::filesystem::path& file) {
         FreeLibrary(module); // COM loads it again when an application is asked for
 }
 
-/// Lets the Office stand-ins of a folder enter themselves as COM servers, where the system has no
-/// Office of its own. They enter the applications that their engine is there for.
+/// Tells the Distiller stand-in where the profiles lie, so that it finds what filters list.
+void HandOverProfiles() {
+    const std::optional<Distiller> distiller = FindDistiller();
+    Enter(wxRegKey::HKCU, DistillerStandInKey, UserProfilesValue, UserProfilesFolder());
+    Enter(wxRegKey::HKCU, DistillerStandInKey, JobOptionsFolderValue,
+          distiller ? distiller->jobOptionsFolder.value_or(wxString()) : wxString());
+}
+
+/// Lets the stand-ins of a folder enter themselves, where the system has no Office and no Distiller
+/// of its own. They enter what their engines are there for.
 void RegisterStandIns(const std::filesystem::path& folder) {
-    for (const std::filesystem::path& file : ModuleFiles(folder))
+    const std::vector<std::filesystem::path> modules = ModuleFiles(folder);
+    for (const std::filesystem::path& file : modules)
         Register(file);
+    if (!modules.empty())
+        HandOverProfiles();
 }
 
 /// Sets a clock of the engines: Office's and Distiller's.

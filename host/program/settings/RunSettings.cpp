@@ -2,8 +2,8 @@
 
 #include "common/WQServices.h"
 #include "host/program/PathText.h"
-#include "host/program/machine/Distiller.h"
-#include "host/program/machine/Printers.h"
+#include "host/program/machine/FilePrinter.h"
+#include "machine/Distiller.h"
 
 #include <algorithm>
 
@@ -97,7 +97,7 @@ const std::vector<SettingsKey>& KnownSettings() {
     static const std::vector<SettingsKey> s_settings = {
         {"PRINTER", "name", "", "the printer to print on, as `quillon status` lists it"},
         {"OUTPUTFILETYPEPS", "1 0", "0", "1: PostScript files only; 0: PDF files too"},
-        {"OUTPUTFILETYPEPDF", "1 0", "", "the opposite, for the settings panel"},
+        {"OUTPUTFILETYPEPDF", "1 0", "", "the opposite; counts where that is not set"},
         {"SELECTEDDISTILLERPROFILE", "file name", "",
          "the Distiller profile, as `quillon status` lists it"},
         {"PRINTOUTPUTTYPE", "text", "Slides", "Slides, Handouts, Notes Pages or Outline View"},
@@ -122,7 +122,8 @@ void FillIn(Settings& settings) {
     const std::vector<Printer> printers = ListPrinters();
     if (const Printer* const preferred = PreferredPrinter(printers))
         fill("PRINTER", preferred->name);
-    fill("OUTPUTFILETYPEPS", "0");
+    const wxString pdf = settings.Value("OUTPUTFILETYPEPDF");
+    fill("OUTPUTFILETYPEPS", pdf.empty() || pdf == "1" ? "0" : "1");
     fill("OUTPUTFILETYPEPDF", settings.Value("OUTPUTFILETYPEPS") == "1" ? "0" : "1");
     fill("HANDOUTSHORIZONTAL", settings.Value("HANDOUTSVERTICAL") == "1" ? "0" : "1");
     for (const SettingsKey& key : KnownSettings())

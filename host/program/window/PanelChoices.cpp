@@ -1,7 +1,7 @@
 #include "host/program/window/PanelChoices.h"
 
-#include "host/program/machine/Printers.h"
 #include "host/program/settings/Settings.h"
+#include "machine/Printers.h"
 #include "ui/ControlIds.h"
 
 #include <wx/choice.h>

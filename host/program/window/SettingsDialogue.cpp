@@ -2,7 +2,7 @@
 
 #include "common/Themer.h"
 #include "host/program/PathText.h"
-#include "host/program/machine/MachineStatus.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"
@@ -86,7 +86,7 @@ void SettingsDialogue::SizePanels() {
 
 /// Says why the panels are greyed out, if they are.
 void SettingsDialogue::ExplainObstacle() {
-    const wxString obstacle = LookAtMachine().panelObstacle;
+    const wxString obstacle = PanelObstacle();
     if (obstacle.empty())
         return;
     m_obstacle->Say(wxString::Format(_("These settings cannot be changed: %s."), obstacle),

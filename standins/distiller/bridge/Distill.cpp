@@ -5,6 +5,7 @@
 #include "standins/distiller/bridge/Profiles.h"
 #include "standins/module/DocumentFile.h"
 #include "standins/module/ModulePath.h"
+#include "standins/module/RegistryKey.h"
 #include "standins/module/SupervisedRun.h"
 #include "standins/module/Text.h"
 #include "standins/module/TimeSettings.h"
@@ -68,6 +69,9 @@ void CheckOutput(int error) {
 
 SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
                          const Descriptor& profile) {
+    const RegistryKey facts = RegistryKey::Open(HKEY_LOCAL_MACHINE, DistillerSettingsKey);
+    if (!facts.Text(DistillerEngineValue)) // then the machine counts as having none
+        Fail(DistillResult::NoEngine, "no Ghostscript is registered");
     const std::optional<Ghostscript> ghostscript = FindGhostscript();
     if (!ghostscript)
         Fail(DistillResult::NoEngine, "Ghostscript is not installed");

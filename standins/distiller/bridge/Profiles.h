@@ -6,8 +6,8 @@
 
 namespace standins {
 
-/// The folders with Distiller's profiles, as the machine names them: the user's own, then the
-/// installed ones.
+/// The folders with Distiller's profiles, as the host has handed them over: the user's own, then
+/// the installed ones.
 std::vector<std::string> ProfileFolders();
 
 /// Looks for a profile in the folders and in all that lies below them.

@@ -10,19 +10,20 @@ using testing::StartsWith;
 
 namespace {
 
-constexpr const wchar_t* UserProfilesKey = L"SOFTWARE\\Adobe\\PDF Settings";
-
 /// The folder "Mine" is that of the user's own profiles.
 class ProfilesTest : public BridgeTest {
 protected:
     void SetUp() override {
         fs::create_directories(m_files / "Mine/nested/deep");
-        WriteRegistryText(HKEY_CURRENT_USER, UserProfilesKey, L"", (m_files / "Mine").wstring());
+        HandOver(L"UserProfiles", m_files / "Mine");
+        HandOver(L"JobOptionsFolder", JOB_OPTIONS_FOLDER);
         BridgeTest::SetUp();
     }
-    void TearDown() override {
-        BridgeTest::TearDown();
-        RegDeleteTreeW(HKEY_CURRENT_USER, UserProfilesKey);
+
+    /// What the host does with a folder of profiles.
+    static void HandOver(const wchar_t* name, const fs::path& folder) {
+        WriteRegistryText(HKEY_CURRENT_USER, L"SOFTWARE\\Orvanta\\Distiller Stand-In", name,
+                          folder.wstring());
     }
 
     /// @return the PDF file

@@ -1,4 +1,4 @@
-#include "host/program/machine/MachineStatus.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"
 #include "tests/ui/settings/SettingsWindow.h"
@@ -167,7 +167,7 @@ TEST_F(SettingsDialogueTest, SaysWhyItIsGreyedOutAsStatusDoes) {
     Open([this] { EXPECT_EQ(Said(), ""); });
     m_office.reset();
     Open([this] {
-        EXPECT_TRUE(Said().Contains(WithoutSpaces(LookAtMachine().panelObstacle))) << Said();
+        EXPECT_TRUE(Said().Contains(WithoutSpaces(PanelObstacle()))) << Said();
         EXPECT_FALSE(Find(ButtonId::Restore)->IsEnabled());
     });
 }

@@ -1,0 +1,25 @@
+#include "host/program/machine/Engines.h"
+
+#include "host/program/machine/StandInKeys.h"
+#include "machine/Distiller.h"
+#include "machine/RegistryText.h"
+
+namespace {
+
+wxString EngineOf(const char* standIn) {
+    return ReadRegistryText(wxRegKey::HKLM, standIn, EngineValue).value_or(wxString());
+}
+
+} // namespace
+
+wxString OfficeEngine() {
+    return EngineOf(StandInsKey);
+}
+
+wxString PdfEngine() {
+    const wxString standIn = EngineOf(DistillerStandInKey);
+    const std::optional<Distiller> distiller = FindDistiller();
+    if (!standIn.empty() || !distiller)
+        return standIn;
+    return ("Acrobat Distiller " + distiller->version).Trim();
+}

@@ -1,0 +1,111 @@
+#include "host/program/machine/MissingParts.h"
+
+#include "host/program/PathText.h"
+#include "host/program/machine/Engines.h"
+#include "host/program/machine/FilePrinter.h"
+#include "host/program/system/InstallAdvice.h"
+#include "machine/FiltersFolder.h"
+#include "machine/InstalledOffice.h"
+
+#include <wx/filename.h>
+
+#include <algorithm>
+#include <iterator>
+
+namespace {
+
+constexpr const char* PostScriptInstead = "; or ask for PostScript with --ps";
+
+int NotInstalledCode(OfficeApplication application) {
+    switch (application) {
+    case OfficeApplication::Word:
+        return Result::WordNotInstalled;
+    case OfficeApplication::Excel:
+        return Result::ExcelNotInstalled;
+    case OfficeApplication::PowerPoint:
+        return Result::PowerPointNotInstalled;
+    case OfficeApplication::Publisher:
+        return Result::PublisherNotInstalled;
+    }
+    return Result::NotInitialized;
+}
+
+bool IsDrivable(OfficeApplication application) {
+    return InstallationOf(application) == OfficeInstallation::Drivable;
+}
+
+std::optional<MissingPart> FindMissingVersion(OfficeApplication application,
+                                              const wxString& extension) {
+    if (!IsOpenXmlExtension(extension) || ReadsOpenXml(application))
+        return std::nullopt;
+    const unsigned long version = RegisteredVersionOf(application);
+    const wxString found = version ? wxString::Format("is version %lu", version)
+                                   : wxString("does not say its version");
+    return MissingPart{wxString(NameOf(application)) + ' ' + found + ", and ." + extension.Lower() +
+                           " files need version 12 or later",
+                       InstallAdvice(ProgIdOf(application))};
+}
+
+} // namespace
+
+wxString MissingPart::Text() const {
+    return advice.empty() ? what : what + ". " + advice;
+}
+
+std::optional<MissingPart> FindMissingOffice() {
+    if (std::any_of(std::begin(AllOfficeApplications), std::end(AllOfficeApplications), IsDrivable))
+        return std::nullopt;
+    return MissingPart{IsOfficeInstalled() ? "The only Office application is a Publisher of Office "
+                                             "97 or 2000, too old to be driven"
+                                           : "No Office application is installed",
+                       InstallAdvice({})};
+}
+
+std::optional<MissingPart> FindMissingApplication(OfficeApplication application) {
+    if (IsDrivable(application))
+        return std::nullopt;
+    const wxString name = NameOf(application);
+    const wxString advice = InstallAdvice(ProgIdOf(application));
+    return IsInstalled(application)
+               ? MissingPart{name + " is of Office 97 or 2000, too old to be driven", advice,
+                             Result::PublisherTooOld}
+               : MissingPart{name + " is not installed", advice, NotInstalledCode(application)};
+}
+
+std::optional<MissingPart> FindMissingPrinter() {
+    if (PreferredPrinter(ListPrinters()))
+        return std::nullopt;
+    return MissingPart{"There is no PostScript printer",
+                       "Install the program anew, which brings one, or add one to the system"};
+}
+
+std::optional<MissingPart> FindMissingPdfMaker() {
+    const std::filesystem::path bridge =
+        FromText(FindFiltersFolder().value_or(wxString()) + wxFileName::GetPathSeparator() +
+                 DistillerBridgeFile);
+    std::error_code ignored;
+    if (!std::filesystem::is_regular_file(bridge, ignored))
+        return MissingPart{"The library that makes PDF files is missing: " + Shown(bridge),
+                           wxString("Install the program anew") + PostScriptInstead,
+                           Result::PdfConversionFailed};
+    if (PdfEngine().empty())
+        return MissingPart{"There is nothing to make PDF files with",
+                           PdfInstallAdvice() + PostScriptInstead, Result::PdfConversionFailed};
+    return std::nullopt;
+}
+
+std::optional<MissingPart> FindMissingFor(const wxString& extension) {
+    const std::optional<OfficeApplication> application = ApplicationForExtension(extension);
+    if (!application)
+        return std::nullopt;
+    std::optional<MissingPart> missing = FindMissingApplication(*application);
+    if (!missing)
+        missing = FindMissingVersion(*application, extension);
+    return missing ? missing : FindMissingPrinter();
+}
+
+wxString PanelObstacle() {
+    // With a server as new as the one that the host speaks of, a missing printer disables nothing.
+    return IsOfficeInstalled() ? wxString()
+                               : "no Office application is installed. " + InstallAdvice(wxString());
+}

@@ -1,0 +1,16 @@
+#pragma once
+
+// The registry keys and values that the host shares with the stand-ins.
+
+/// Under HKEY_LOCAL_MACHINE what the stand-ins say of themselves, under HKEY_CURRENT_USER what
+/// they are told.
+constexpr const char* StandInsKey = "SOFTWARE\\Orvanta\\Office Stand-Ins";
+constexpr const char* DistillerStandInKey = "SOFTWARE\\Orvanta\\Distiller Stand-In";
+
+constexpr const char* EngineValue = "Engine"; ///< said: name and version of the engine
+
+constexpr const char* StallSecondsValue = "StallSeconds"; ///< told: a number
+constexpr const char* TotalSecondsValue = "TotalSeconds"; ///< told: a number
+/// Told the Distiller stand-in: where the profiles lie that it is asked for by name.
+constexpr const char* UserProfilesValue = "UserProfiles";
+constexpr const char* JobOptionsFolderValue = "JobOptionsFolder";
