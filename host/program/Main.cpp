@@ -11,6 +11,7 @@
 
 #include <wx/app.h>
 #include <wx/init.h>
+#include <wx/intl.h>
 #include <wx/utils.h>
 
 #include <exception>
@@ -18,17 +19,12 @@
 namespace {
 
 /// @return whether the log can be kept as asked for
-bool StartLog(const CommandLine& line, Reporter& reporter) {
-    if (line.logFile && !Log::ToFile(FromArgument(*line.logFile))) {
-        reporter.Error("the log file " + Shown(FromArgument(*line.logFile)) +
-                       " cannot be written; choose another one with --log");
-        return false;
-    }
+bool StartLog(const CommandLine& line) {
     if (line.verbose)
         Log::ToStandardError(LevelInformation);
     RouteToolkitLog();
     RouteLayerLog();
-    return true;
+    return !line.logFile || Log::ToFile(FromArgument(*line.logFile));
 }
 
 /// @return whether the language asked for is in use
@@ -49,8 +45,16 @@ std::filesystem::path FolderOr(const std::optional<std::string>& given, const ch
 
 ExitCode Run(const CommandLine& line) {
     Reporter reporter(line.json);
-    if (!StartLog(line, reporter) || !StartLanguage(line, reporter))
+    const bool hasLog = StartLog(line);
+    if (!StartLanguage(line, reporter))
         return ExitCode::WrongUsage;
+    if (!hasLog) {
+        reporter.Error(
+            wxString::Format(_("the log file %s cannot be written; choose another one with --log"),
+                             Shown(FromArgument(*line.logFile))));
+        return ExitCode::WrongUsage;
+    }
+    Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
     SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds});
     const std::filesystem::path filtersFolder = FolderOr(line.filtersFolder, "Filters");
     switch (line.command) {
@@ -77,6 +81,17 @@ ExitCode RunOnConsole(const CommandLine& line) {
     return toolkit.IsOk() ? Run(line) : ExitCode::MachineAtFault;
 }
 
+ExitCode TellNoDisplay(const CommandLine& line) {
+    wxAppConsole console; // the texts are looked for beside the program, which it knows
+    wxApp::SetInstance(&console);
+    Reporter reporter(line.json);
+    if (StartLanguage(line, reporter))
+        reporter.Error(_("there is no display to show the settings on; run it on a desktop, or set "
+                         "them with convert --set"));
+    wxApp::SetInstance(nullptr);
+    return ExitCode::MachineAtFault;
+}
+
 ExitCode RunOnDesktop(const CommandLine& line, char* programName) {
     // A scroll bar that hides would leave whoever needs large letters without a hint of the rest.
     wxSetEnv("GTK_OVERLAY_SCROLLING", "0");
@@ -84,9 +99,7 @@ ExitCode RunOnDesktop(const CommandLine& line, char* programName) {
     int count = 1;                 // the toolkit would take our options for its own
     char* arguments[] = {programName, nullptr};
     if (!wxEntryStart(count, arguments) || !wxTheApp->CallOnInit()) {
-        Reporter(line.json).Error("there is no display to show the settings on; run it on a "
-                                  "desktop, or set them with convert --set");
-        return ExitCode::MachineAtFault;
+        return TellNoDisplay(line);
     }
     UseUtf8(); // the desktop's toolkit has taken over the environment's word
     const ExitCode exitCode = Run(line);

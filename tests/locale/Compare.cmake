@@ -1,7 +1,7 @@
 # Fails when the catalogue lacks a text that the sources mark for translation.
 file(GLOB_RECURSE sources "${SOURCES}/*.cpp")
 execute_process(COMMAND "${XGETTEXT}" --language=C++ --from-code=UTF-8
-                        --keyword --keyword=_ --keyword=wxTRANSLATE
+                        --keyword --keyword=_ --keyword=wxTRANSLATE --keyword=wxPLURAL:1,2
                         "--output=${TEXTS}" ${sources}
                 RESULT_VARIABLE failed)
 if(NOT failed)

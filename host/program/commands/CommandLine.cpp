@@ -52,11 +52,11 @@ Exit codes
 
 Output
   One line for each file when it is done, in the order of the files: input, output, state, result
-  code, its text, seconds. The text is in the language of --lang, or else of LC_ALL, LC_MESSAGES
-  or LANG.
+  code, its text, seconds. What the program says is in the language of --lang, or else of LC_ALL,
+  LC_MESSAGES or LANG; this help, the log, and what is wrong with a command line are in English.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
   printer, distiller, panel, missing, document, summary and error; lines for people then go to
-  stderr. The "code" of a document is the same in every language.
+  stderr. The "code" and the "state" of a document are the same in every language.
 )";
 
 std::string SettingsTable() {

@@ -9,6 +9,8 @@
 #include "host/program/system/Interruption.h"
 #include "host/program/workers/WorkerPool.h"
 
+#include <wx/intl.h>
+
 namespace {
 
 constexpr unsigned WorkerPatience = 60; // seconds
@@ -124,8 +126,8 @@ ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filter
     wxString fault;
     std::optional<OutputFolder> outputFolder = OutputFolder::Open(FromArgument(line.out), fault);
     if (!outputFolder) {
-        reporter.Error("the output folder " + Shown(FromArgument(line.out)) +
-                       " cannot be used: " + fault);
+        reporter.Error(wxString::Format(_("the output folder %s cannot be used: %s"),
+                                        Shown(FromArgument(line.out)), fault));
         return ExitCode::WrongUsage;
     }
     Workplace::RemoveAbandoned(outputFolder->Path());

@@ -2,20 +2,22 @@
 
 #include "plugin/ResultCodes.h"
 
+#include <wx/translation.h>
+
 const char* NameOf(State state) {
     switch (state) {
     case State::Accepted:
-        return "accepted";
+        return wxTRANSLATE("accepted");
     case State::Converted:
-        return "converted";
+        return wxTRANSLATE("converted");
     case State::Skipped:
-        return "skipped";
+        return wxTRANSLATE("skipped");
     case State::Refused:
-        return "refused";
+        return wxTRANSLATE("refused");
     case State::Failed:
-        return "failed";
+        return wxTRANSLATE("failed");
     case State::NotConverted:
-        return "not converted";
+        return wxTRANSLATE("not converted");
     }
     return "";
 }

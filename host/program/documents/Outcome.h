@@ -30,7 +30,7 @@ struct Outcome {
 /// The shared table's code for a failure that no filter is to blame for.
 constexpr int ConversionFailed = -1003;
 
-/// The state's name, as people and records have it.
+/// The state's name, as records have it, and people in their language.
 const char* NameOf(State state);
 
 /// Whether a result code says that something is missing on the machine.

@@ -4,6 +4,7 @@
 #include "host/program/system/DurableMove.h"
 
 #include <wx/filename.h>
+#include <wx/intl.h>
 
 namespace fs = std::filesystem;
 
@@ -28,19 +29,19 @@ std::optional<OutputFolder> OutputFolder::Open(const fs::path& path, wxString& f
     std::error_code error;
     const fs::path folder = WithoutSeparatorAtEnd(fs::absolute(path, error).lexically_normal());
     if (error || !ToText(folder)) {
-        fault = "its name is not valid UTF-8 text";
+        fault = _("its name is not valid UTF-8 text");
         return std::nullopt;
     }
     if (!fs::is_directory(folder, error)) {
         if (fs::exists(folder, error))
-            fault = "it is a file, not a folder";
+            fault = _("it is a file, not a folder");
         else if (!fs::is_directory(folder.parent_path(), error))
-            fault = "the folder above it does not exist either; create that first";
+            fault = _("the folder above it does not exist either; create that first");
         else if (!fs::create_directory(folder, error) ||
                  (error = SyncFolder(folder.parent_path()))) // or it is lost with what is in it
-            fault = "it cannot be created: " + Because(error);
+            fault = wxString::Format(_("it cannot be created: %s"), Because(error));
     } else if (!wxFileName::IsDirWritable(*ToText(folder))) {
-        fault = "nothing can be written to it; choose another one or change its permissions";
+        fault = _("nothing can be written to it; choose another one or change its permissions");
     }
     if (!fault.empty())
         return std::nullopt;

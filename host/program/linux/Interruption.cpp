@@ -2,15 +2,18 @@
 
 #include <unistd.h>
 
+#include <atomic>
 #include <cerrno>
 #include <csignal>
+#include <cstring>
 #include <initializer_list>
+#include <string>
 
 namespace {
 
 volatile std::sig_atomic_t g_requested = 0;
 
-constexpr char Note[] = "\nquillon: finishing what is under way; a second Ctrl-C ends at once\n";
+std::atomic<const char*> g_note{nullptr};
 
 extern "C" void NoteRequest(int signal) {
     if (g_requested != 0) {
@@ -20,7 +23,8 @@ extern "C" void NoteRequest(int signal) {
     }
     g_requested = 1;
     const int error = errno;
-    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, Note, sizeof Note - 1);
+    if (const char* const note = g_note) [[maybe_unused]]
+        const ssize_t written = write(STDERR_FILENO, note, std::strlen(note));
     errno = error;
 }
 
@@ -42,6 +46,13 @@ void Interruption::Install() {
     // A reader of our output that has gone is no reason to leave documents unconverted. A handler,
     // not SIG_IGN, since programs started from here would inherit that.
     Handle(SIGPIPE, DoNothing);
+}
+
+void Interruption::SetNote(const wxString& note) {
+    static std::string s_line;
+    g_note = nullptr;
+    s_line = "\nquillon: " + note.utf8_string() + '\n';
+    g_note = s_line.c_str();
 }
 
 void Interruption::LeaveToParent() {

@@ -4,6 +4,8 @@
 #include "host/program/PathText.h"
 #include "host/services/OneLine.h"
 
+#include <wx/intl.h>
+
 #include <algorithm>
 #include <cmath>
 #include <map>
@@ -22,7 +24,8 @@ wxString LineOf(const Outcome& outcome) {
     wxString line = Shown(outcome.input);
     if (!outcome.output.empty())
         line << " -> " << Shown(outcome.output);
-    line << ": " << NameOf(outcome.state) << ", " << outcome.code << ' ' << OneLine(outcome.text);
+    line << ": " << wxGetTranslation(NameOf(outcome.state)) << ", " << outcome.code << ' '
+         << OneLine(outcome.text);
     if (!outcome.reason.empty())
         line << " (" << OneLine(outcome.reason) << ')';
     if (outcome.seconds)
@@ -43,6 +46,25 @@ Json RecordOf(const Outcome& outcome) {
     record["seconds"] =
         outcome.seconds ? Json(std::round(*outcome.seconds * 1000.0) / 1000.0) : Json();
     return record;
+}
+
+/// How to say how many files have come to a state.
+wxString CountFormat(State state, unsigned count) {
+    switch (state) {
+    case State::Accepted:
+        return wxPLURAL("%u accepted", "%u accepted", count);
+    case State::Converted:
+        return wxPLURAL("%u converted", "%u converted", count);
+    case State::Skipped:
+        return wxPLURAL("%u skipped", "%u skipped", count);
+    case State::Refused:
+        return wxPLURAL("%u refused", "%u refused", count);
+    case State::Failed:
+        return wxPLURAL("%u failed", "%u failed", count);
+    case State::NotConverted:
+        return wxPLURAL("%u not converted", "%u not converted", count);
+    }
+    return {};
 }
 
 /// The exit code of a command that came to these outcomes: an interruption outweighs a fault of
@@ -72,14 +94,14 @@ void Tell(const Outcome& outcome, Reporter& reporter) {
 }
 
 ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
-    std::map<State, int> counts;
+    std::map<State, unsigned> counts;
     for (const Outcome& outcome : outcomes)
         ++counts[outcome.state];
     const ExitCode exitCode = Verdict(outcomes);
     wxString line;
     Json record = {{"type", "summary"}};
     for (const auto& [state, count] : counts) {
-        line << (line.empty() ? "" : ", ") << count << ' ' << NameOf(state);
+        line << (line.empty() ? "" : ", ") << wxString::Format(CountFormat(state, count), count);
         record[NameOf(state)] = count;
     }
     record["exitCode"] = static_cast<int>(exitCode);
@@ -91,12 +113,12 @@ ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
 std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
                                    Reporter& reporter) {
     if (filters.Filters().empty()) {
-        reporter.Error("no filter could be loaded; `quillon status` shows where they are looked "
-                       "for. Install the program anew");
+        reporter.Error(_("no filter could be loaded; `quillon status` shows where they are looked "
+                         "for. Install the program anew"));
         return ExitCode::MachineAtFault;
     }
     if (inputs.empty()) {
-        reporter.Line("Nothing to do: there are no files directly in what was named.");
+        reporter.Line(_("Nothing to do: there are no files directly in what was named."));
         return ExitCode::Done;
     }
     return std::nullopt;

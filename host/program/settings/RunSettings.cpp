@@ -5,6 +5,8 @@
 #include "host/program/machine/FilePrinter.h"
 #include "machine/Distiller.h"
 
+#include <wx/intl.h>
+
 #include <algorithm>
 
 namespace {
@@ -18,8 +20,8 @@ bool IsKnown(const wxString& key) {
 bool Apply(const std::string& assignment, Settings& settings, Obstacle& obstacle) {
     const std::optional<wxString> text = ToText(FromArgument(assignment));
     if (!text || text->find('=') == wxString::npos || text->StartsWith("=")) {
-        obstacle = {ExitCode::WrongUsage,
-                    "--set takes KEY=VALUE, not \"" + Shown(FromArgument(assignment)) + "\""};
+        obstacle = {ExitCode::WrongUsage, wxString::Format(_("--set takes KEY=VALUE, not \"%s\""),
+                                                           Shown(FromArgument(assignment)))};
         return false;
     }
     const wxString key = text->BeforeFirst('=');
@@ -34,7 +36,7 @@ wxString ListOf(const std::vector<wxString>& names) {
     wxString list;
     for (const wxString& name : names)
         list << (list.empty() ? "\"" : ", \"") << name << '"';
-    return list.empty() ? wxString("none") : list;
+    return list.empty() ? _("none") : list;
 }
 
 /// @return whether the settings name a printer that there is
@@ -47,10 +49,11 @@ bool CheckPrinter(const Settings& settings, Obstacle& obstacle) {
         return true;
     if (wanted.empty())
         obstacle = {ExitCode::MachineAtFault,
-                    "there is no PostScript printer; add one to the system"};
+                    _("there is no PostScript printer; add one to the system")};
     else
         obstacle = {ExitCode::WrongUsage,
-                    "there is no printer \"" + wanted + "\"; the printers are: " + ListOf(names)};
+                    wxString::Format(_("there is no printer \"%s\"; the printers are: %s"), wanted,
+                                     ListOf(names))};
     return false;
 }
 
@@ -72,8 +75,9 @@ bool CheckProfile(const Settings& settings, Obstacle& obstacle) {
     const std::vector<wxString> names = ListDistillerProfiles();
     if (wanted.empty() || !FindProfile(wanted, names).empty())
         return true;
-    obstacle = {ExitCode::WrongUsage, "there is no Distiller profile \"" + wanted +
-                                          "\"; the profiles are: " + ListOf(names)};
+    obstacle = {ExitCode::WrongUsage,
+                wxString::Format(_("there is no Distiller profile \"%s\"; the profiles are: %s"),
+                                 wanted, ListOf(names))};
     return false;
 }
 
@@ -134,15 +138,18 @@ void FillIn(Settings& settings) {
         settings.Set("SELECTEDDISTILLERPROFILE", profile);
 }
 
+wxString UnusableSettings(const std::filesystem::path& file, const wxString& fault) {
+    return wxString::Format(_("the settings file %s cannot be used: %s"), Shown(file), fault);
+}
+
 std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle) {
     std::optional<Settings> settings = Settings();
     if (line.settingsFile) {
         wxString fault;
         settings = Settings::Load(FromArgument(*line.settingsFile), fault);
         if (!settings)
-            obstacle = {ExitCode::WrongUsage, "the settings file " +
-                                                  Shown(FromArgument(*line.settingsFile)) +
-                                                  " cannot be used: " + fault};
+            obstacle = {ExitCode::WrongUsage,
+                        UnusableSettings(FromArgument(*line.settingsFile), fault)};
     }
     if (!settings)
         return std::nullopt;

@@ -30,6 +30,9 @@ struct Obstacle {
 /// the profile's name where a user has left out its ending.
 void FillIn(Settings& settings);
 
+/// What is said of a settings file that cannot be used.
+wxString UnusableSettings(const std::filesystem::path& file, const wxString& fault);
+
 /// Puts together the settings of a run: the file's, the command line's in their place, and what
 /// FillIn adds.
 /// @param obstacle receives why there is no result

@@ -48,14 +48,14 @@ std::optional<std::string> ReadBounded(const fs::path& file, wxString& fault) {
         return std::nullopt;
     const std::uintmax_t size = fs::file_size(file, error);
     if (!error && size > LargestFile) {
-        fault = wxString::Format("it is larger than %ju KiB, too much for settings",
+        fault = wxString::Format(_("it is larger than %ju KiB, too much for settings"),
                                  LargestFile / 1024);
         return std::nullopt;
     }
     std::string bytes(error ? 0 : size, '\0');
     std::ifstream stream(file, std::ios::binary);
     if (!stream.read(bytes.data(), static_cast<std::streamsize>(bytes.size()))) {
-        fault = "it cannot be read";
+        fault = _("it cannot be read");
         return std::nullopt;
     }
     return bytes;
@@ -111,7 +111,7 @@ std::optional<Settings> Settings::Parse(const std::string& bytes, bool keepLayou
     auto document = std::make_unique<wxXmlDocument>();
     if (!document->Load(stream, "UTF-8",
                         keepLayout ? wxXMLDOC_KEEP_WHITESPACE_NODES : wxXMLDOC_NONE)) {
-        fault = "its encoding is not known";
+        fault = _("its encoding is not known");
         return std::nullopt;
     }
     return Settings(std::move(document), keepLayout);
@@ -120,7 +120,7 @@ std::optional<Settings> Settings::Parse(const std::string& bytes, bool keepLayou
 std::optional<Settings> Settings::FromXml(const std::string& bytes, wxString& fault) {
     std::optional<Settings> settings = Parse(bytes, false, fault);
     if (settings && !settings->m_ui) {
-        fault = "it has no element \"UI\" with settings in it";
+        fault = _("it has no element \"UI\" with settings in it");
         return std::nullopt;
     }
     return settings;

@@ -1,5 +1,7 @@
 #include "host/program/settings/XmlCheck.h"
 
+#include <wx/intl.h>
+
 #include <expat.h>
 
 #include <memory>
@@ -21,7 +23,7 @@ struct Check {
 void OnStart(void* user, const XML_Char*, const XML_Char**) {
     auto* check = static_cast<Check*>(user);
     if (++check->depth > check->maximumDepth)
-        check->Stop(wxString::Format("elements nested deeper than %d", check->maximumDepth));
+        check->Stop(wxString::Format(_("elements nested deeper than %d"), check->maximumDepth));
 }
 
 void OnEnd(void* user, const XML_Char*) {
@@ -29,7 +31,7 @@ void OnEnd(void* user, const XML_Char*) {
 }
 
 void OnDocumentType(void* user, const XML_Char*, const XML_Char*, const XML_Char*, int) {
-    static_cast<Check*>(user)->Stop("a document type, which has no place here");
+    static_cast<Check*>(user)->Stop(_("a document type, which has no place here"));
 }
 
 } // namespace
@@ -38,7 +40,7 @@ wxString FindXmlFault(std::string_view bytes, int maximumDepth) {
     const std::unique_ptr<XML_ParserStruct, decltype(&XML_ParserFree)> parser(
         XML_ParserCreate(nullptr), XML_ParserFree);
     if (!parser)
-        return "not enough memory to read it";
+        return _("not enough memory to read it");
     Check check = {parser.get(), 0, maximumDepth, {}};
     XML_SetUserData(parser.get(), &check);
     XML_SetElementHandler(parser.get(), OnStart, OnEnd);
@@ -48,5 +50,5 @@ wxString FindXmlFault(std::string_view bytes, int maximumDepth) {
         return {};
     if (check.fault.empty())
         check.fault = XML_ErrorString(XML_GetErrorCode(parser.get()));
-    return wxString::Format("line %lu: %s", XML_GetCurrentLineNumber(parser.get()), check.fault);
+    return wxString::Format(_("line %lu: %s"), XML_GetCurrentLineNumber(parser.get()), check.fault);
 }

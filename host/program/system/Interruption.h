@@ -1,11 +1,16 @@
 #pragma once
 
+#include <wx/string.h>
+
 /// Ctrl-C, and the system's request to end.
 namespace Interruption {
 
 /// From now on the first such request is only noted, so that the document under way is finished;
 /// a second one ends the process.
 void Install();
+
+/// What is said on standard error, in a line of its own, when such a request is noted.
+void SetNote(const wxString& note);
 
 /// For a process that another one of this program has started: the other one decides, and such
 /// requests, which a terminal sends to both, mean nothing here.

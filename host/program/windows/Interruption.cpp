@@ -5,16 +5,20 @@
 #include <windows.h>
 
 #include <atomic>
+#include <cstring>
+#include <string>
 
 namespace {
 
 std::atomic<bool> g_requested{false};
 
-constexpr char Note[] = "\nquillon: finishing what is under way; a second Ctrl-C ends at once\n";
+std::atomic<const char*> g_note{nullptr};
 
 void WriteNote() {
     DWORD written = 0;
-    WriteFile(GetStdHandle(STD_ERROR_HANDLE), Note, sizeof Note - 1, &written, nullptr);
+    if (const char* const note = g_note)
+        WriteFile(GetStdHandle(STD_ERROR_HANDLE), note, static_cast<DWORD>(std::strlen(note)),
+                  &written, nullptr);
 }
 
 bool IsKey(DWORD kind) {
@@ -47,6 +51,13 @@ BOOL WINAPI LeaveRequest(DWORD kind) {
 
 void Interruption::Install() {
     SetConsoleCtrlHandler(OnRequest, TRUE);
+}
+
+void Interruption::SetNote(const wxString& note) {
+    static std::string s_line;
+    g_note = nullptr;
+    s_line = "\nquillon: " + note.utf8_string() + '\n';
+    g_note = s_line.c_str();
 }
 
 void Interruption::LeaveToParent() {
