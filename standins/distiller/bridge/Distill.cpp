@@ -71,7 +71,7 @@ SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
                          const Descriptor& profile) {
     const RegistryKey facts = RegistryKey::Open(HKEY_LOCAL_MACHINE, DistillerSettingsKey);
     if (!facts.Text(DistillerEngineValue)) // then the machine counts as having none
-        Fail(DistillResult::NoEngine, "no Ghostscript is registered");
+        Fail(DistillResult::NoEngine, "no Ghostscript was found when the stand-in was registered");
     const std::optional<Ghostscript> ghostscript = FindGhostscript();
     if (!ghostscript)
         Fail(DistillResult::NoEngine, "Ghostscript is not installed");

@@ -21,7 +21,7 @@ TEST_F(DistillerRegistrationTest, EntersTheEngineAndTheProfiles) {
     EXPECT_TRUE(fs::exists(fs::path(Folder()) / "Smallest File.joboptions"));
     Call("DllUnregisterServer");
     EXPECT_EQ("", Engine() + Folder());
-    EXPECT_THAT(Failure(WordsProgram("")), testing::HasSubstr("no Ghostscript is registered"));
+    EXPECT_THAT(Failure(WordsProgram("")), testing::HasSubstr("no Ghostscript was found"));
 }
 
 TEST_F(DistillerRegistrationTest, EntersWhatIsInstalled) {
