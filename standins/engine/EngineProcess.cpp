@@ -8,6 +8,7 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <csignal>
 #include <cstdlib>
@@ -59,6 +60,20 @@ bool TakeDescriptors(const std::vector<int>& descriptors) {
     _exit(EngineCannotStart);
 }
 
+/// What it may use of the processors before the system ends it.
+rlim_t CpuLimit(TimeLimits times) {
+    rlimit inherited{};
+    getrlimit(RLIMIT_CPU, &inherited);
+    return std::min<rlim_t>(inherited.rlim_max, MostCpuSeconds(times));
+}
+
+bool UsedUp(const rusage& usage, rlim_t seconds) {
+    const timeval& user = usage.ru_utime;
+    const timeval& system = usage.ru_stime;
+    return static_cast<rlim_t>(user.tv_sec + system.tv_sec +
+                               (user.tv_usec + system.tv_usec) / 1'000'000) >= seconds;
+}
+
 } // namespace
 
 std::vector<std::string> EngineEnvironment(const std::string& folder) {
@@ -75,7 +90,8 @@ std::vector<std::string> EngineEnvironment(const std::string& folder) {
     return environment;
 }
 
-EngineProcess::EngineProcess(const EngineCommand& command) {
+EngineProcess::EngineProcess(const EngineCommand& command)
+    : m_mostCpuSeconds(CpuLimit(command.times)) {
     const pid_t supervisor = getpid();
     m_id = fork();
     if (m_id == 0)
@@ -90,7 +106,10 @@ int EngineProcess::End() {
     int status = 0;
     if (m_id > 0) {
         kill(-m_id, SIGKILL); // nobody has waited for it yet, so the number is still its own
-        waitpid(m_id, &status, 0);
+        rusage usage{};
+        wait4(m_id, &status, 0, &usage);
+        if (WIFSIGNALED(status) && WTERMSIG(status) == SIGKILL && UsedUp(usage, m_mostCpuSeconds))
+            status = SIGXCPU;
     }
     EndChildren();
     return status;

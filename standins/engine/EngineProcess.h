@@ -4,6 +4,7 @@
 #include "standins/process/Clocks.h"
 #include "standins/process/Descriptor.h"
 
+#include <sys/resource.h>
 #include <sys/types.h>
 
 #include <string>
@@ -40,11 +41,13 @@ public:
     /// Becomes readable when the engine has ended.
     int ExitDescriptor() const { return m_exit.Get(); }
     /// Ends the engine if it has not ended, with everything that it started.
-    /// @return the status as waitpid gives it
+    /// @return the status as waitpid gives it; SIGXCPU, too, where the system has ended it for its
+    /// processor time in the way that cannot be ignored
     int End();
 
 private:
     pid_t m_id = -1;
+    rlim_t m_mostCpuSeconds;
     Descriptor m_exit; ///< a pidfd
 };
 

@@ -20,33 +20,33 @@ EngineWatch::EngineWatch(std::string engine, TimeLimits limits, const Channel& s
     : m_engine(std::move(engine)), m_limits(limits), m_clocks(limits), m_server(server),
       m_heartbeat(server) {}
 
-std::string EngineWatch::Await(const EngineProcess& engine,
-                               const std::function<std::uint64_t()>& bytesWritten) {
+Failure EngineWatch::Await(const EngineProcess& engine,
+                           const std::function<std::uint64_t()>& bytesWritten) {
     for (;;) {
         std::array<pollfd, 2> events{
             {{engine.ExitDescriptor(), POLLIN, 0}, {m_server.Socket(), POLLIN, 0}}};
         const int ready =
             poll(events.data(), events.size(), static_cast<int>(m_clocks.Interval().count()));
         if (ready < 0 && errno != EINTR)
-            return DescribeError(m_engine + " cannot be watched", errno);
+            return MachineFailure(m_engine + " cannot be watched", errno);
         if (events[1].revents != 0)
-            return "nobody waits for it any more";
+            return {"nobody waits for it any more", Fault::Outside};
         if (events[0].revents != 0)
             return {};
-        std::string ended = Check({CpuTicksOfGroup(engine.Group()), bytesWritten()});
-        if (!ended.empty())
+        Failure ended = Check({CpuTicksOfGroup(engine.Group()), bytesWritten()});
+        if (ended)
             return ended;
     }
 }
 
-std::string EngineWatch::Check(const LifeSign& sign) {
+Failure EngineWatch::Check(const LifeSign& sign) {
     if (sign.bytesWritten > MostBytes)
-        return m_engine + " wrote more than it may";
+        return {m_engine + " wrote more than it may"};
     switch (m_clocks.Check(sign)) {
     case Clocks::State::Stalled:
-        return DescribeStall(m_engine, m_limits);
+        return StallFailure(m_engine, m_limits);
     case Clocks::State::Overdue:
-        return DescribeOverdue(m_engine, m_limits);
+        return OverdueFailure(m_engine, m_limits);
     case Clocks::State::Running:
         m_heartbeat.Beat();
     }

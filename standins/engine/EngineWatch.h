@@ -4,6 +4,7 @@
 #include "standins/engine/Heartbeat.h"
 #include "standins/process/Channel.h"
 #include "standins/process/Clocks.h"
+#include "standins/process/Failure.h"
 
 #include <cstdint>
 #include <functional>
@@ -21,12 +22,11 @@ public:
 
     /// Waits for the engine.
     /// @param bytesWritten answers how much it has written so far
-    /// @return empty when the engine has ended by itself, else why it must be ended
-    std::string Await(const EngineProcess& engine,
-                      const std::function<std::uint64_t()>& bytesWritten);
+    /// @return no failure when the engine has ended by itself, else why it must be ended
+    Failure Await(const EngineProcess& engine, const std::function<std::uint64_t()>& bytesWritten);
 
 private:
-    std::string Check(const LifeSign& sign);
+    Failure Check(const LifeSign& sign);
 
     std::string m_engine;
     TimeLimits m_limits;

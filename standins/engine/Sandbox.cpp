@@ -49,12 +49,16 @@ void LimitMemory(std::uint64_t most) {
     Limit(RLIMIT_AS, most, most);
 }
 
+std::uint64_t MostCpuSeconds(TimeLimits times) {
+    return static_cast<std::uint64_t>(times.total.count()) *
+           std::max(1U, std::thread::hardware_concurrency());
+}
+
 void LimitResources(const ResourceLimits& limits, TimeLimits times) {
     Limit(RLIMIT_CORE, 0, 0);
     Limit(RLIMIT_FSIZE, limits.largestFile, limits.largestFile);
-    // Every core busy for the whole time: this clock is for an engine that nobody watches.
-    const rlim_t cpuSeconds = static_cast<rlim_t>(times.total.count()) *
-                              std::max(1U, std::thread::hardware_concurrency());
+    // This clock is for an engine that nobody watches.
+    const rlim_t cpuSeconds = MostCpuSeconds(times);
     Limit(RLIMIT_CPU, cpuSeconds, cpuSeconds + 1);
     LimitMemory(limits.memory); // at last: the memory that others want here counts too
 }

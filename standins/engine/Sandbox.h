@@ -24,6 +24,9 @@ struct ResourceLimits {
 /// Limits the address space alone, to `most` bytes.
 void LimitMemory(std::uint64_t most);
 
+/// The processor time that an engine may use: every core busy for the whole time.
+std::uint64_t MostCpuSeconds(TimeLimits times);
+
 /// Limits everything: address space, size of a file, CPU time, no core files. To be followed by
 /// exec at once.
 void LimitResources(const ResourceLimits& limits, TimeLimits times);

@@ -14,9 +14,10 @@ namespace {
 constexpr int ChannelDescriptor = FirstGivenDescriptor - 1;
 
 /// Whoever wants to end the supervisor ends the server: then the channel closes, and the
-/// supervisor can still clear away what the engine has made.
+/// supervisor can still clear away what the engine has made. A file that becomes too large is a
+/// write that fails.
 void IgnoreSignals() {
-    for (const int number : {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE, SIGALRM})
+    for (const int number : {SIGHUP, SIGINT, SIGQUIT, SIGTERM, SIGPIPE, SIGALRM, SIGXFSZ})
         signal(number, SIG_IGN);
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "standins/process/Descriptor.h"
+#include "standins/process/Failure.h"
 
 #include <cstdint>
 #include <string>
@@ -14,8 +15,8 @@ struct DocumentFile {
 };
 
 /// Opens a document. Never waits for a writer, as a named pipe would make it.
-/// @param failure receives what is wrong, as the end of a sentence
+/// @param failure receives what is wrong
 /// @return a closed descriptor when the document cannot be opened
-DocumentFile OpenDocumentFile(const std::wstring& path, std::wstring& failure);
+DocumentFile OpenDocumentFile(const std::wstring& path, Failure& failure);
 
 } // namespace standins

@@ -1,13 +1,14 @@
 #include "standins/module/SupervisedRun.h"
 
 #include "standins/process/ChildProcess.h"
+#include "standins/process/ProcessEnd.h"
 
 #include <fcntl.h>
 #include <poll.h>
+#include <sys/wait.h>
 
 #include <algorithm>
 #include <cerrno>
-#include <system_error>
 
 using namespace std::chrono_literals;
 
@@ -20,12 +21,12 @@ using Time = std::chrono::steady_clock;
 // What the supervisor gets to do its own clearing up before it counts as lost.
 constexpr std::chrono::seconds Grace = 5s;
 
-Message Failure(const SupervisedRun& run, const std::string& what) {
-    return {MessageKind::Failed, run.engine + "'s supervisor " + what, Descriptor()};
+Message Failed(Failure failure) {
+    return {MessageKind::Failed, std::move(failure.reason), Descriptor(), failure.fault};
 }
 
-Message CannotStart(const SupervisedRun& run, int error) {
-    return Failure(run, "cannot be started: " + std::generic_category().message(error));
+std::string NameOfSupervisor(const SupervisedRun& run) {
+    return run.engine + "'s supervisor";
 }
 
 std::optional<ChildProcess> StartSupervisor(const SupervisedRun& run, const Channel& channel) {
@@ -60,46 +61,57 @@ bool WaitForMessage(const Channel& channel, Time::time_point deadline) {
 
 /// The supervisor's last message. It says that it is alive in between; the total time counts from
 /// the start, as it does there.
-/// @param lost receives what happened when there is none
-std::optional<Message> AwaitResult(const Channel& channel, const TimeLimits& limits,
-                                   std::string& lost) {
+/// @return nothing when there is none: the supervisor has ended, or does not respond
+std::optional<Message> AwaitResult(const Channel& channel, const TimeLimits& limits) {
     const Time::time_point end = Time::now() + limits.total + Grace;
     while (WaitForMessage(channel, std::min(end, Time::now() + limits.stall + Grace))) {
         std::optional<Message> message = channel.Receive();
-        if (!message)
-            lost = "ended unexpectedly";
         if (!message || message->kind != MessageKind::Alive)
             return message;
     }
-    lost = "stopped responding";
     return std::nullopt;
 }
 
+/// Whether a process ends by itself within a moment; its channel closes a little earlier.
+bool HasEnded(const ChildProcess& process) {
+    constexpr int Moment = 1000; // milliseconds
+    pollfd event{process.ExitDescriptor(), POLLIN, 0};
+    return poll(&event, 1, Moment) > 0;
+}
+
+/// Why a supervisor that has ended did not do its work to the end.
+Failure DescribeLost(const std::string& name, int status, const MemoryShortage& shortage) {
+    Failure failure = DescribeEnd(name, status, shortage);
+    if (WIFEXITED(status)) // it gave up itself, and not because of a document
+        failure = {name + " ended unexpectedly", Fault::Machine};
+    return failure;
+}
+
 /// After a supervisor that did not do its work to the end. Its engine dies with it.
-void ClearAfter(ChildProcess& supervisor, const SupervisedRun& run) {
+Failure ClearAfter(ChildProcess& supervisor, const SupervisedRun& run,
+                   const MemoryShortage& shortage) {
+    const bool hasEnded = HasEnded(supervisor);
     supervisor.Kill();
-    supervisor.Wait();
+    const int status = supervisor.Wait();
     WorkFolder::Discard(run.folder, run.clearOutside);
+    return hasEnded ? DescribeLost(NameOfSupervisor(run), status, shortage)
+                    : Failure{NameOfSupervisor(run) + " stopped responding"};
 }
 
 } // namespace
 
 Message RunSupervised(const SupervisedRun& run) {
+    const MemoryShortage shortage;
     auto ends = Channel::MakePair();
-    if (!ends)
-        return CannotStart(run, errno);
-    std::optional<ChildProcess> supervisor = StartSupervisor(run, ends->second);
+    std::optional<ChildProcess> supervisor =
+        ends ? StartSupervisor(run, ends->second) : std::nullopt;
     if (!supervisor)
-        return CannotStart(run, errno);
+        return Failed(MachineFailure(NameOfSupervisor(run) + " cannot be started", errno));
     const Channel channel = std::move(ends->first);
     ends.reset(); // the supervisor holds the other end alone, so that its end can be seen
 
-    std::string lost;
-    std::optional<Message> result = AwaitResult(channel, run.limits, lost);
-    if (result)
-        return std::move(*result);
-    ClearAfter(*supervisor, run);
-    return Failure(run, lost);
+    std::optional<Message> result = AwaitResult(channel, run.limits);
+    return result ? std::move(*result) : Failed(ClearAfter(*supervisor, run, shortage));
 }
 
 } // namespace standins

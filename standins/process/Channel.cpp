@@ -13,6 +13,12 @@ namespace {
 
 constexpr std::size_t LongestText = 4000;
 
+/// What stands in front of a message's text.
+std::string Head(MessageKind kind, Fault fault) {
+    return {static_cast<char>(kind), static_cast<char>(fault)};
+}
+constexpr std::size_t HeadSize = 2;
+
 /// The room that sendmsg and recvmsg want for one descriptor.
 struct Ancillary {
     alignas(cmsghdr) std::array<char, CMSG_SPACE(sizeof(int))> bytes{};
@@ -37,8 +43,15 @@ std::optional<std::pair<Channel, Channel>> Channel::MakePair() {
 }
 
 bool Channel::Send(MessageKind kind, const std::string& text, int attachment) const {
-    std::string bytes(1, static_cast<char>(kind));
-    bytes.append(text, 0, LongestText);
+    return SendBytes(Head(kind, Fault::Document) + text.substr(0, LongestText), attachment);
+}
+
+bool Channel::Send(const Failure& failure) const {
+    return SendBytes(
+        Head(MessageKind::Failed, failure.fault) + failure.reason.substr(0, LongestText), -1);
+}
+
+bool Channel::SendBytes(std::string bytes, int attachment) const {
     iovec part{bytes.data(), bytes.size()};
     Ancillary ancillary;
     msghdr header{};
@@ -61,7 +74,7 @@ bool Channel::Send(MessageKind kind, const std::string& text, int attachment) co
 }
 
 std::optional<Message> Channel::Receive() const {
-    std::array<char, 1 + LongestText> bytes{};
+    std::array<char, HeadSize + LongestText> bytes{};
     iovec part{bytes.data(), bytes.size()};
     Ancillary ancillary;
     msghdr header{};
@@ -73,11 +86,12 @@ std::optional<Message> Channel::Receive() const {
     do {
         received = recvmsg(m_socket.Get(), &header, MSG_CMSG_CLOEXEC);
     } while (received < 0 && errno == EINTR);
-    if (received <= 0)
+    if (received < static_cast<ssize_t>(HeadSize))
         return std::nullopt;
-    return Message{static_cast<MessageKind>(bytes[0]),
-                   std::string(bytes.data() + 1, static_cast<std::size_t>(received) - 1),
-                   TakeAttachment(header)};
+    return Message{
+        static_cast<MessageKind>(bytes[0]),
+        std::string(bytes.data() + HeadSize, static_cast<std::size_t>(received) - HeadSize),
+        TakeAttachment(header), static_cast<Fault>(bytes[1])};
 }
 
 } // namespace standins

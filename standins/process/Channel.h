@@ -1,6 +1,7 @@
 #pragma once
 
 #include "standins/process/Descriptor.h"
+#include "standins/process/Failure.h"
 
 #include <optional>
 #include <string>
@@ -19,6 +20,7 @@ struct Message {
     MessageKind kind = MessageKind::Failed;
     std::string text; ///< UTF-8
     Descriptor attachment;
+    Fault fault = Fault::Document; ///< what a failure is to be blamed on
 };
 
 /// One end of a connection between the server and the supervisor of an engine run. Messages arrive
@@ -35,12 +37,15 @@ public:
     /// @param attachment a descriptor that the receiver gets a copy of, or -1
     /// @return false when the other end is gone
     bool Send(MessageKind kind, const std::string& text = {}, int attachment = -1) const;
+    bool Send(const Failure& failure) const;
 
     /// Waits for a message.
     /// @return nothing when the other end is gone
     std::optional<Message> Receive() const;
 
 private:
+    bool SendBytes(std::string bytes, int attachment) const;
+
     Descriptor m_socket;
 };
 

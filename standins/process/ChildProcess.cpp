@@ -81,8 +81,10 @@ std::optional<ChildProcess> ChildProcess::Start(const std::string& program,
                                                 const std::vector<std::string>& arguments,
                                                 const std::vector<int>& descriptors) {
     const SpawnDescriptors given(descriptors);
-    if (!given.Whole())
+    if (!given.Whole()) {
+        errno = EMFILE; // whatever the system calls it
         return std::nullopt;
+    }
     std::vector<std::string> words{program};
     words.insert(words.end(), arguments.begin(), arguments.end());
     pid_t id = 0;

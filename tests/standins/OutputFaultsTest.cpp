@@ -52,15 +52,17 @@ TEST_F(OutputFaultsTest, WhatCannotBeWrittenIsTold) {
     fs::create_directory(m_files / "folder/printed.ps");
     ASSERT_EQ(0, mkfifo((m_files / "pipe/printed.ps").c_str(), 0600));
     const std::pair<const char*, const char*> folders[] = {
-        {"folder", "Is a directory."},
-        {"pipe", "File exists."},
-        {"missing", "No such file or directory."},
-        {"printed.docx", "Not a directory."},
+        {"folder", "Is a directory"},
+        {"pipe", "File exists"},
+        {"missing", "No such file or directory"},
+        {"printed.docx", "Not a directory"},
     };
-    for (const auto& [folder, reason] : folders)
+    for (const auto& [folder, reason] : folders) {
         EXPECT_EQ("Word: printed.docx cannot be printed to " +
-                      (m_files / folder / "printed.ps").string() + ": " + reason,
+                      (m_files / folder / "printed.ps").string() + ": " + reason + ".",
                   PrintInto(m_files / folder));
+        EXPECT_EQ(std::string("machine: ") + reason, FailureLeft());
+    }
     EXPECT_TRUE(fs::is_fifo(m_files / "pipe/printed.ps"));
 }
 
@@ -69,7 +71,8 @@ TEST_F(OutputFaultsTest, AFullOrReadOnlyFolderKeepsWhatItHas) {
     NEEDS_MOUNT(fileSystem);
     const fs::path output = m_files.Write("small/printed.ps", "An earlier file");
     m_files.Write("small/other", std::string(std::size_t{12} << 10, 'x')); // all but a page
-    EXPECT_THAT(PrintInto(m_files / "small"), HasSubstr("No space left on device"));
+    EXPECT_NE("", PrintInto(m_files / "small"));
+    EXPECT_EQ("machine: there is no room left in the folder of the output", FailureLeft());
     fileSystem.MakeReadOnly();
     EXPECT_THAT(PrintInto(m_files / "small"), EndsWith("Read-only file system."));
     EXPECT_EQ("An earlier file", ReadBytes(output));
@@ -84,8 +87,10 @@ TEST_F(OutputFaultsTest, NoRoomForTheEngineIsTold) {
     const std::string letter = ReadBytes(Sample("letter.docx"));
     for (const std::size_t size : {0, 1 << 20}) { // the engine's own files, or the document's copy
         const fs::path document = m_files.Write("letter.docx", letter + std::string(size, '\0'));
-        EXPECT_THAT(Open(document), testing::AnyOf(HasSubstr("there is no room left in "),
-                                                   HasSubstr("No space left on device")));
+        EXPECT_NE("", Open(document));
+        EXPECT_THAT(FailureLeft(), StartsWith("machine: "));
+        EXPECT_THAT(FailureLeft(), testing::AnyOf(HasSubstr("there is no room left in "),
+                                                  EndsWith("No space left on device")));
         EXPECT_TRUE(fs::is_empty(m_files / "small"));
     }
     setenv("TMPDIR", m_temporary.Path().c_str(), 1);

@@ -60,6 +60,14 @@ std::string StandInTest::ReasonUnless(bool isDone) {
     return isDone ? std::string() : last;
 }
 
+std::string StandInTest::FailureLeft() {
+    const wxRegKey key(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure");
+    wxString fault;
+    wxString reason;
+    EXPECT_TRUE(key.QueryValue("Fault", fault) && key.QueryValue("Reason", reason));
+    return (fault + ": " + reason).utf8_string();
+}
+
 pid_t StandInTest::AwaitEngine() const {
     std::vector<pid_t> engines;
     Await([&] { return !(engines = EnginesIn(m_temporary.Path())).empty(); });

@@ -32,6 +32,9 @@ protected:
 
     /// The log's last record if something has failed, else nothing. The log is empty afterwards.
     std::string ReasonUnless(bool isDone);
+    /// What the stand-ins have left for the host of their last failure: what is to blame, a colon
+    /// and the reason.
+    static std::string FailureLeft();
 
     /// Waits for an engine at work.
     /// @return 0 when none comes up

@@ -2,6 +2,7 @@
 
 #include "pstools/DistillerBridge.h"
 #include "standins/distiller/bridge/Distill.h"
+#include "standins/module/LastFailure.h"
 #include "standins/module/Text.h"
 
 #include <windows.h>
@@ -39,8 +40,10 @@ DistillResult Convert(const DistillerRequest* record) {
         return DistillResult::BadRequest;
     }
     const DistillOutcome outcome = standins::Distill({*postScript, *pdf, *profile});
-    if (outcome.result != DistillResult::Done)
-        Log(*postScript + " cannot be converted to " + *pdf + ": " + outcome.reason + ".");
+    if (outcome.result != DistillResult::Done) {
+        Log(*postScript + " cannot be converted to " + *pdf + ": " + outcome.failure.reason + ".");
+        standins::LeaveFailure(outcome.failure);
+    }
     return outcome.result;
 }
 

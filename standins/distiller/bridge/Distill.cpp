@@ -12,8 +12,6 @@
 #include "standins/process/NewFile.h"
 #include "standins/process/WorkFolder.h"
 
-#include <system_error>
-
 using namespace std::chrono_literals;
 
 namespace standins {
@@ -25,15 +23,19 @@ struct Failed {
     DistillOutcome outcome;
 };
 
-[[noreturn]] void Fail(DistillResult result, std::string reason) {
-    throw Failed{{result, std::move(reason)}};
+[[noreturn]] void Fail(DistillResult result, Failure failure) {
+    throw Failed{{result, std::move(failure)}};
+}
+
+[[noreturn]] void FailByMachine(DistillResult result, std::string reason) {
+    Fail(result, {std::move(reason), Fault::Machine});
 }
 
 Descriptor OpenPostScript(const std::string& path) {
-    std::wstring failure;
+    Failure failure;
     DocumentFile file = OpenDocumentFile(FromUtf8(path), failure);
     if (!file.descriptor.IsOpen())
-        Fail(DistillResult::NoPostScript, ToUtf8(failure).value_or("it cannot be read"));
+        Fail(DistillResult::NoPostScript, failure);
     return std::move(file.descriptor);
 }
 
@@ -51,30 +53,31 @@ Descriptor OpenProfile(const std::string& name) {
     const std::optional<std::string> path = FindProfile(name);
     if (!path) {
         const std::string folders = Joined(ProfileFolders());
-        Fail(DistillResult::NoProfile, "there is no profile \"" + name + '"' +
-                                           (folders.empty() ? folders : " in " + folders));
+        FailByMachine(DistillResult::NoProfile, "there is no profile \"" + name + '"' +
+                                                    (folders.empty() ? folders : " in " + folders));
     }
-    std::wstring failure;
+    Failure failure;
     DocumentFile file = OpenDocumentFile(FromUtf8(*path), failure);
     if (!file.descriptor.IsOpen())
-        Fail(DistillResult::NoProfile, "the profile " + *path + " cannot be used: " +
-                                           ToUtf8(failure).value_or("it cannot be read"));
+        FailByMachine(DistillResult::NoProfile,
+                      "the profile " + *path + " cannot be used: " + failure.reason);
     return std::move(file.descriptor);
 }
 
 void CheckOutput(int error) {
     if (error != 0)
-        Fail(DistillResult::NoOutput, std::generic_category().message(error));
+        FailByMachine(DistillResult::NoOutput, ErrorWords(error));
 }
 
 SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
                          const Descriptor& profile) {
     const RegistryKey facts = RegistryKey::Open(HKEY_LOCAL_MACHINE, DistillerSettingsKey);
     if (!facts.Text(DistillerEngineValue)) // then the machine counts as having none
-        Fail(DistillResult::NoEngine, "no Ghostscript was found when the stand-in was registered");
+        FailByMachine(DistillResult::NoEngine,
+                      "no Ghostscript was found when the stand-in was registered");
     const std::optional<Ghostscript> ghostscript = FindGhostscript();
     if (!ghostscript)
-        Fail(DistillResult::NoEngine, "Ghostscript is not installed");
+        FailByMachine(DistillResult::NoEngine, "Ghostscript is not installed");
     SupervisedRun run;
     run.engine = "Ghostscript";
     run.supervisor = HelperPath("../StandIns/distiller-engine");
@@ -96,7 +99,7 @@ void MakePdf(const DistillRequest& request) {
     CheckOutput(pdf.Error());
     const Message result = RunSupervised(PrepareRun(postScript, pdf, profile));
     if (result.kind != MessageKind::Done)
-        Fail(DistillResult::NotConverted, result.text);
+        Fail(DistillResult::NotConverted, {result.text, result.fault});
     CheckOutput(pdf.Appear());
 }
 

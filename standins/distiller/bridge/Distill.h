@@ -1,5 +1,7 @@
 #pragma once
 
+#include "standins/process/Failure.h"
+
 #include <string>
 
 namespace standins {
@@ -25,7 +27,7 @@ struct DistillRequest {
 
 struct DistillOutcome {
     DistillResult result = DistillResult::Done;
-    std::string reason; ///< why it failed, as the end of a sentence
+    Failure failure;
 };
 
 /// Lets Ghostscript make the PDF file. It appears when it is whole; a file that had its name before

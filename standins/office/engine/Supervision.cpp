@@ -25,62 +25,82 @@ namespace {
 const std::string EngineName = "LibreOffice";
 constexpr int WantsRestart = 81; // LibreOffice's exit code after it has set up its profile
 
-Message Failure(std::string reason) {
-    return Message{MessageKind::Failed, std::move(reason), Descriptor()};
+std::string TemporaryFolder(const EngineJob& job) {
+    return job.folder.substr(0, job.folder.rfind('/'));
 }
 
 /// Runs LibreOffice until it has ended, once more if it asks for it.
-/// @return why it failed; empty when it ended well
-std::string RunEngine(const EngineJob& job, const WorkFolder& folder, EngineWatch& watch) {
-    const Descriptor input(open("/dev/null", O_RDONLY | O_CLOEXEC));
-    const Descriptor log(open(LogPath(folder).c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
-                              S_IRUSR | S_IWUSR));
+Failure RunEngine(const EngineCommand& command, const WorkFolder& folder, EngineWatch& watch) {
+    const MemoryShortage shortage;
     int status = 0;
     for (int start = 0; start < 2; ++start) {
-        EngineProcess engine(LibreOfficeCommand(folder, job, input.Get(), log.Get()));
+        EngineProcess engine(command);
         if (!engine.IsStarted())
-            return DescribeError("LibreOffice cannot be started", errno);
-        std::string ended = watch.Await(engine, [&] { return folder.Size(); });
+            return MachineFailure(EngineName + " cannot be started", errno);
+        Failure ended = watch.Await(engine, [&] { return folder.Size(); });
         status = engine.End();
-        RemoveSocket(job.folder); // while the folder tells of it, whatever happens to this process
-        if (!ended.empty())
+        // While the folder tells of it, whatever happens to this process.
+        RemoveSocket(folder.Path());
+        if (ended)
             return ended;
         if (!WIFEXITED(status) || WEXITSTATUS(status) != WantsRestart)
             break;
     }
-    return DescribeStatus(EngineName, status);
+    return WithTightLimits(DescribeEngineEnd(EngineName, status, shortage), command);
 }
 
-/// Everything that happens in the work folder; it is gone afterwards.
-Message ConvertInFolder(const EngineJob& job, int document, const Channel& server) {
+/// @param output receives what LibreOffice has made
+Failure MakeOutput(const EngineJob& job, const WorkFolder& folder, const Channel& server,
+                   Descriptor& output) {
+    const Descriptor input(open("/dev/null", O_RDONLY | O_CLOEXEC));
+    const Descriptor log(open(LogPath(folder).c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
+                              S_IRUSR | S_IWUSR));
+    const EngineCommand command = LibreOfficeCommand(folder, job, input.Get(), log.Get());
+    EngineWatch watch(EngineName, job.limits, server);
+    if (Failure failure = RunEngine(command, folder, watch))
+        return failure;
+    output = OpenOutput(OutputPath(folder, job));
+    return output.IsOpen() ? Failure()
+                           : WithTightLimits({DescribeMissingOutput(LogPath(folder))}, command);
+}
+
+/// Everything that happens in the work folder.
+/// @param result receives the document's sum and the output
+Failure ConvertInFolder(const EngineJob& job, int document, const WorkFolder& folder,
+                        const Channel& server, Message& result) {
+    Heartbeat heartbeat(server);
+    DocumentCopy copy = CopyDocument(document, DocumentPath(folder, job), heartbeat);
+    if (copy.error != 0)
+        return MachineFailure("it cannot be copied to " + TemporaryFolder(job), copy.error);
+    result.text = std::move(copy.sha256);
+    if (IsPackageOfAnotherKind(DocumentPath(folder, job), job.extension))
+        return {"it is a document of another application"};
+    if (job.extension == "pub" && !IsPublication(DocumentPath(folder, job)))
+        return {"it is not a publication"};
+    if (!MakeProfile(folder.Path(), job.program))
+        return MachineFailure(EngineName + "'s profile cannot be written", errno);
+    return MakeOutput(job, folder, server, result.attachment);
+}
+
+/// The work folder is gone afterwards.
+Failure Convert(const EngineJob& job, int document, const Channel& server, Message& result) {
     const WorkFolder folder(job.folder);
     if (!folder.IsMade())
-        return Failure(DescribeError("the folder " + job.folder + " cannot be made", errno));
-    Heartbeat heartbeat(server);
-    const DocumentCopy copy = CopyDocument(document, DocumentPath(folder, job), heartbeat);
-    if (copy.error != 0)
-        return Failure(DescribeError("it cannot be copied to " + job.folder, copy.error));
-    if (IsPackageOfAnotherKind(DocumentPath(folder, job), job.extension))
-        return Failure("it is a document of another application");
-    if (job.extension == "pub" && !IsPublication(DocumentPath(folder, job)))
-        return Failure("it is not a publication");
-    if (!MakeProfile(folder.Path(), job.program))
-        return Failure(DescribeError("LibreOffice's profile cannot be written", errno));
-    EngineWatch watch(EngineName, job.limits, server);
-    std::string failure = RunEngine(job, folder, watch);
-    Descriptor output = failure.empty() ? OpenOutput(OutputPath(folder, job)) : Descriptor();
-    if (output.IsOpen())
-        return Message{MessageKind::Done, copy.sha256, std::move(output)};
-    if (IsFull(folder.Path()))
-        return Failure(DescribeFull(job.folder.substr(0, job.folder.rfind('/'))));
-    return Failure(failure.empty() ? DescribeMissingOutput(LogPath(folder)) : failure);
+        return MachineFailure("no folder can be made in " + TemporaryFolder(job), errno);
+    const Failure failure = ConvertInFolder(job, document, folder, server, result);
+    const bool lacksRoom = IsDocumentsFault(failure) && IsFull(folder.Path());
+    return lacksRoom ? NoRoomFailure(TemporaryFolder(job)) : failure;
 }
 
 } // namespace
 
 void Supervise(const EngineJob& job, int document, const Channel& server) {
-    const Message result = ConvertInFolder(job, document, server);
-    server.Send(result.kind, result.text, result.attachment.Get());
+    Message result;
+    const Failure failure = Convert(job, document, server, result);
+    if (failure)
+        server.Send(failure);
+    else
+        server.Send(MessageKind::Done, result.text, result.attachment.Get());
 }
 
 } // namespace standins

@@ -1,7 +1,8 @@
 // Prints what the engine made of a document, its standard input: PostScript on standard output. In
 // a process of its own, since the document is one that anybody may have made. What goes wrong is
-// one line on standard error and exit code 1.
+// one line on standard error, and exit code 1 or CannotWrite.
 
+#include "standins/office/printer/ExitCode.h"
 #include "standins/office/printer/PostScriptWriter.h"
 
 #include <sys/prctl.h>
@@ -70,11 +71,11 @@ int Run(int argc, char** argv) {
     AddOptions(options, job);
     CLI11_PARSE(options, argc, argv);
 
-    const std::string failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);
-    if (failure.empty())
+    const standins::Failure failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);
+    if (!failure)
         return EXIT_SUCCESS;
-    std::fprintf(stderr, "%s\n", failure.c_str());
-    return EXIT_FAILURE;
+    std::fprintf(stderr, "%s\n", failure.reason.c_str());
+    return failure.fault == standins::Fault::Machine ? standins::CannotWrite : EXIT_FAILURE;
 }
 
 } // namespace

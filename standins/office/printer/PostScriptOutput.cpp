@@ -8,7 +8,6 @@
 
 #include <cmath>
 #include <string_view>
-#include <system_error>
 
 namespace standins {
 
@@ -48,15 +47,15 @@ bool PostScriptOutput::IsGood() const {
     return m_error == 0 && cairo_surface_status(m_surface.get()) == CAIRO_STATUS_SUCCESS;
 }
 
-std::string PostScriptOutput::Finish() {
+Failure PostScriptOutput::Finish() {
     ShowSheet();
     cairo_surface_finish(m_surface.get());
     if (m_error == 0)
         m_error = Flush();
     if (m_error != 0)
-        return std::generic_category().message(m_error);
+        return {ErrorWords(m_error), Fault::Machine};
     const cairo_status_t drawn = cairo_surface_status(m_surface.get());
-    return drawn == CAIRO_STATUS_SUCCESS ? std::string() : cairo_status_to_string(drawn);
+    return drawn == CAIRO_STATUS_SUCCESS ? Failure() : Failure{cairo_status_to_string(drawn)};
 }
 
 cairo_status_t PostScriptOutput::Take(void* output, const unsigned char* bytes, unsigned size) {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "standins/office/printer/PrintJob.h"
+#include "standins/process/Failure.h"
 
 #include <cairo.h>
 
@@ -36,8 +37,8 @@ public:
     bool IsGood() const;
 
     /// To be called last.
-    /// @return what went wrong; empty when all is written
-    std::string Finish();
+    /// @return no failure when all is written
+    Failure Finish();
 
 private:
     static cairo_status_t Take(void* output, const unsigned char* bytes, unsigned size);

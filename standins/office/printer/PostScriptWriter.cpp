@@ -24,9 +24,9 @@ std::vector<Sheet> AllSheets(const std::vector<const Sheets*>& groups) {
     return all;
 }
 
-std::string Print(const std::vector<Sheet>& sheets, int postScript, const PrintJob& job) {
+Failure Print(const std::vector<Sheet>& sheets, int postScript, const PrintJob& job) {
     if (sheets.empty())
-        return "it has no pages";
+        return {"it has no pages"};
     PostScriptOutput output(postScript, job);
     const auto count = static_cast<long>(sheets.size());
     for (long i = 0; i < count * job.copies && output.IsGood(); ++i) {
@@ -58,7 +58,7 @@ std::vector<Paragraph> CommentTexts(const std::vector<Comment>& comments) {
 
 } // namespace
 
-std::string WritePostScript(int document, int postScript, const PrintJob& job) {
+Failure WritePostScript(int document, int postScript, const PrintJob& job) {
     if (job.contents == Contents::Outline) {
         const TextSheets outline(ReadOutline(document, job.printHidden));
         return Print(AllSheets({&outline}), postScript, job);

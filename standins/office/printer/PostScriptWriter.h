@@ -1,8 +1,7 @@
 #pragma once
 
 #include "standins/office/printer/PrintJob.h"
-
-#include <string>
+#include "standins/process/Failure.h"
 
 namespace standins {
 
@@ -10,8 +9,8 @@ namespace standins {
 /// @param document open for reading, a regular file: a PDF, or for an outline an OpenDocument
 /// presentation
 /// @param postScript open for writing
-/// @return what went wrong; empty when all is written
+/// @return no failure when all is written
 /// @throws std::runtime_error when the document cannot be read
-std::string WritePostScript(int document, int postScript, const PrintJob& job);
+Failure WritePostScript(int document, int postScript, const PrintJob& job);
 
 } // namespace standins

@@ -1,5 +1,8 @@
 #include "standins/office/server/AutomationObject.h"
 
+#include "standins/module/LastFailure.h"
+#include "standins/module/Text.h"
+
 #include <windows.h>
 
 #include <cwchar>
@@ -40,6 +43,8 @@ HRESULT CheckArguments(const Member& member, const DISPPARAMS& arguments) {
 HRESULT Raise(const Raised& error, const wchar_t* source, EXCEPINFO* exception) {
     // Clients tend to answer with a code alone.
     OutputDebugStringW((std::wstring(source) + L": " + error.description).c_str());
+    LeaveFailure(error.failure ? error.failure
+                               : Failure{ToUtf8(error.description).value_or(std::string())});
     if (exception) {
         *exception = EXCEPINFO{};
         exception->bstrSource = SysAllocString(source);

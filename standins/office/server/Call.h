@@ -1,5 +1,7 @@
 #pragma once
 
+#include "standins/process/Failure.h"
+
 #include <ole2.h>
 
 #include <string>
@@ -9,6 +11,7 @@ namespace standins {
 /// An error that the application raises: the caller gets DISP_E_EXCEPTION with this description.
 struct Raised {
     std::wstring description;
+    Failure failure{}; ///< what the host is told; without a reason, the description
 };
 
 /// A call that does not suit its member.

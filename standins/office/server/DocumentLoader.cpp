@@ -9,12 +9,14 @@ namespace standins {
 
 namespace {
 
-[[noreturn]] void RaiseCannotOpen(const std::wstring& path, const std::wstring& reason) {
-    throw Raised{FileName(path) + L" cannot be opened: " + reason + L"."};
+[[noreturn]] void RaiseCannotOpen(const std::wstring& path, const Failure& failure) {
+    throw Raised{FileName(path) + L" cannot be opened: " + FromUtf8(failure.reason) + L".",
+                 failure};
 }
 
-[[noreturn]] void RaiseCannotLoad(const std::wstring& path, const std::wstring& reason) {
-    RaiseCannotOpen(path, IsPasswordProtected(path) ? L"it is protected by a password" : reason);
+[[noreturn]] void RaiseCannotLoad(const std::wstring& path, const Failure& failure) {
+    const bool isProtected = failure.fault == Fault::Document && IsPasswordProtected(path);
+    RaiseCannotOpen(path, isProtected ? Failure{"it is protected by a password"} : failure);
 }
 
 } // namespace
@@ -23,12 +25,12 @@ const DocumentFormat& FormatOf(const std::wstring& path,
                                const std::vector<DocumentFormat>& formats) {
     const DocumentFormat* format = FindFormat(formats, path);
     if (!format)
-        RaiseCannotOpen(path, L"it is not a document of this application");
+        RaiseCannotOpen(path, {"it is not a document of this application"});
     return *format;
 }
 
 DocumentFile OpenDocument(const std::wstring& path) {
-    std::wstring failure;
+    Failure failure;
     DocumentFile document = OpenDocumentFile(path, failure);
     if (!document.descriptor.IsOpen())
         RaiseCannotOpen(path, failure);
@@ -41,7 +43,7 @@ Export LoadDocument(const std::wstring& path, const DocumentFile& document,
     if (Export known = cache.Find(document, format))
         return known;
     EngineResult result = RunEngine(document, format);
-    if (!result.output.IsOpen())
+    if (result.failure)
         RaiseCannotLoad(path, result.failure);
     Export output = std::make_shared<const Descriptor>(std::move(result.output));
     cache.Add(document, format, result.sha256, output);

@@ -2,7 +2,6 @@
 
 #include "standins/module/ModulePath.h"
 #include "standins/module/SupervisedRun.h"
-#include "standins/module/Text.h"
 #include "standins/office/UserInstallation.h"
 #include "standins/office/server/Settings.h"
 #include "standins/process/WorkFolder.h"
@@ -18,7 +17,7 @@ constexpr const char* FolderKind = "office";
 EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format) {
     const std::string program = ReadEnginePath();
     if (program.empty())
-        return {Descriptor(), {}, L"LibreOffice is not installed"};
+        return {Descriptor(), {}, {"LibreOffice is not installed", Fault::Machine}};
     SupervisedRun run;
     run.engine = "LibreOffice";
     run.supervisor = HelperPath("office-engine");
@@ -35,7 +34,7 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
 
     Message result = RunSupervised(run);
     if (result.kind != MessageKind::Done || !result.attachment.IsOpen())
-        return {Descriptor(), {}, FromUtf8(result.text)};
+        return {Descriptor(), {}, {result.text, result.fault}};
     return {std::move(result.attachment), result.text, {}};
 }
 

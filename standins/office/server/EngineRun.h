@@ -2,6 +2,7 @@
 
 #include "standins/module/DocumentFile.h"
 #include "standins/office/server/DocumentFormat.h"
+#include "standins/process/Failure.h"
 
 #include <string>
 
@@ -9,9 +10,9 @@ namespace standins {
 
 /// What came of an engine run.
 struct EngineResult {
-    Descriptor output; ///< what LibreOffice made; closed when it failed
+    Descriptor output; ///< what LibreOffice made
     std::string sha256;
-    std::wstring failure; ///< why it failed, as the end of a sentence
+    Failure failure;
 };
 
 /// Lets LibreOffice convert a document, under a supervisor of its own, and returns when nothing of

@@ -2,12 +2,14 @@
 
 #include "standins/module/ModulePath.h"
 #include "standins/module/Text.h"
+#include "standins/office/printer/ExitCode.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/Settings.h"
 #include "standins/process/ChildProcess.h"
 #include "standins/process/Clocks.h"
 #include "standins/process/FileBytes.h"
 #include "standins/process/NewFile.h"
+#include "standins/process/ProcessEnd.h"
 #include "standins/process/ProcessTable.h"
 
 #include <glib.h>
@@ -17,19 +19,21 @@
 #include <sys/wait.h>
 
 #include <cerrno>
-#include <system_error>
 
 namespace standins {
 
 namespace {
 
-[[noreturn]] void RaiseCannotWrite(const PrintRequest& request, const std::string& reason) {
+const std::string WriterName = "the PostScript writer";
+
+[[noreturn]] void RaiseCannotWrite(const PrintRequest& request, const Failure& failure) {
     throw Raised{request.title + L" cannot be printed to " + request.output + L": " +
-                 FromUtf8(reason) + L"."};
+                     FromUtf8(failure.reason) + L".",
+                 failure};
 }
 
 [[noreturn]] void RaiseCannotWrite(const PrintRequest& request, int error) {
-    RaiseCannotWrite(request, std::generic_category().message(error));
+    RaiseCannotWrite(request, {ErrorWords(error), Fault::Machine});
 }
 
 std::vector<std::string> WriterArguments(const PrintRequest& request) {
@@ -75,21 +79,26 @@ std::string LastLine(int file) {
     return text.substr(text.rfind('\n') + 1);
 }
 
-/// @return why it failed; empty when all is written
-std::string WritePostScript(const PrintRequest& request, int output) {
+/// Why the writer has failed, or not, once it has ended by itself.
+/// @param messages what it has said
+Failure DescribeWriter(int status, int messages, const MemoryShortage& shortage) {
+    const std::string reason = WIFEXITED(status) && status != 0 ? LastLine(messages) : "";
+    if (reason.empty())
+        return DescribeEnd(WriterName, status, shortage);
+    return {reason, WEXITSTATUS(status) == CannotWrite ? Fault::Machine : Fault::Document};
+}
+
+Failure WritePostScript(const PrintRequest& request, int output) {
+    const MemoryShortage shortage;
     const Descriptor messages(memfd_create("messages", MFD_CLOEXEC));
     std::optional<ChildProcess> writer =
         ChildProcess::Start(HelperPath("pdf-to-ps"), WriterArguments(request),
                             {request.pages->Get(), output, messages.Get()});
     if (!writer)
-        return "the PostScript writer cannot be started: " + std::generic_category().message(errno);
+        return MachineFailure(WriterName + " cannot be started", errno);
     if (!AwaitWriter(*writer, output))
-        return "the PostScript writer took too long";
-    const int status = writer->Wait();
-    if (WIFEXITED(status) && WEXITSTATUS(status) == 0)
-        return {};
-    const std::string reason = LastLine(messages.Get());
-    return reason.empty() ? "the PostScript writer ended unexpectedly" : reason;
+        return {WriterName + " took too long"};
+    return DescribeWriter(writer->Wait(), messages.Get(), shortage);
 }
 
 } // namespace
@@ -104,13 +113,13 @@ int CheckCopies(long copies) {
 void PrintToFile(const PrintRequest& request) {
     const std::optional<std::string> path = ToUtf8(request.output);
     if (!path || path->empty() || path->find('\0') != std::string::npos)
-        RaiseCannotWrite(request, "no file can have this name");
+        RaiseCannotWrite(request, {"no file can have this name"});
     NewFile file(*path);
     if (file.Get() < 0)
         RaiseCannotWrite(request, file.Error());
-    const std::string failure = WritePostScript(request, file.Get());
-    if (!failure.empty())
-        RaiseCannotWrite(request, failure);
+    if (const Failure failure = WritePostScript(request, file.Get()))
+        RaiseCannotWrite(request,
+                         IsFull(file.Get()) ? NoRoomFailure("the folder of the output") : failure);
     if (const int error = file.Appear())
         RaiseCannotWrite(request, error);
 }
