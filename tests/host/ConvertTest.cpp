@@ -81,7 +81,7 @@ TEST_F(ConvertTest, AnOutputThatCannotBePutInPlaceIsAFailure) {
     fs::create_directories(m_folder / "out" / "a.ps");
     m_folder.Write("a.doc", "script");
     const RunResult run = Convert({"a.doc"});
-    EXPECT_EQ(run.exitCode, 1);
+    EXPECT_EQ(run.exitCode, 2);
     EXPECT_EQ(run.Records("document").at(0)["code"], -1003);
     EXPECT_EQ(Outputs(), Names{"a.ps"}) << "nothing beside the folder in the way";
 }

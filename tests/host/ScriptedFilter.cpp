@@ -10,6 +10,7 @@
 
 #include <wx/file.h>
 #include <wx/filename.h>
+#include <wx/msw/registry.h>
 #include <wx/tokenzr.h>
 #include <wx/utils.h>
 #include <wx/xml/xml.h>
@@ -39,6 +40,34 @@ Script ReadScript(const wxString& path) {
 int Number(const Script& script, const wxString& name) {
     const auto found = script.find(name);
     return found == script.end() ? 0 : wxAtoi(found->second);
+}
+
+/// Whether what the script asks for happens: with a line "once=FILE", only as long as there is no
+/// such file, which is there then.
+bool IsDue(Script& script) {
+    const wxString file = script["once"];
+    const bool due = file.empty() || !wxFileExists(file);
+    if (due && !file.empty())
+        wxFile(file, wxFile::write);
+    return due;
+}
+
+/// Leaves word of a failure as an engine does.
+void LeaveFailure(Script& script) {
+    if (script["fault"].empty())
+        return;
+    wxRegKey key(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure");
+    key.Create();
+    key.SetValue("Fault", script["fault"]);
+    key.SetValue("Reason", script["reason"]);
+}
+
+int Fail(Script& script, const wxString& operation) {
+    const int code = Number(script, operation);
+    if (code == 0 || !IsDue(script))
+        return 0;
+    LeaveFailure(script);
+    return code;
 }
 
 /// A node's children come before anything deeper.
@@ -88,7 +117,8 @@ public:
         int code = 0;
         for (const wxString& file : files) {
             Note("Screen " + wxFileName(file).GetFullName());
-            code = Number(ReadScript(file), "screen");
+            Script script = ReadScript(file);
+            code = Fail(script, "screen");
             if (code == 0)
                 items.Add(ItemFor(file).release());
         }
@@ -114,12 +144,14 @@ public:
             std::abort();
         if (!script["stop"].empty())
             System::StopThisProcess();
+        if (!script["end"].empty() && IsDue(script))
+            System::EndThisProcess();
         if (script["output"] != "none")
             wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_told);
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
             wxFile(outputFolder + '/' + wxFileName(outputName).GetName() + script["companion"],
                    wxFile::write);
-        return Number(script, "convert");
+        return Fail(script, "convert");
     }
 
     bool IsReady() override { return !wxGetEnv("SCRIPTED_FILTER_UNREADY", nullptr); }

@@ -21,4 +21,7 @@ constexpr char PowerPointAdvice[] = "libreoffice-impress-nogui";
 /// Has this process do nothing any more, as one that hangs for good.
 void StopThisProcess();
 
+/// Ends this process as somebody does who wants it gone.
+void EndThisProcess();
+
 } // namespace System

@@ -83,6 +83,19 @@ TEST_F(WorkersTest, OneThatEndsOrStopsFailsItsDocumentOnly) {
     }
 }
 
+TEST_F(WorkersTest, OneThatSomebodyEndsHasItsDocumentTriedOnceMore) {
+    m_folder.Write("a.doc", "end=1\nonce=" + Place("a.ended"));
+    m_folder.Write("b.doc", "end=1");
+    m_folder.Write("c.doc", "script");
+    const RunResult run = Convert({"a.doc", "b.doc", "c.doc"}, {"-j", "2"});
+    EXPECT_EQ(run.exitCode, 2) << run.err;
+    EXPECT_EQ(States(run), (Names{"converted", "failed", "converted"}));
+    const json failed = run.Records("document").at(1);
+    EXPECT_EQ(failed["fault"], "machine");
+    EXPECT_NE(failed["reason"].get<std::string>().find("second try"), std::string::npos) << failed;
+    EXPECT_EQ(Outputs(), (Names{"a.ps", "c.ps"}));
+}
+
 TEST_F(WorkersTest, AnInterruptionFinishesWhatIsUnderWay) {
     for (const char* name : {"a.doc", "b.doc"})
         WriteWaiting(name);

@@ -1,6 +1,7 @@
 #include "host/program/documents/Conversion.h"
 
 #include "host/program/PathText.h"
+#include "host/program/documents/FilterCall.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
 #include "host/program/machine/MissingParts.h"
@@ -15,25 +16,31 @@ namespace fs = std::filesystem;
 
 namespace {
 
-void Fail(int code, const wxString& reason, const Filter& filter, Outcome& outcome) {
+void Fail(int code, const wxString& reason, const Filter& filter, Outcome& outcome,
+          bool machineAtFault = false) {
     outcome.state = State::Failed;
     outcome.code = code;
     outcome.text = filter.ErrorText(code);
     outcome.reason = reason;
-    outcome.machineAtFault = IsMachineCode(code);
+    outcome.machineAtFault = machineAtFault || IsMachineCode(code);
 }
 
 /// What the host can see of why the filter failed.
-void Explain(const JobItem& item, const OutputFolder& outputFolder, Outcome& outcome) {
+/// @param failure what its engine has told
+void Explain(const JobItem& item, const OutputFolder& outputFolder,
+             const std::optional<EngineFailure>& failure, Outcome& outcome) {
     const std::optional<MissingPart> pdfMaker =
         outcome.code == Result::PdfConversionFailed ? FindMissingPdfMaker() : std::nullopt;
     if (outcome.machineAtFault) {
         outcome.reason = MachineReason(wxFileName(item.fileName).GetExt());
-    } else if (outputFolder.IsFull()) {
-        outcome.reason = "there is no space left for the output or for temporary files";
-        outcome.machineAtFault = true;
     } else if (pdfMaker) {
         outcome.reason = pdfMaker->Text();
+        outcome.machineAtFault = true;
+    } else if (failure) {
+        outcome.reason = failure->reason;
+        outcome.machineAtFault = failure->fault != EngineFailure::Fault::Document;
+    } else if (outputFolder.IsFull()) {
+        outcome.reason = "there is no space left for the output or for temporary files";
         outcome.machineAtFault = true;
     } else if (outcome.code == Result::PrintFailed) {
         outcome.reason = "its application could not open or print it: it may be damaged or "
@@ -59,23 +66,25 @@ bool DeliverAll(const Workplace& workplace, const wxString& outputName, const wx
 }
 
 /// Runs the filter in the workplace and takes over what it made.
+/// @param failure receives what its engine has told, when it has failed
 void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const wxString& baseName,
-               ProgressSink& progress, Outcome& outcome) {
+               ProgressSink& progress, Outcome& outcome, std::optional<EngineFailure>& failure) {
     wxString outputName;
-    const int code = [&] {
+    FilterAnswer answer = CallFilter(Shown(outcome.input.filename()), [&] {
         const ConversionTurn turn;
         return screened.filter->Convert(
             *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
-    }();
-    if (code != Result::Success)
-        return Fail(code, {}, *screened.filter, outcome);
+    });
+    failure = std::move(answer.failure);
+    if (answer.code != Result::Success)
+        return Fail(answer.code, {}, *screened.filter, outcome);
     std::error_code error;
     if (!fs::is_regular_file(workplace.Path() / FromText(outputName), error))
         return Fail(Result::OutputFileNotFound, "the filter reported success", *screened.filter,
                     outcome);
     wxString fault;
     if (!DeliverAll(workplace, outputName, baseName, fault))
-        return Fail(ConversionFailed, fault, *screened.filter, outcome);
+        return Fail(ConversionFailed, fault, *screened.filter, outcome, true);
     outcome.state = State::Converted;
     outcome.output =
         workplace.Path().parent_path() / FromText(baseName + '.' + wxFileName(outputName).GetExt());
@@ -85,13 +94,14 @@ Outcome Convert(const ScreenedInput& screened, const wxString& baseName,
                 const OutputFolder& outputFolder, ProgressSink& progress) {
     Outcome outcome = screened.outcome;
     wxString fault;
+    std::optional<EngineFailure> failure;
     const std::optional<Workplace> workplace = Workplace::Create(outputFolder.Path(), fault);
     if (workplace)
-        RunFilter(screened, *workplace, baseName, progress, outcome);
+        RunFilter(screened, *workplace, baseName, progress, outcome, failure);
     else
-        Fail(ConversionFailed, fault, *screened.filter, outcome);
+        Fail(ConversionFailed, fault, *screened.filter, outcome, true);
     if (outcome.state == State::Failed && outcome.reason.empty())
-        Explain(*screened.item, outputFolder, outcome);
+        Explain(*screened.item, outputFolder, failure, outcome);
     return outcome;
 }
 

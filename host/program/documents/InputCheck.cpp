@@ -1,6 +1,7 @@
 #include "host/program/documents/InputCheck.h"
 
 #include "host/program/PathText.h"
+#include "host/program/documents/Outcome.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>
@@ -56,6 +57,22 @@ std::string FirstBytes(const fs::path& file) {
     return {bytes, static_cast<std::size_t>(stream.gcount())};
 }
 
+Refusal Unreadable(const std::error_code& error) {
+    const wxString reason = "it cannot be read: " + Because(error);
+    if (error == std::errc::too_many_files_open ||
+        error == std::errc::too_many_files_open_in_system ||
+        error == std::errc::not_enough_memory || error == std::errc::io_error)
+        return {ConversionFailed, reason, true};
+    return {Result::InputFileNotFound, reason};
+}
+
+wxString CouldNotOpen(const wxString& extension, const wxString& toldByEngine) {
+    return "its application could not open it: " +
+           (toldByEngine.empty()
+                ? "it is damaged, or no ." + extension + " document; the log says more"
+                : toldByEngine);
+}
+
 } // namespace
 
 std::optional<Refusal> CheckInput(const fs::path& file) {
@@ -73,24 +90,24 @@ std::optional<Refusal> CheckInput(const fs::path& file) {
                        "it is " + KindOf(status.type())};
     errno = 0;
     if (!std::ifstream(file, std::ios::binary).is_open())
-        return Refusal{Result::InputFileNotFound,
-                       "it cannot be read: " + Because({errno, std::generic_category()})};
+        return Unreadable({errno, std::generic_category()});
     if (fs::file_size(file, error) == 0 && !error)
         return Refusal{Result::InvalidInputFile, "the file is empty"};
     return std::nullopt;
 }
 
-wxString DescribeInvalid(const fs::path& file) {
+wxString DescribeInvalid(const fs::path& file, const wxString& toldByEngine) {
     const std::string beginning = FirstBytes(file);
     const wxString extension = wxFileName(ToText(file).value_or(wxString())).GetExt().Lower();
     const bool openXml = extension.EndsWith("x");
     if (BeginsWith(beginning, Zip) && extension == "pub")
         return "it is a ZIP package, not a publication";
     if (BeginsWith(beginning, Zip))
-        return openXml ? "its application could not open it: it is damaged, or no ." + extension +
-                             " document; the log says more"
+        return openXml ? CouldNotOpen(extension, toldByEngine)
                        : wxString::Format("it is a ZIP package: probably a .%sx renamed to .%s",
                                           extension, extension);
+    if (BeginsWith(beginning, CompoundFile) && !toldByEngine.empty())
+        return CouldNotOpen(extension, toldByEngine);
     if (BeginsWith(beginning, CompoundFile))
         return openXml
                    ? "it is protected by a password, or an older document renamed to ." + extension

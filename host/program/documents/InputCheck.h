@@ -9,6 +9,7 @@
 struct Refusal {
     int code = 0; ///< a result code
     wxString reason;
+    bool machineAtFault = false; ///< another time it may be one
 };
 
 /// Looks whether a filter can be given the file at all: it must be there, a file, readable, not
@@ -17,4 +18,5 @@ std::optional<Refusal> CheckInput(const std::filesystem::path& file);
 
 /// What a person may want to know of a file that its filter found invalid: what it is instead.
 /// @param file readable, with an extension of Office documents
-wxString DescribeInvalid(const std::filesystem::path& file);
+/// @param toldByEngine why the application's engine could not open it; may be empty
+wxString DescribeInvalid(const std::filesystem::path& file, const wxString& toldByEngine);

@@ -1,6 +1,7 @@
 #include "host/program/documents/Screening.h"
 
 #include "host/program/PathText.h"
+#include "host/program/documents/FilterCall.h"
 #include "host/program/documents/InputCheck.h"
 #include "host/program/machine/MissingParts.h"
 #include "plugin/ResultCodes.h"
@@ -13,17 +14,23 @@ wxString UnclaimedReason(const wxString& extension) {
 }
 
 void Refuse(const FilterSet& filters, const Refusal& refusal, Outcome& outcome) {
-    outcome.state = State::Refused;
+    outcome.state = refusal.machineAtFault ? State::Failed : State::Refused;
     outcome.code = refusal.code;
     outcome.text = filters.ErrorText(refusal.code);
     outcome.reason = refusal.reason;
-    outcome.machineAtFault = IsMachineCode(refusal.code);
+    outcome.machineAtFault = refusal.machineAtFault || IsMachineCode(refusal.code);
 }
 
-wxString ReasonFor(int code, const Input& input) {
-    if (IsMachineCode(code))
-        return MachineReason(ExtensionOf(input));
-    return code == Result::InvalidInputFile ? DescribeInvalid(input.full) : wxString();
+/// Why the filter did not accept the file.
+Refusal RefusalFor(const FilterAnswer& answer, const Input& input) {
+    if (IsMachineCode(answer.code))
+        return {answer.code, MachineReason(ExtensionOf(input))};
+    const EngineFailure failure = answer.failure.value_or(EngineFailure());
+    if (failure.fault != EngineFailure::Fault::Document) // whatever the document is
+        return {ConversionFailed, failure.reason, true};
+    if (answer.code == Result::InvalidInputFile)
+        return {answer.code, DescribeInvalid(input.full, failure.reason)};
+    return {answer.code, failure.reason};
 }
 
 } // namespace
@@ -44,14 +51,17 @@ ScreenedInput Screen(const FilterSet& filters, const Input& input) {
     } else if (!filter->IsReady()) { // which some of its screening does not look at
         Refuse(filters, {Result::NotInitialized, MachineReason(extension)}, screened.outcome);
     } else {
-        Filter::Screened answer = filter->Screen(*ToText(input.full));
-        if (!answer.item) {
-            Refuse(filters, {answer.code, ReasonFor(answer.code, input)}, screened.outcome);
+        const FilterAnswer answer = CallFilter(Shown(input.given.filename()), [&] {
+            Filter::Screened result = filter->Screen(*ToText(input.full));
+            screened.item = std::move(result.item);
+            return result.code;
+        });
+        if (!screened.item) {
+            Refuse(filters, RefusalFor(answer, input), screened.outcome);
             return screened;
         }
         screened.outcome.text = filter->ErrorText(answer.code);
         screened.filter = filter;
-        screened.item = std::move(answer.item);
     }
     return screened;
 }

@@ -116,7 +116,7 @@ void ChildProcess::Kill() const {
         kill(static_cast<pid_t>(m_process), SIGKILL);
 }
 
-wxString ChildProcess::Wait() {
+ProcessEnd ChildProcess::Wait() {
     int status = 0;
     pid_t waited = -1;
     while (m_process != None && waited < 0) {
@@ -125,10 +125,11 @@ wxString ChildProcess::Wait() {
             break;
     }
     m_process = None;
-    if (WIFSIGNALED(status))
-        return wxString::Format("ended by signal %d, %s", WTERMSIG(status),
-                                strsignal(WTERMSIG(status)));
-    return wxString::Format("ended with exit code %d", WEXITSTATUS(status));
+    if (!WIFSIGNALED(status))
+        return {wxString::Format("ended with exit code %d", WEXITSTATUS(status))};
+    const int signal = WTERMSIG(status);
+    return {wxString::Format("ended by signal %d, %s", signal, strsignal(signal)),
+            signal == SIGKILL}; // it does not end by polite ones
 }
 
 LineChannel TakeStandardStreams() {

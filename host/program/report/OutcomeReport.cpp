@@ -33,6 +33,17 @@ wxString LineOf(const Outcome& outcome) {
     return line;
 }
 
+bool IsUnfortunate(const Outcome& outcome) {
+    return outcome.state == State::Refused || outcome.state == State::Failed;
+}
+
+/// What is to blame; null when nothing is.
+Json FaultOf(const Outcome& outcome) {
+    if (outcome.machineAtFault)
+        return "machine";
+    return IsUnfortunate(outcome) ? Json("document") : Json();
+}
+
 /// The outcome as a record of type "document".
 Json RecordOf(const Outcome& outcome) {
     Json record = {{"type", "document"}, {"input", outcome.input.u8string()}};
@@ -43,6 +54,7 @@ Json RecordOf(const Outcome& outcome) {
     record["code"] = outcome.code;
     record["text"] = JsonText(outcome.text);
     record["reason"] = JsonText(outcome.reason);
+    record["fault"] = FaultOf(outcome);
     record["seconds"] =
         outcome.seconds ? Json(std::round(*outcome.seconds * 1000.0) / 1000.0) : Json();
     return record;
@@ -77,9 +89,7 @@ ExitCode Verdict(const std::vector<Outcome>& outcomes) {
         return ExitCode::Interrupted;
     if (any([](const Outcome& outcome) { return outcome.machineAtFault; }))
         return ExitCode::MachineAtFault;
-    if (any([](const Outcome& outcome) {
-            return outcome.state == State::Refused || outcome.state == State::Failed;
-        }))
+    if (any(IsUnfortunate))
         return ExitCode::DocumentsAtFault;
     return ExitCode::Done;
 }

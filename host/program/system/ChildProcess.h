@@ -9,6 +9,12 @@
 #include <string>
 #include <vector>
 
+/// How a process came to its end.
+struct ProcessEnd {
+    wxString text;            ///< for people
+    bool fromOutside = false; ///< by somebody who wanted it to
+};
+
 /// Another process of this program, which is talked to by its stdin and stdout. It shares this
 /// one's stderr, and does not outlive this one.
 class ChildProcess {
@@ -29,8 +35,7 @@ public:
     void Kill() const;
 
     /// Waits for the end.
-    /// @return how it came, for people
-    wxString Wait();
+    ProcessEnd Wait();
 
 private:
     ChildProcess(std::intptr_t process, LineChannel channel)

@@ -152,7 +152,8 @@ void ChildProcess::Kill() const {
         TerminateProcess(reinterpret_cast<HANDLE>(m_process), 1);
 }
 
-wxString ChildProcess::Wait() {
+ProcessEnd ChildProcess::Wait() {
+    constexpr DWORD EndedByTaskManager = 1; // and by taskkill; this program never ends so itself
     DWORD code = 0;
     if (m_process != None) {
         HANDLE process = reinterpret_cast<HANDLE>(m_process);
@@ -161,7 +162,7 @@ wxString ChildProcess::Wait() {
         CloseHandle(process);
         m_process = None;
     }
-    return wxString::Format("ended with exit code %lu", code);
+    return {wxString::Format("ended with exit code %lu", code), code == EndedByTaskManager};
 }
 
 LineChannel TakeStandardStreams() {

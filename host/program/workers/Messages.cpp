@@ -2,7 +2,9 @@
 
 #include "host/program/PathText.h"
 
+#include <limits>
 #include <nlohmann/json.hpp>
+#include <stdexcept>
 
 namespace {
 
@@ -14,9 +16,25 @@ std::optional<Message> Decode(const std::string& line, Make make) {
     try {
         const json message = json::parse(line);
         return make(message);
-    } catch (const json::exception&) {
+    } catch (const std::exception&) {
         return std::nullopt;
     }
+}
+
+/// A whole number. Nothing else is taken for one: no fraction cut off, no truth counted.
+int NumberOf(const json& value) {
+    const auto number = value.get<double>(); // exact where it matters
+    if (!value.is_number_integer() || number < std::numeric_limits<int>::min() ||
+        number > std::numeric_limits<int>::max())
+        throw std::invalid_argument("no whole number");
+    return static_cast<int>(number);
+}
+
+State StateOf(const json& value) {
+    const int number = NumberOf(value);
+    if (number < 0 || number > static_cast<int>(State::NotConverted))
+        throw std::invalid_argument("no state");
+    return static_cast<State>(number);
 }
 
 wxString TextOf(const json& value) {
@@ -38,8 +56,8 @@ Outcome OutcomeOf(const json& value) {
     Outcome outcome;
     outcome.input = PathOf(value.at("input"));
     outcome.output = PathOf(value.at("output"));
-    outcome.state = static_cast<State>(value.at("state").get<int>());
-    outcome.code = value.at("code");
+    outcome.state = StateOf(value.at("state"));
+    outcome.code = NumberOf(value.at("code"));
     outcome.text = TextOf(value.at("text"));
     outcome.reason = TextOf(value.at("reason"));
     outcome.machineAtFault = value.at("machineAtFault");
@@ -88,7 +106,7 @@ std::optional<Assignment> DecodeAssignment(const std::string& line) {
 
 std::optional<News> DecodeNews(const std::string& line) {
     return Decode<News>(line, [](const json& message) {
-        News news{TextOf(message.at("step")), message.at("percent"), std::nullopt};
+        News news{TextOf(message.at("step")), NumberOf(message.at("percent")), std::nullopt};
         if (message.contains("outcome"))
             news.outcome = OutcomeOf(message["outcome"]);
         return news;

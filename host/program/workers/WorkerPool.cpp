@@ -85,7 +85,8 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
         Fail(number, "no process could be started for it: " + fault, true);
         return false;
     }
-    worker.proven = worker.silent = false;
+    worker.proven = false;
+    worker.ending = nullptr;
     worker.heard = Clock::now();
     LineChannel& channel = worker.process->Channel();
     channel.Write(Encode(m_facts));
@@ -100,9 +101,13 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
 void WorkerPool::OnLine(std::size_t number, const std::string& line) {
     Worker& worker = m_workers[number];
     worker.heard = Clock::now();
-    std::optional<News> news = DecodeNews(line);
-    if (!news || !worker.assignment)
+    if (line == SignOfLife || !worker.assignment)
         return;
+    std::optional<News> news = DecodeNews(line);
+    if (!news) {
+        End(worker, "answered what makes no sense, and was ended");
+        return;
+    }
     worker.begun = true;
     if (news->outcome) {
         worker.proven = true;
@@ -117,20 +122,26 @@ void WorkerPool::OnEnd(std::size_t number) {
     Worker& worker = m_workers[number];
     worker.reader.join();
     worker.process->Kill(); // it may only have closed its side
-    const wxString end = worker.process->Wait();
+    const ProcessEnd end = worker.process->Wait();
     worker.process.reset();
     SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-        << "A worker has " << end << (worker.assignment ? " with a document under way" : "");
+        << "A worker has " << end.text << (worker.assignment ? " with a document under way" : "");
     Workplace::RemoveAbandoned(m_facts.outputFolder);
     if (!worker.assignment)
         return;
-    if (worker.proven && !worker.begun) // it ended before the document reached it
+    const bool fromOutside = end.fromOutside && !worker.ending;
+    if (worker.proven && !worker.begun) { // it ended before the document reached it
         Assign(number, *worker.assignment);
-    else
+    } else if (fromOutside && !worker.triedAgain) {
+        worker.triedAgain = true;
+        Assign(number, *worker.assignment);
+    } else {
         Fail(number,
              "the process that converted it " +
-                 (worker.silent ? wxString("gave no sign of life any more and was ended") : end),
-             false);
+                 (worker.ending ? wxString(worker.ending) : end.text) +
+                 (fromOutside ? ", at the second try too" : ""),
+             fromOutside);
+    }
     GiveWork(number);
 }
 
@@ -139,6 +150,16 @@ void WorkerPool::Finish(std::size_t number, Outcome outcome) {
     ++m_done;
     (*m_deliver)(*worker.assignment, std::move(outcome));
     worker.assignment.reset();
+    worker.triedAgain = false;
+}
+
+/// Ends a worker; its reader will say so.
+/// @param reason why, as what it has done
+void WorkerPool::End(Worker& worker, const char* reason) {
+    if (worker.ending)
+        return;
+    worker.ending = reason;
+    worker.process->Kill();
 }
 
 void WorkerPool::Fail(std::size_t number, const wxString& reason, bool machineAtFault) {
@@ -166,7 +187,7 @@ void WorkerPool::ShowProgress(Worker& worker, const News& news) {
                      wxString::Format("%zu of %zu  ", m_done, m_assignments->size()) + names));
 }
 
-/// Ends the workers that have been silent for too long; their readers will say so.
+/// Ends the workers that have been silent for too long.
 void WorkerPool::EndTheSilent() {
     const Clock::time_point now = Clock::now();
     // Has this process been stopped, and its workers with it, they get their time anew.
@@ -175,10 +196,8 @@ void WorkerPool::EndTheSilent() {
     for (Worker& worker : m_workers) {
         if (hasSlept)
             worker.heard = now;
-        if (worker.process && !worker.silent && now - worker.heard > m_patience) {
-            worker.silent = true;
-            worker.process->Kill();
-        }
+        if (worker.process && now - worker.heard > m_patience)
+            End(worker, "gave no sign of life any more and was ended");
     }
 }
 

@@ -14,7 +14,8 @@
 
 /// Converts documents side by side, each worker in a process of its own. A worker serves one
 /// document after the other; one that ends, or gives no sign of life any more, fails the document
-/// that it had, and is replaced.
+/// that it had, and is replaced. One that somebody has ended fails none: its document is tried once
+/// more.
 class WorkerPool {
 public:
     /// @param arguments that make this program a worker
@@ -41,8 +42,9 @@ private:
         std::optional<std::size_t> assignment;
         std::optional<Progress> progress;
         bool begun = false;                          ///< with the assignment
+        bool triedAgain = false;                     ///< the assignment
         bool proven = false;                         ///< has brought a document to an end
-        bool silent = false;                         ///< was ended for that
+        const char* ending = nullptr;                ///< why it was ended from here
         std::chrono::steady_clock::time_point heard; ///< its last sign of life
     };
     /// A line from a worker, or nothing when it has ended.
@@ -54,10 +56,10 @@ private:
     void GiveWork(std::size_t number);
     void Assign(std::size_t number, std::size_t assignment);
     bool EnsureProcess(std::size_t number);
-    void OnNews(std::size_t number, News news);
     void OnLine(std::size_t number, const std::string& line);
     void OnEnd(std::size_t number);
     void Finish(std::size_t number, Outcome outcome);
+    static void End(Worker& worker, const char* reason);
     void Fail(std::size_t number, const wxString& reason, bool machineAtFault);
     void ShowProgress(Worker& worker, const News& news);
     void EndTheSilent();

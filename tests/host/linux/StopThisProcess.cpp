@@ -5,3 +5,7 @@
 void System::StopThisProcess() {
     std::raise(SIGSTOP);
 }
+
+void System::EndThisProcess() {
+    std::raise(SIGKILL);
+}

@@ -19,3 +19,7 @@ void System::StopThisProcess() {
     CloseHandle(threads);
     SuspendThread(GetCurrentThread());
 }
+
+void System::EndThisProcess() {
+    TerminateProcess(GetCurrentProcess(), 1);
+}

@@ -1,0 +1,20 @@
+#pragma once
+
+#include "host/program/machine/EngineFailure.h"
+
+#include <wx/string.h>
+
+#include <functional>
+#include <optional>
+
+/// What a filter has answered.
+struct FilterAnswer {
+    int code = 0;
+    std::optional<EngineFailure> failure; ///< what is known beside the code when it is none of 0
+};
+
+/// Has a filter work on a document: once more when somebody has ended its engine meanwhile, which
+/// says nothing of the document.
+/// @param document its name, for the log
+/// @param work calls the filter and answers its code
+FilterAnswer CallFilter(const wxString& document, const std::function<int()>& work);

@@ -1,0 +1,42 @@
+#include "host/program/workers/Messages.h"
+
+#include <gtest/gtest.h>
+
+#include <nlohmann/json.hpp>
+
+namespace {
+
+using nlohmann::json;
+
+TEST(MessagesTest, NewsComeAcrossAsTheyWere) {
+    News news{L"Printing \u2026", 85, Outcome()};
+    news.outcome->state = State::Failed;
+    news.outcome->code = -1007;
+    news.outcome->machineAtFault = true;
+    const std::optional<News> read = DecodeNews(Encode(news));
+    ASSERT_TRUE(read && read->outcome);
+    EXPECT_EQ(read->step, news.step);
+    EXPECT_EQ(read->percent, 85);
+    EXPECT_EQ(read->outcome->state, State::Failed);
+    EXPECT_EQ(read->outcome->code, -1007);
+    EXPECT_TRUE(read->outcome->machineAtFault);
+}
+
+TEST(MessagesTest, WhatIsNoSuchMessageIsRefused) {
+    News news{"Printing", 85, Outcome()};
+    const json whole = json::parse(Encode(news));
+    for (const char* number : {"1.5", "1e99", "true", "\"1\"", "null", "[]", "2147483648",
+                               "-2147483649", "18446744073709551615"})
+        for (const char* field : {"/percent", "/outcome/code", "/outcome/state"}) {
+            json wrong = whole;
+            wrong[json::json_pointer(field)] = json::parse(number);
+            EXPECT_FALSE(DecodeNews(wrong.dump())) << wrong;
+        }
+    json wrong = whole;
+    wrong["outcome"]["state"] = 6;
+    EXPECT_FALSE(DecodeNews(wrong.dump())) << "no state";
+    for (const char* line : {"", "alive", "{", "5", "[]", "{}", "{\"step\": \"Printing\"}"})
+        EXPECT_FALSE(DecodeNews(line)) << line;
+}
+
+} // namespace
