@@ -1,10 +1,32 @@
 #include "office/OutputWait.h"
 
+#include "machine/FiltersFolder.h"
+#include "machine/OutputClocks.h"
 #include "pstools/FileProbe.h"
 
 #include <windows.h>
 
+#include <wx/msw/registry.h>
 #include <wx/utils.h>
+
+namespace {
+
+void TakeFromHost(const char* valueName, std::chrono::milliseconds& limit) {
+    const wxRegKey key(wxRegKey::HKCU, HostKey);
+    long seconds = 0;
+    if (key.Exists() && key.HasValue(valueName) && key.QueryValue(valueName, &seconds) &&
+        seconds > 0)
+        limit = std::chrono::seconds(seconds);
+}
+
+OutputWaitLimits LimitsOfThisWait() {
+    OutputWaitLimits limits = GetOutputWaitLimits();
+    TakeFromHost(OutputStallSecondsValue, limits.withoutGrowth);
+    TakeFromHost(OutputTotalSecondsValue, limits.altogether);
+    return limits;
+}
+
+} // namespace
 
 OutputWaitLimits& GetOutputWaitLimits() {
     static OutputWaitLimits limits;
@@ -13,7 +35,7 @@ OutputWaitLimits& GetOutputWaitLimits() {
 
 bool WaitForOutput(const wxString& path, const OutputWait& wait) {
     using Clock = std::chrono::steady_clock;
-    const OutputWaitLimits limits = GetOutputWaitLimits();
+    const OutputWaitLimits limits = LimitsOfThisWait();
     const Clock::time_point start = Clock::now();
     Clock::time_point lastGrowth = start;
 

@@ -19,13 +19,14 @@ struct OutputWait {
 /// From this size on a file counts as large, in bytes.
 constexpr unsigned long long LargeOutputSize = 9'000'000;
 
-/// What bounds the wait for a file that never comes, or never stops growing.
+/// What bounds the wait for a file that never comes, or never stops growing, unless the host says
+/// otherwise (machine/OutputClocks.h).
 struct OutputWaitLimits {
     std::chrono::milliseconds withoutGrowth = std::chrono::minutes(2);
     std::chrono::milliseconds altogether = std::chrono::minutes(30);
 };
 
-/// The limits of all drivers. May be changed while no conversion runs.
+/// The limits of all drivers, where the host says nothing. May be changed while no conversion runs.
 OutputWaitLimits& GetOutputWaitLimits();
 
 /// Waits until the file has stopped growing.

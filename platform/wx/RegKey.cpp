@@ -115,6 +115,10 @@ bool wxRegKey::SetValue(const wxString& name, const wxString& value) {
                                     static_cast<DWORD>(bytes.size())) == ERROR_SUCCESS;
 }
 
+bool wxRegKey::DeleteValue(const wxString& name) {
+    return Open() && RegDeleteValueW(m_key, ValueName(name)) == ERROR_SUCCESS;
+}
+
 bool wxRegKey::DeleteSelf() {
     Close();
     return RegDeleteTreeW(m_root, m_path.wc_str()) == ERROR_SUCCESS;

@@ -2,6 +2,8 @@
 
 #include "pstools/FileProbe.h"
 
+#include <wx/msw/registry.h>
+
 #include <gtest/gtest.h>
 
 #include <functional>
@@ -75,6 +77,15 @@ TEST_F(OutputWaitTest, EndsByItsLimits) {
     EXPECT_FALSE(Wait(Patient, [](std::size_t) { return 0; }));
     GetOutputWaitLimits() = {1h, 20ms};
     EXPECT_FALSE(Wait(Patient, [](std::size_t i) { return i; }));
+}
+
+TEST_F(OutputWaitTest, EndsByTheLimitsOfTheHost) {
+    wxRegKey host(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Marlo Quillon");
+    ASSERT_TRUE(host.Create() && host.SetValue("OutputStallSeconds", 1L));
+    EXPECT_FALSE(Wait(Patient, [](std::size_t) { return 0; }));
+    EXPECT_TRUE(host.DeleteValue("OutputStallSeconds") && host.SetValue("OutputTotalSeconds", 1L));
+    EXPECT_FALSE(Wait(Patient, [](std::size_t i) { return i; }));
+    EXPECT_TRUE(host.DeleteValue("OutputTotalSeconds"));
 }
 
 TEST_F(OutputWaitTest, LetsALargeFileSettle) {

@@ -1,5 +1,5 @@
-// A stand-in for tests of the host: enters a Word, an Excel and their engine, and tells the
-// engine's clocks by way of the engine's name; and a Distiller with its bridge.
+// A stand-in for tests of the host: enters a Word, an Excel and their engine, and tells the clocks
+// by way of the engine's name; and a Distiller with its bridge.
 
 #include <objbase.h>
 #include <windows.h>
@@ -23,6 +23,15 @@ void EnterText(wxRegKey::StdKey root, const wxString& keyName, const char* value
     key.SetValue(valueName, text);
 }
 
+/// @return 0 when there is none
+long Number(const wxString& keyName, const char* value) {
+    const wxRegKey key(wxRegKey::HKCU, keyName);
+    long number = 0;
+    if (key.Exists() && key.HasValue(value))
+        key.QueryValue(value, &number);
+    return number;
+}
+
 } // namespace
 
 STDAPI DllRegisterServer() {
@@ -31,15 +40,11 @@ STDAPI DllRegisterServer() {
         EnterText(wxRegKey::HKCR, progId + "\\CurVer", "", progId + ".16");
     }
 
-    long stall = 0;
-    long total = 0;
-    const wxRegKey clocks(wxRegKey::HKCU, OwnKey);
-    if (clocks.Exists()) {
-        clocks.QueryValue("StallSeconds", &stall);
-        clocks.QueryValue("TotalSeconds", &total);
-    }
     EnterText(wxRegKey::HKLM, OwnKey, "Engine",
-              wxString::Format("Scripted engine, %ld of %ld s", stall, total));
+              wxString::Format("Scripted engine, %ld of %ld s, output %ld of %ld s",
+                               Number(OwnKey, "StallSeconds"), Number(OwnKey, "TotalSeconds"),
+                               Number(InstallationKey, "OutputStallSeconds"),
+                               Number(InstallationKey, "OutputTotalSeconds")));
     EnterText(wxRegKey::HKLM, InstallationKey, "InstallPath", TEST_INSTALLATION);
     EnterText(wxRegKey::HKLM, DistillerStandInKey, "Engine", "Scripted Distiller");
     EnterText(wxRegKey::HKLM, DistillerKey, "JobOptionsFolder", TEST_PROFILES);

@@ -47,9 +47,10 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(run.Records("summary").at(0)["convertible"], (json{"doc", "docx", "xls", "xlsx"}));
 }
 
-TEST(Status, HandsTheClocksToTheEngines) {
+TEST(Status, HandsTheClocksToTheEnginesAndTheFilters) {
     const RunResult run = RunQuillon({"status", "--engine-stall", "5", "--engine-limit", "60"});
-    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s")) << run.out;
+    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s, output 5 of 60 s")) << run.out;
+    EXPECT_TRUE(Contains(RunQuillon({"status"}).out, "Scripted engine, 0 of 0 s, output 0 of 0 s"));
 }
 
 TEST(Status, TellsWhatIsMissingAndWhatToDo) {

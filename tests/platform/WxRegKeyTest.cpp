@@ -39,6 +39,8 @@ TEST_F(WxRegKey, KeepsTextsAsTheyAre) {
         ASSERT_TRUE(reader.QueryValue("", value));
         EXPECT_EQ(text, value);
     }
+    EXPECT_TRUE(m_key.DeleteValue(""));
+    EXPECT_FALSE(m_key.DeleteValue(""));
 }
 
 TEST_F(WxRegKey, PutsVariablesIntoExpandableTexts) {

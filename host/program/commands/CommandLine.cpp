@@ -44,7 +44,8 @@ constexpr const char* ExitCodes = R"(
 Exit codes
   0  done; for status: ready to convert; for settings: saved, or left as they were
   1  some documents were refused or could not be converted
-  2  the machine is at fault: no Office application, no printer, no filter, a full disk; for
+  2  the machine is at fault: no Office application, no printer, no filter, a full disk, no more
+     processes, an engine that was ended from outside, when it was tried again, too; for
      settings: no display to show them on
   3  wrong usage: the command line, the settings file or the output folder
   4  interrupted: Ctrl-C, or a request to end, came before all was done. What is under way is
@@ -56,7 +57,8 @@ Output
   LC_MESSAGES or LANG; this help, the log, and what is wrong with a command line are in English.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
   printer, distiller, panel, missing, document, summary and error; lines for people then go to
-  stderr. The "code" and the "state" of a document are the same in every language.
+  stderr. The "code", the "state" and the "fault" (document, machine or null) of a document are the
+  same in every language.
 )";
 
 std::string SettingsTable() {
@@ -137,11 +139,13 @@ void AddCommonOptions(CLI::App& app, CommandLine& line) {
     app.add_flag("-v,--verbose", line.verbose, "Show the whole log on stderr, not only warnings");
     app.add_option("--log", line.logFile, "Append the whole log to a file")->type_name("FILE");
     app.add_option("--engine-stall", line.stallSeconds,
-                   "How long an Office engine may show no sign of life")
+                   "How long an engine may show no sign of life, 60 if not given, and the file\n"
+                   "that it prints not grow, 120 if not given")
         ->type_name("SECONDS")
         ->check(seconds);
     app.add_option("--engine-limit", line.limitSeconds,
-                   "How long an Office engine may take for a document")
+                   "How long an engine may take for a document, 600 if not given, and the file\n"
+                   "that it prints to be whole, 1800 if not given")
         ->type_name("SECONDS")
         ->check(seconds);
     app.add_option("--filters", line.filtersFolder,

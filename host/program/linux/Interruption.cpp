@@ -38,14 +38,20 @@ void Handle(int signal, void (*handler)(int)) {
     sigaction(signal, &action, nullptr);
 }
 
+/// A reader of our output that has gone, or a log that has become too large, is no reason to leave
+/// documents unconverted. By a handler, not SIG_IGN, since programs started from here would inherit
+/// that.
+void IgnoreFailedWrites() {
+    for (const int signal : {SIGPIPE, SIGXFSZ})
+        Handle(signal, DoNothing);
+}
+
 } // namespace
 
 void Interruption::Install() {
     for (const int signal : {SIGINT, SIGTERM, SIGHUP})
         Handle(signal, NoteRequest);
-    // A reader of our output that has gone is no reason to leave documents unconverted. A handler,
-    // not SIG_IGN, since programs started from here would inherit that.
-    Handle(SIGPIPE, DoNothing);
+    IgnoreFailedWrites();
 }
 
 void Interruption::SetNote(const wxString& note) {
@@ -58,10 +64,11 @@ void Interruption::SetNote(const wxString& note) {
 void Interruption::LeaveToParent() {
     sigset_t held; // by the parent, until now
     sigemptyset(&held);
-    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE}) {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
         Handle(signal, DoNothing);
         sigaddset(&held, signal);
     }
+    IgnoreFailedWrites();
     sigprocmask(SIG_UNBLOCK, &held, nullptr);
 }
 

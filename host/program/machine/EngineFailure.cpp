@@ -1,11 +1,11 @@
 #include "host/program/machine/EngineFailure.h"
 
+#include "host/program/machine/StandInKeys.h"
+
 // After the strings, which it takes for granted.
 #include <wx/msw/registry.h>
 
 namespace {
-
-constexpr const char* FailureKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure";
 
 wxString TextOf(const wxRegKey& key, const char* value) {
     wxString text;
@@ -23,14 +23,14 @@ EngineFailure::Fault FaultOf(const wxString& name) {
 } // namespace
 
 void ForgetEngineFailure() {
-    wxRegKey key(wxRegKey::HKCU, FailureKey);
+    wxRegKey key(wxRegKey::HKCU, LastFailureKey);
     if (key.Exists())
         key.DeleteSelf();
 }
 
 std::optional<EngineFailure> LastEngineFailure() {
-    const wxRegKey key(wxRegKey::HKCU, FailureKey);
+    const wxRegKey key(wxRegKey::HKCU, LastFailureKey);
     if (!key.Exists())
         return std::nullopt;
-    return EngineFailure{TextOf(key, "Reason"), FaultOf(TextOf(key, "Fault"))};
+    return EngineFailure{TextOf(key, FailureReasonValue), FaultOf(TextOf(key, FailureFaultValue))};
 }

@@ -7,6 +7,7 @@
 #include "host/program/machine/StandInKeys.h"
 #include "machine/Distiller.h"
 #include "machine/FiltersFolder.h"
+#include "machine/OutputClocks.h"
 #include "machine/RegistryText.h"
 
 #include <objbase.h>
@@ -55,20 +56,30 @@ void RegisterStandIns(const std::filesystem::path& folder) {
         HandOverProfiles();
 }
 
-/// Sets a clock of the engines: Office's and Distiller's.
-void EnterClock(const char* valueName, std::optional<unsigned> seconds) {
-    if (!seconds)
-        return;
-    for (const char* keyName : {StandInsKey, DistillerStandInKey})
+/// @param seconds without which the value of an earlier program goes
+void EnterSeconds(const char* keyName, const char* valueName, std::optional<unsigned> seconds) {
+    wxRegKey key(wxRegKey::HKCU, keyName);
+    if (seconds)
         Enter(wxRegKey::HKCU, keyName, valueName, static_cast<long>(*seconds));
+    else if (key.Exists() && key.HasValue(valueName))
+        key.DeleteValue(valueName);
+}
+
+/// Sets the clocks on Office's engine, on Distiller's and on the file that Office prints into.
+void EnterClocks(const MachineSetup& setup) {
+    for (const char* keyName : {StandInsKey, DistillerStandInKey}) {
+        EnterSeconds(keyName, StallSecondsValue, setup.stallSeconds);
+        EnterSeconds(keyName, TotalSecondsValue, setup.limitSeconds);
+    }
+    EnterSeconds(HostKey, OutputStallSecondsValue, setup.stallSeconds);
+    EnterSeconds(HostKey, OutputTotalSecondsValue, setup.limitSeconds);
 }
 
 } // namespace
 
 void SetUpMachine(const MachineSetup& setup) {
     Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
-    EnterClock(StallSecondsValue, setup.stallSeconds);
-    EnterClock(TotalSecondsValue, setup.limitSeconds);
+    EnterClocks(setup);
     RegisterStandIns(setup.standInsFolder);
     AddFilePrinter(ProgramFolder() / "Printers" / "QuillonPS.ppd");
 }

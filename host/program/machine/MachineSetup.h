@@ -6,8 +6,9 @@
 /// What the program enters into the machine before filters look at it.
 struct MachineSetup {
     std::filesystem::path standInsFolder;
-    std::optional<unsigned> stallSeconds; ///< how long an engine may show no sign of life
-    std::optional<unsigned> limitSeconds; ///< how long an engine may take altogether
+    /// How long an engine may show no sign of life, and what it prints not grow.
+    std::optional<unsigned> stallSeconds;
+    std::optional<unsigned> limitSeconds; ///< how long each may take altogether
 };
 
 /// Enters where the program is installed, the engines' clocks, the Office stand-ins and the file

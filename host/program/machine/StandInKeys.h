@@ -7,6 +7,12 @@
 constexpr const char* StandInsKey = "SOFTWARE\\Orvanta\\Office Stand-Ins";
 constexpr const char* DistillerStandInKey = "SOFTWARE\\Orvanta\\Distiller Stand-In";
 
+/// Under HKEY_CURRENT_USER what they say of their last failure: why, and whether it is to be blamed
+/// on the "document", the "machine" or someone "outside".
+constexpr const char* LastFailureKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure";
+constexpr const char* FailureReasonValue = "Reason";
+constexpr const char* FailureFaultValue = "Fault";
+
 constexpr const char* EngineValue = "Engine"; ///< said: name and version of the engine
 
 constexpr const char* StallSecondsValue = "StallSeconds"; ///< told: a number

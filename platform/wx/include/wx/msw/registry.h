@@ -30,6 +30,7 @@ public:
     bool QueryValue(const wxString& name, long* value) const;
     bool SetValue(const wxString& name, long value);
     bool SetValue(const wxString& name, const wxString& value);
+    bool DeleteValue(const wxString& name);
     bool DeleteSelf();
 
 private:
