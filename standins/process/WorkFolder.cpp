@@ -13,7 +13,6 @@
 #include <filesystem>
 #include <memory>
 #include <random>
-#include <regex>
 #include <string_view>
 
 namespace fs = std::filesystem;
@@ -39,11 +38,18 @@ std::string NamePrefix(const std::string& kind) {
     return "quillon-" + kind + "-";
 }
 
+bool IsNumber(std::string_view text) {
+    return !text.empty() && text.find_first_not_of("0123456789") == text.npos;
+}
+
 /// Whether NewPath gives such names.
 bool IsName(std::string_view name, const std::string& prefix) {
-    static const std::regex s_numbers("[0-9]+-[0-9]+");
-    return name.substr(0, prefix.size()) == prefix &&
-           std::regex_match(name.begin() + prefix.size(), name.end(), s_numbers);
+    if (name.substr(0, prefix.size()) != prefix)
+        return false;
+    const std::string_view numbers = name.substr(prefix.size());
+    const std::size_t dash = numbers.find('-');
+    return dash != numbers.npos && IsNumber(numbers.substr(0, dash)) &&
+           IsNumber(numbers.substr(dash + 1));
 }
 
 /// The mark gets its name when it is locked, so that an unlocked one is always an abandoned one.

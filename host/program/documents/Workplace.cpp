@@ -5,17 +5,16 @@
 
 #include <windows.h>
 
+#include <wx/regex.h>
 #include <wx/utils.h>
 
 #include <chrono>
-#include <regex>
 
 namespace fs = std::filesystem;
 using namespace std::chrono_literals;
 
 namespace {
 
-constexpr const char* NamePrefix = ".quillon-";
 constexpr const char* MarkName = "in use";
 
 /// How long a workplace may be without its mark. From one to the other is a moment, unless the
@@ -34,10 +33,9 @@ std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
 
 /// Whether it is a folder, and no link to one, with a name such as Create gives.
 bool IsWorkplace(const fs::directory_entry& entry) {
-    static const std::regex s_names(R"(\.quillon-[0-9]+-[0-9]+)");
-    const std::string name = entry.path().filename().u8string();
+    static const wxRegEx s_names(R"(^\.quillon-[0-9]+-[0-9]+$)");
     std::error_code error;
-    return name.rfind(NamePrefix, 0) == 0 && std::regex_match(name, s_names) &&
+    return s_names.Matches(ToText(entry.path().filename()).value_or(wxString())) &&
            fs::is_directory(entry.symlink_status(error));
 }
 
@@ -74,7 +72,7 @@ void Remove(const fs::path& workplace, std::shared_ptr<void> mark) {
 } // namespace
 
 std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxString& fault) {
-    const std::string prefix = NamePrefix + std::to_string(wxGetProcessId()) + '-';
+    const std::string prefix = ".quillon-" + std::to_string(wxGetProcessId()) + '-';
     std::error_code error;
     for (int number = 0; number < 1000; ++number) { // taken: by a process that was ended
         const fs::path path = outputFolder / (prefix + std::to_string(number));
