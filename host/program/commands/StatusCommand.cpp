@@ -9,6 +9,8 @@
 #include "machine/InstalledOffice.h"
 #include "plugin/ResultCodes.h"
 
+#include <wx/intl.h>
+
 namespace {
 
 constexpr std::size_t NameColumn = 14;
@@ -20,7 +22,7 @@ wxString Entry(const wxString& name, const wxString& rest) {
 }
 
 wxString OrNone(const wxString& text) {
-    return "  " + (text.empty() ? wxString("none") : OneLine(text));
+    return "  " + (text.empty() ? _("none") : OneLine(text));
 }
 
 template <typename Texts>
@@ -39,9 +41,11 @@ wxString Unreadiness(const Filter& filter) {
 void TellFilter(const Filter& filter, Reporter& reporter) {
     const PluginInfo& info = filter.Info();
     const wxString fault = Unreadiness(filter);
-    reporter.Line(Entry(info.identifier, info.version + ", " + info.vendor + ", for " +
-                                             wxJoin(filter.Extensions(), ' ', 0) + ": " +
-                                             (filter.IsReady() ? "ready" : "not ready, " + fault)));
+    const wxString about = wxString::Format(_("%s, %s, for %s"), info.version, info.vendor,
+                                            wxJoin(filter.Extensions(), ' ', 0));
+    const wxString readiness =
+        filter.IsReady() ? _("ready") : wxString::Format(_("not ready, %s"), fault);
+    reporter.Line(Entry(info.identifier, about + ": " + readiness));
     reporter.Record({{"type", "filter"},
                      {"identifier", JsonText(info.identifier)},
                      {"version", JsonText(info.version)},
@@ -53,9 +57,9 @@ void TellFilter(const Filter& filter, Reporter& reporter) {
 
 void TellFilters(const FilterSet& filters, const std::filesystem::path& folder,
                  Reporter& reporter) {
-    reporter.Line("Filters in " + Shown(folder));
+    reporter.Line(wxString::Format(_("Filters in %s"), Shown(folder)));
     if (filters.Filters().empty())
-        reporter.Line("  none");
+        reporter.Line(OrNone({}));
     for (const auto& filter : filters.Filters())
         TellFilter(*filter, reporter);
     reporter.Record({{"type", "folder"}, {"filters", folder.u8string()}});
@@ -65,16 +69,19 @@ void TellFilters(const FilterSet& filters, const std::filesystem::path& folder,
 wxString Describe(OfficeApplication application, const wxString& version) {
     switch (InstallationOf(application)) {
     case OfficeInstallation::None:
-        return "not installed";
+        return _("not installed");
     case OfficeInstallation::TooOld:
-        return "of Office 97 or 2000, too old to be driven";
+        return _("of Office 97 or 2000, too old to be driven");
     case OfficeInstallation::Drivable:
         break;
     }
     const bool isLimited =
         application != OfficeApplication::Publisher && !ReadsOpenXml(application);
-    return (version.empty() ? wxString("installed") : "version " + version) +
-           (isLimited ? ", not for Office Open XML, which needs version 12 or later" : "");
+    const wxString found =
+        version.empty() ? _("installed") : wxString::Format(_("version %s"), version);
+    return isLimited ? wxString::Format(
+                           _("%s, not for Office Open XML, which needs version 12 or later"), found)
+                     : found;
 }
 
 void TellApplication(OfficeApplication application, Reporter& reporter) {
@@ -82,8 +89,9 @@ void TellApplication(OfficeApplication application, Reporter& reporter) {
     const wxString version = number ? wxString::Format("%lu", number) : wxString();
     const std::optional<MissingPart> missing = FindMissingApplication(application);
     const wxString advice = missing ? missing->advice : wxString();
-    reporter.Line(Entry(NameOf(application), Describe(application, version) +
-                                                 (advice.empty() ? advice : ". " + advice)));
+    const wxString found = Describe(application, version);
+    reporter.Line(Entry(NameOf(application),
+                        advice.empty() ? found : wxString::Format(_("%s. %s"), found, advice)));
     reporter.Record({{"type", "application"},
                      {"name", NameOf(application)},
                      {"installed", IsInstalled(application)},
@@ -93,29 +101,29 @@ void TellApplication(OfficeApplication application, Reporter& reporter) {
 }
 
 void TellApplications(Reporter& reporter) {
-    reporter.Line("Office applications");
+    reporter.Line(_("Office applications"));
     for (const OfficeApplication application : AllOfficeApplications)
         TellApplication(application, reporter);
     const wxString engine = OfficeEngine();
-    reporter.Line("Engine");
+    reporter.Line(_("Engine"));
     reporter.Line(OrNone(engine));
     reporter.Record({{"type", "engine"}, {"version", JsonText(engine)}});
 }
 
 void TellPrinters(Reporter& reporter) {
-    reporter.Line("Printers");
+    reporter.Line(_("Printers"));
     const std::vector<Printer> printers = ListPrinters();
     const Printer* const preferred = PreferredPrinter(printers);
     if (printers.empty())
-        reporter.Line("  none");
+        reporter.Line(OrNone({}));
     for (const Printer& printer : printers) {
         const bool isPostScript = printer.IsPostScript();
-        wxString kind = isPostScript ? "PostScript" : "not PostScript";
+        wxString kind = isPostScript ? wxString("PostScript") : _("not PostScript");
         if (printer.IsDistiller())
             kind += ", Acrobat Distiller";
         if (&printer == preferred)
-            kind += printer.IsDistiller() ? ", used whichever is chosen"
-                                          : ", used unless another is chosen";
+            kind += ", " + (printer.IsDistiller() ? _("used whichever is chosen")
+                                                  : _("used unless another is chosen"));
         reporter.Line(Entry(printer.name, kind));
         reporter.Record({{"type", "printer"},
                          {"name", JsonText(printer.name)},
@@ -132,15 +140,16 @@ void TellDistiller(Reporter& reporter) {
     reporter.Line("Distiller");
     reporter.Line(OrNone(engine));
     for (const wxString& profile : profiles)
-        reporter.Line("  profile " + OneLine(profile));
+        reporter.Line("  " + wxString::Format(_("profile %s"), OneLine(profile)));
     reporter.Record(
         {{"type", "distiller"}, {"engine", JsonText(engine)}, {"profiles", ListOf(profiles)}});
 }
 
 void TellPanel(const FilterSet& filters, Reporter& reporter) {
-    const wxString obstacle = filters.Filters().empty() ? "there is no filter" : PanelObstacle();
-    reporter.Line("Settings panel");
-    reporter.Line("  " + (obstacle.empty() ? wxString("can be used") : "disabled: " + obstacle));
+    const wxString obstacle = filters.Filters().empty() ? _("there is no filter") : PanelObstacle();
+    reporter.Line(_("Settings panel"));
+    reporter.Line("  " + (obstacle.empty() ? _("can be used")
+                                           : wxString::Format(_("disabled: %s"), obstacle)));
     reporter.Record(
         {{"type", "panel"}, {"enabled", obstacle.empty()}, {"reason", JsonText(obstacle)}});
 }
@@ -159,16 +168,20 @@ wxArrayString ListConvertible(const FilterSet& filters) {
 std::vector<MissingPart> FindObstacles(const FilterSet& filters) {
     std::vector<MissingPart> obstacles;
     if (filters.Filters().empty())
-        obstacles.push_back({"There is no filter", "Install the program anew"});
+        obstacles.push_back({_("There is no filter"), _("Install the program anew")});
     for (const auto& part : {FindMissingOffice(), FindMissingPrinter()})
         if (part)
             obstacles.push_back(*part);
     if (!obstacles.empty())
         return obstacles;
     for (const auto& filter : filters.Filters()) {
-        const wxString fault = filter->IsReady() ? wxString("has no use for what is installed")
-                                                 : "is not ready: " + Unreadiness(*filter);
-        obstacles.push_back({"The filter " + filter->Info().identifier + ' ' + fault, {}});
+        const wxString& name = filter->Info().identifier;
+        obstacles.push_back(
+            {filter->IsReady()
+                 ? wxString::Format(_("The filter %s has no use for what is installed"), name)
+                 : wxString::Format(_("The filter %s is not ready: %s"), name,
+                                    Unreadiness(*filter)),
+             {}});
     }
     return obstacles;
 }
@@ -181,14 +194,14 @@ ExitCode TellReadiness(const FilterSet& filters, Reporter& reporter) {
     if (const auto pdfMaker = FindMissingPdfMaker())
         missing.push_back(*pdfMaker);
     for (const MissingPart& part : missing) {
-        reporter.Line("Missing: " + part.Text());
+        reporter.Line(wxString::Format(_("Missing: %s"), part.Text()));
         reporter.Record({{"type", "missing"},
                          {"text", JsonText(part.what)},
                          {"advice", JsonText(part.advice)}});
     }
     const ExitCode exitCode = missing.empty() ? ExitCode::Done : ExitCode::MachineAtFault;
     if (missing.empty())
-        reporter.Line("Ready to convert " + wxJoin(convertible, ' ', 0) + '.');
+        reporter.Line(wxString::Format(_("Ready to convert %s."), wxJoin(convertible, ' ', 0)));
     reporter.Record({{"type", "summary"},
                      {"convertible", ListOf(convertible)},
                      {"exitCode", static_cast<int>(exitCode)}});

@@ -1,5 +1,7 @@
 #include "host/program/system/InstallAdvice.h"
 
+#include <wx/intl.h>
+
 namespace {
 
 struct Package {
@@ -21,9 +23,11 @@ wxString InstallAdvice(const wxString& progId) {
     for (const Package& package : Packages)
         if (progId.empty() || progId == package.progId)
             packages << ' ' << package.name;
-    return packages.empty() ? wxString() : "Install LibreOffice with: apt-get install" + packages;
+    return packages.empty()
+               ? packages
+               : wxString::Format(_("Install LibreOffice with: apt-get install%s"), packages);
 }
 
 wxString PdfInstallAdvice() {
-    return "Install Ghostscript with: apt-get install ghostscript";
+    return _("Install Ghostscript with: apt-get install ghostscript");
 }

@@ -8,13 +8,16 @@
 #include "machine/InstalledOffice.h"
 
 #include <wx/filename.h>
+#include <wx/intl.h>
 
 #include <algorithm>
 #include <iterator>
 
 namespace {
 
-constexpr const char* PostScriptInstead = "; or ask for PostScript with --ps";
+wxString OrPostScript(const wxString& advice) {
+    return wxString::Format(_("%s; or ask for PostScript with --ps"), advice);
+}
 
 int NotInstalledCode(OfficeApplication application) {
     switch (application) {
@@ -39,25 +42,27 @@ std::optional<MissingPart> FindMissingVersion(OfficeApplication application,
     if (!IsOpenXmlExtension(extension) || ReadsOpenXml(application))
         return std::nullopt;
     const unsigned long version = RegisteredVersionOf(application);
-    const wxString found = version ? wxString::Format("is version %lu", version)
-                                   : wxString("does not say its version");
-    return MissingPart{wxString(NameOf(application)) + ' ' + found + ", and ." + extension.Lower() +
-                           " files need version 12 or later",
-                       InstallAdvice(ProgIdOf(application))};
+    const wxString found =
+        version ? wxString::Format(_("%s is version %lu"), NameOf(application), version)
+                : wxString::Format(_("%s does not say its version"), NameOf(application));
+    return MissingPart{
+        wxString::Format(_("%s, and .%s files need version 12 or later"), found, extension.Lower()),
+        InstallAdvice(ProgIdOf(application))};
 }
 
 } // namespace
 
 wxString MissingPart::Text() const {
-    return advice.empty() ? what : what + ". " + advice;
+    return advice.empty() ? what : wxString::Format(_("%s. %s"), what, advice);
 }
 
 std::optional<MissingPart> FindMissingOffice() {
     if (std::any_of(std::begin(AllOfficeApplications), std::end(AllOfficeApplications), IsDrivable))
         return std::nullopt;
-    return MissingPart{IsOfficeInstalled() ? "The only Office application is a Publisher of Office "
-                                             "97 or 2000, too old to be driven"
-                                           : "No Office application is installed",
+    return MissingPart{IsOfficeInstalled()
+                           ? _("The only Office application is a Publisher of Office "
+                               "97 or 2000, too old to be driven")
+                           : _("No Office application is installed"),
                        InstallAdvice({})};
 }
 
@@ -67,16 +72,18 @@ std::optional<MissingPart> FindMissingApplication(OfficeApplication application)
     const wxString name = NameOf(application);
     const wxString advice = InstallAdvice(ProgIdOf(application));
     return IsInstalled(application)
-               ? MissingPart{name + " is of Office 97 or 2000, too old to be driven", advice,
-                             Result::PublisherTooOld}
-               : MissingPart{name + " is not installed", advice, NotInstalledCode(application)};
+               ? MissingPart{wxString::Format(_("%s is of Office 97 or 2000, too old to be driven"),
+                                              name),
+                             advice, Result::PublisherTooOld}
+               : MissingPart{wxString::Format(_("%s is not installed"), name), advice,
+                             NotInstalledCode(application)};
 }
 
 std::optional<MissingPart> FindMissingPrinter() {
     if (PreferredPrinter(ListPrinters()))
         return std::nullopt;
-    return MissingPart{"There is no PostScript printer",
-                       "Install the program anew, which brings one, or add one to the system"};
+    return MissingPart{_("There is no PostScript printer"),
+                       _("Install the program anew, which brings one, or add one to the system")};
 }
 
 std::optional<MissingPart> FindMissingPdfMaker() {
@@ -85,12 +92,12 @@ std::optional<MissingPart> FindMissingPdfMaker() {
                  DistillerBridgeFile);
     std::error_code ignored;
     if (!std::filesystem::is_regular_file(bridge, ignored))
-        return MissingPart{"The library that makes PDF files is missing: " + Shown(bridge),
-                           wxString("Install the program anew") + PostScriptInstead,
-                           Result::PdfConversionFailed};
+        return MissingPart{
+            wxString::Format(_("The library that makes PDF files is missing: %s"), Shown(bridge)),
+            OrPostScript(_("Install the program anew")), Result::PdfConversionFailed};
     if (PdfEngine().empty())
-        return MissingPart{"There is nothing to make PDF files with",
-                           PdfInstallAdvice() + PostScriptInstead, Result::PdfConversionFailed};
+        return MissingPart{_("There is nothing to make PDF files with"),
+                           OrPostScript(PdfInstallAdvice()), Result::PdfConversionFailed};
     return std::nullopt;
 }
 
@@ -106,6 +113,8 @@ std::optional<MissingPart> FindMissingFor(const wxString& extension) {
 
 wxString PanelObstacle() {
     // With a server as new as the one that the host speaks of, a missing printer disables nothing.
-    return IsOfficeInstalled() ? wxString()
-                               : "no Office application is installed. " + InstallAdvice(wxString());
+    return IsOfficeInstalled()
+               ? wxString()
+               : wxString::Format(_("%s. %s"), _("no Office application is installed"),
+                                  InstallAdvice({}));
 }

@@ -19,7 +19,8 @@ constexpr const char* OfProfiles =
     wxTRANSLATE("How Distiller makes PDF files; None: in its own way. For PDF only.");
 
 constexpr Hint Hints[] = {
-    {ControlId::Printer, wxTRANSLATE("The printer whose driver writes the PostScript files.")},
+    {ControlId::Printer, wxTRANSLATE("The printer whose driver writes the PostScript files. Where "
+                                     "there is a Distiller printer, it is that one.")},
     {ControlId::Print,
      wxTRANSLATE("What is printed of a presentation: its slides, several of them on a page, slides "
                  "with the speaker's notes, or their text alone.")},

@@ -2,12 +2,12 @@
 
 #include "common/Themer.h"
 #include "host/program/PathText.h"
-#include "host/program/machine/MissingParts.h"
 #include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"
 #include "host/program/window/PanelHints.h"
 #include "host/program/window/ScrolledArea.h"
+#include "ui/ControlIds.h"
 
 #include <wx/button.h>
 #include <wx/display.h>
@@ -84,14 +84,29 @@ void SettingsDialogue::SizePanels() {
     m_area->SetMinSize(size);
 }
 
-/// Says why the panels are greyed out, if they are.
+/// Says why the panels, or controls of theirs, are greyed out for good, if they are.
 void SettingsDialogue::ExplainObstacle() {
     const wxString obstacle = PanelObstacle();
-    if (obstacle.empty())
-        return;
-    m_obstacle->Say(wxString::Format(_("These settings cannot be changed: %s."), obstacle),
-                    m_area->GetMinWidth());
-    FindWindow(ButtonId::Restore)->Disable();
+    wxString text;
+    if (!obstacle.empty())
+        text = wxString::Format(_("These settings cannot be changed: %s."), obstacle);
+    else
+        text = Explain(ControlId::HighQuality, FindMissingFor("pptx")) +
+               Explain(ControlId::OutputPDF, FindMissingPdfMaker());
+    if (!text.empty())
+        m_obstacle->Say(text.Trim(), m_area->GetMinWidth());
+    FindWindow(ButtonId::Restore)->Enable(obstacle.empty());
+}
+
+/// @param missing what a control needs
+/// @return a sentence and a space; nothing when the control can be used
+wxString SettingsDialogue::Explain(int id, const std::optional<MissingPart>& missing) const {
+    const auto* const control = dynamic_cast<const wxControl*>(m_area->FindWindow(id));
+    return control && !control->IsEnabled() && missing
+               ? wxString::Format(_("\"%s\" cannot be chosen: %s."), control->GetLabelText(),
+                                  missing->Text()) +
+                     ' '
+               : wxString();
 }
 
 wxSizer* SettingsDialogue::NewButtons() {

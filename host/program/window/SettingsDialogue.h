@@ -1,6 +1,7 @@
 #pragma once
 
 #include "host/program/filters/FilterSet.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/system/Toolkit.h"
 #include "host/program/window/PanelChoices.h"
 
@@ -35,6 +36,7 @@ private:
     void ShowPanels(const Settings& settings);
     void SizePanels();
     void ExplainObstacle();
+    wxString Explain(int id, const std::optional<MissingPart>& missing) const;
     wxSizer* NewButtons();
     void FitToFault();
 
@@ -47,7 +49,7 @@ private:
     const FilterSet& m_filters;
     const std::filesystem::path m_file;
     ScrolledArea* m_area;
-    MessageBar* m_obstacle;              ///< says why the panels are greyed out
+    MessageBar* m_obstacle;              ///< says why something is greyed out
     MessageBar* m_fault;                 ///< says why the settings could not be stored
     int m_faultHeight = 0;               ///< by which the window has grown for it
     std::vector<PanelChoices> m_choices; ///< of each panel

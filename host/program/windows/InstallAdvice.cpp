@@ -1,10 +1,12 @@
 #include "host/program/system/InstallAdvice.h"
 
+#include <wx/intl.h>
+
 wxString InstallAdvice(const wxString& progId) {
-    return progId.empty() ? wxString("Install Microsoft Office")
-                          : "Install Microsoft " + progId.BeforeFirst('.');
+    return wxString::Format(_("Install Microsoft %s"),
+                            progId.empty() ? wxString("Office") : progId.BeforeFirst('.'));
 }
 
 wxString PdfInstallAdvice() {
-    return "Install Acrobat Distiller";
+    return _("Install Acrobat Distiller");
 }

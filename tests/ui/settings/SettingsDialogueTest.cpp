@@ -166,7 +166,14 @@ TEST_F(SettingsDialogueTest, AChoiceOfAnotherLanguageIsTheSameOne) {
 TEST_F(SettingsDialogueTest, SaysWhyItIsGreyedOutAsStatusDoes) {
     Open([this] { EXPECT_EQ(Said(), ""); });
     m_office.reset();
+    m_office.emplace(std::vector<std::wstring>{L"Word.Application"});
     Open([this] {
+        EXPECT_FALSE(Find(ControlId::HighQuality)->IsEnabled());
+        EXPECT_TRUE(Said().Contains(WithoutSpaces(FindMissingFor("pptx")->Text()))) << Said();
+    });
+    m_office.reset();
+    Open([this] {
+        EXPECT_FALSE(Find(ControlId::Printer)->IsEnabled());
         EXPECT_TRUE(Said().Contains(WithoutSpaces(PanelObstacle()))) << Said();
         EXPECT_FALSE(Find(ButtonId::Restore)->IsEnabled());
     });
