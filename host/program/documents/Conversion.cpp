@@ -9,6 +9,7 @@
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>
+#include <wx/intl.h>
 
 #include <chrono>
 
@@ -40,11 +41,11 @@ void Explain(const JobItem& item, const OutputFolder& outputFolder,
         outcome.reason = failure->reason;
         outcome.machineAtFault = failure->fault != EngineFailure::Fault::Document;
     } else if (outputFolder.IsFull()) {
-        outcome.reason = "there is no space left for the output or for temporary files";
+        outcome.reason = _("there is no space left for the output or for temporary files");
         outcome.machineAtFault = true;
     } else if (outcome.code == Result::PrintFailed) {
-        outcome.reason = "its application could not open or print it: it may be damaged or "
-                         "protected, or need more time than --engine-limit gives";
+        outcome.reason = _("its application could not open or print it: it may be damaged or "
+                           "protected, or need more time than --engine-limit gives");
     }
 }
 
@@ -80,7 +81,7 @@ void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const 
         return Fail(answer.code, {}, *screened.filter, outcome);
     std::error_code error;
     if (!fs::is_regular_file(workplace.Path() / FromText(outputName), error))
-        return Fail(Result::OutputFileNotFound, "the filter reported success", *screened.filter,
+        return Fail(Result::OutputFileNotFound, _("the filter reported success"), *screened.filter,
                     outcome);
     wxString fault;
     if (!DeliverAll(workplace, outputName, baseName, fault))

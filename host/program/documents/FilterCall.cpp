@@ -3,6 +3,8 @@
 #include "common/WQServices.h"
 #include "plugin/ResultCodes.h"
 
+#include <wx/intl.h>
+
 namespace {
 
 FilterAnswer CallOnce(const std::function<int()>& work) {
@@ -27,6 +29,7 @@ FilterAnswer CallFilter(const wxString& document, const std::function<int()>& wo
         << document << " is tried once more, since " << first.failure->reason;
     FilterAnswer second = CallOnce(work);
     if (WasEndedFromOutside(second))
-        second.failure->reason << ", at the second try too";
+        second.failure->reason =
+            wxString::Format(_("%s, at the second try too"), second.failure->reason);
     return second;
 }

@@ -5,6 +5,7 @@
 #include "plugin/ResultCodes.h"
 
 #include <wx/filename.h>
+#include <wx/intl.h>
 
 #include <cerrno>
 #include <cstring>
@@ -17,33 +18,36 @@ namespace {
 
 using namespace std::string_view_literals;
 
-wxString KindOf(fs::file_type type) {
+wxString DescribeKind(fs::file_type type) {
     switch (type) {
     case fs::file_type::directory:
-        return "a folder that cannot be read";
+        return _("it is a folder that cannot be read");
     case fs::file_type::fifo:
-        return "a named pipe, not a file";
+        return _("it is a named pipe, not a file");
     case fs::file_type::socket:
-        return "a socket, not a file";
+        return _("it is a socket, not a file");
     default:
-        return "a device, not a file";
+        return _("it is a device, not a file");
     }
 }
 
 struct Signature {
     std::string_view bytes;
-    const char* meaning;
+    const char* meaning; ///< in English
 };
 
 constexpr std::string_view Zip = "PK\x03\x04"sv;
 constexpr std::string_view CompoundFile = "\xD0\xCF\x11\xE0\xA1\xB1\x1A\xE1"sv;
 
+constexpr const char* Markup =
+    wxTRANSLATE("it is a web page or XML text; save it from Office in its own format");
+
 constexpr Signature OtherFiles[] = {
-    {"%PDF-"sv, "it is a PDF file"},
-    {"%!PS"sv, "it is a PostScript file"},
-    {"{\\rtf"sv, "it is a Rich Text file; save it as a Word document"},
-    {"<"sv, "it is a web page or XML text; save it from Office in its own format"},
-    {"\xEF\xBB\xBF<"sv, "it is a web page or XML text; save it from Office in its own format"},
+    {"%PDF-"sv, wxTRANSLATE("it is a PDF file")},
+    {"%!PS"sv, wxTRANSLATE("it is a PostScript file")},
+    {"{\\rtf"sv, wxTRANSLATE("it is a Rich Text file; save it as a Word document")},
+    {"<"sv, Markup},
+    {"\xEF\xBB\xBF<"sv, Markup},
 };
 
 bool BeginsWith(std::string_view text, std::string_view beginning) {
@@ -58,7 +62,7 @@ std::string FirstBytes(const fs::path& file) {
 }
 
 Refusal Unreadable(const std::error_code& error) {
-    const wxString reason = "it cannot be read: " + Because(error);
+    const wxString reason = wxString::Format(_("it cannot be read: %s"), Because(error));
     if (error == std::errc::too_many_files_open ||
         error == std::errc::too_many_files_open_in_system ||
         error == std::errc::not_enough_memory || error == std::errc::io_error)
@@ -67,32 +71,34 @@ Refusal Unreadable(const std::error_code& error) {
 }
 
 wxString CouldNotOpen(const wxString& extension, const wxString& toldByEngine) {
-    return "its application could not open it: " +
-           (toldByEngine.empty()
-                ? "it is damaged, or no ." + extension + " document; the log says more"
-                : toldByEngine);
+    return wxString::Format(
+        _("its application could not open it: %s"),
+        toldByEngine.empty()
+            ? wxString::Format(_("it is damaged, or no .%s document; the log says more"), extension)
+            : toldByEngine);
 }
 
 } // namespace
 
 std::optional<Refusal> CheckInput(const fs::path& file) {
     if (!ToText(file))
-        return Refusal{Result::InvalidInputFile, "its name is not valid UTF-8 text; rename it"};
+        return Refusal{Result::InvalidInputFile, _("its name is not valid UTF-8 text; rename it")};
     std::error_code error;
     const fs::file_status status = fs::status(file, error);
     if (status.type() == fs::file_type::not_found)
-        return Refusal{Result::InputFileNotFound, "there is no such file"};
+        return Refusal{Result::InputFileNotFound, _("there is no such file")};
     if (!fs::status_known(status))
-        return Refusal{Result::InputFileNotFound, "it cannot be reached: " + Because(error)};
+        return Refusal{Result::InputFileNotFound,
+                       wxString::Format(_("it cannot be reached: %s"), Because(error))};
     if (!fs::is_regular_file(status))
         return Refusal{fs::is_directory(status) ? Result::InputFileNotFound
                                                 : Result::InvalidInputFile,
-                       "it is " + KindOf(status.type())};
+                       DescribeKind(status.type())};
     errno = 0;
     if (!std::ifstream(file, std::ios::binary).is_open())
         return Unreadable({errno, std::generic_category()});
     if (fs::file_size(file, error) == 0 && !error)
-        return Refusal{Result::InvalidInputFile, "the file is empty"};
+        return Refusal{Result::InvalidInputFile, _("the file is empty")};
     return std::nullopt;
 }
 
@@ -101,19 +107,20 @@ wxString DescribeInvalid(const fs::path& file, const wxString& toldByEngine) {
     const wxString extension = wxFileName(ToText(file).value_or(wxString())).GetExt().Lower();
     const bool openXml = extension.EndsWith("x");
     if (BeginsWith(beginning, Zip) && extension == "pub")
-        return "it is a ZIP package, not a publication";
+        return _("it is a ZIP package, not a publication");
     if (BeginsWith(beginning, Zip))
         return openXml ? CouldNotOpen(extension, toldByEngine)
-                       : wxString::Format("it is a ZIP package: probably a .%sx renamed to .%s",
+                       : wxString::Format(_("it is a ZIP package: probably a .%sx renamed to .%s"),
                                           extension, extension);
     if (BeginsWith(beginning, CompoundFile) && !toldByEngine.empty())
         return CouldNotOpen(extension, toldByEngine);
     if (BeginsWith(beginning, CompoundFile))
-        return openXml
-                   ? "it is protected by a password, or an older document renamed to ." + extension
-                   : "it is damaged, or a document of another application than ." + extension;
+        return wxString::Format(
+            openXml ? _("it is protected by a password, or an older document renamed to .%s")
+                    : _("it is damaged, or a document of another application than .%s"),
+            extension);
     for (const Signature& other : OtherFiles)
         if (BeginsWith(beginning, other.bytes))
-            return other.meaning;
-    return "its content is not an Office document";
+            return wxGetTranslation(other.meaning);
+    return _("its content is not an Office document");
 }

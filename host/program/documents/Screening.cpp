@@ -6,11 +6,14 @@
 #include "host/program/machine/MissingParts.h"
 #include "plugin/ResultCodes.h"
 
+#include <wx/intl.h>
+
 namespace {
 
 wxString UnclaimedReason(const wxString& extension) {
-    return extension.empty() ? wxString("a name without an ending; no filter takes it")
-                             : "no filter takes files ending in ." + extension;
+    return extension.empty()
+               ? _("a name without an ending; no filter takes it")
+               : wxString::Format(_("no filter takes files ending in .%s"), extension);
 }
 
 void Refuse(const FilterSet& filters, const Refusal& refusal, Outcome& outcome) {
@@ -81,13 +84,13 @@ Outcome NotReached(const FilterSet& filters, const Input& input) {
     outcome.state = State::NotConverted;
     outcome.code = Result::Failure;
     outcome.text = filters.ErrorText(Result::Failure);
-    outcome.reason = "interrupted before its turn came";
+    outcome.reason = _("interrupted before its turn came");
     return outcome;
 }
 
 wxString MachineReason(const wxString& extension) {
     const std::optional<MissingPart> missing = FindMissingFor(extension);
     return missing ? missing->Text()
-                   : wxString("see `quillon status`; if it finds nothing missing, repair the "
-                              "installation of its application");
+                   : _("see `quillon status`; if it finds nothing missing, repair the "
+                       "installation of its application");
 }

@@ -5,6 +5,7 @@
 
 #include <windows.h>
 
+#include <wx/intl.h>
 #include <wx/regex.h>
 #include <wx/utils.h>
 
@@ -84,9 +85,9 @@ std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxStrin
         if (error)
             break;
     }
-    fault = "nothing can be written to the output folder";
-    if (error)
-        fault << ": " << Because(error);
+    fault = error ? wxString::Format(_("nothing can be written to the output folder: %s"),
+                                     Because(error))
+                  : _("nothing can be written to the output folder");
     return std::nullopt;
 }
 
@@ -128,7 +129,8 @@ bool Workplace::Deliver(const wxString& name, const wxString& newName, wxString&
     const fs::path to = m_path.parent_path() / FromText(newName);
     const std::error_code error = MoveDurably(from, to);
     if (error)
-        fault = "the output could not be put in place as " + Shown(to) + ": " + Because(error);
+        fault = wxString::Format(_("the output could not be put in place as %s: %s"), Shown(to),
+                                 Because(error));
     return !error;
 }
 
@@ -136,7 +138,7 @@ bool Workplace::ConfirmDelivery(wxString& fault) const {
     const fs::path outputFolder = m_path.parent_path();
     const std::error_code error = SyncFolder(outputFolder);
     if (error)
-        fault = "the output is in " + Shown(outputFolder) +
-                ", but may be lost if the power fails: " + Because(error);
+        fault = wxString::Format(_("the output is in %s, but may be lost if the power fails: %s"),
+                                 Shown(outputFolder), Because(error));
     return !error;
 }

@@ -2,6 +2,8 @@
 
 #include "host/program/machine/StandInKeys.h"
 
+#include <wx/translation.h>
+
 // After the strings, which it takes for granted.
 #include <wx/msw/registry.h>
 
@@ -32,5 +34,6 @@ std::optional<EngineFailure> LastEngineFailure() {
     const wxRegKey key(wxRegKey::HKCU, LastFailureKey);
     if (!key.Exists())
         return std::nullopt;
-    return EngineFailure{TextOf(key, FailureReasonValue), FaultOf(TextOf(key, FailureFaultValue))};
+    return EngineFailure{wxGetTranslation(TextOf(key, FailureReasonValue)),
+                         FaultOf(TextOf(key, FailureFaultValue))};
 }

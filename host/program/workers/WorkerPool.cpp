@@ -7,6 +7,8 @@
 #include "host/program/system/Interruption.h"
 #include "plugin/ResultCodes.h"
 
+#include <wx/intl.h>
+
 #include <algorithm>
 
 using Clock = std::chrono::steady_clock;
@@ -82,7 +84,7 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
     wxString fault;
     worker.process = ChildProcess::Start(m_arguments, fault);
     if (!worker.process) {
-        Fail(number, "no process could be started for it: " + fault, true);
+        Fail(number, wxString::Format(_("no process could be started for it: %s"), fault), true);
         return false;
     }
     worker.proven = false;
@@ -105,7 +107,7 @@ void WorkerPool::OnLine(std::size_t number, const std::string& line) {
         return;
     std::optional<News> news = DecodeNews(line);
     if (!news) {
-        End(worker, "answered what makes no sense, and was ended");
+        End(worker, wxTRANSLATE("answered what makes no sense, and was ended"));
         return;
     }
     worker.begun = true;
@@ -136,10 +138,11 @@ void WorkerPool::OnEnd(std::size_t number) {
         worker.triedAgain = true;
         Assign(number, *worker.assignment);
     } else {
+        const wxString reason =
+            wxString::Format(_("the process that converted it %s"),
+                             worker.ending ? wxGetTranslation(worker.ending) : end.text);
         Fail(number,
-             "the process that converted it " +
-                 (worker.ending ? wxString(worker.ending) : end.text) +
-                 (fromOutside ? ", at the second try too" : ""),
+             fromOutside ? wxString::Format(_("%s, at the second try too"), reason) : reason,
              fromOutside);
     }
     GiveWork(number);
@@ -182,9 +185,9 @@ void WorkerPool::ShowProgress(Worker& worker, const News& news) {
     for (const Worker& each : m_workers)
         if (each.assignment)
             names << (names.empty() ? "" : ", ") << each.progress->Document();
-    m_reporter.Passing(
-        ProgressLine(static_cast<int>(m_done * 100 / m_assignments->size()),
-                     wxString::Format("%zu of %zu  ", m_done, m_assignments->size()) + names));
+    m_reporter.Passing(ProgressLine(
+        static_cast<int>(m_done * 100 / m_assignments->size()),
+        wxString::Format(_("%zu of %zu"), m_done, m_assignments->size()) + "  " + names));
 }
 
 /// Ends the workers that have been silent for too long.
@@ -197,7 +200,7 @@ void WorkerPool::EndTheSilent() {
         if (hasSlept)
             worker.heard = now;
         if (worker.process && now - worker.heard > m_patience)
-            End(worker, "gave no sign of life any more and was ended");
+            End(worker, wxTRANSLATE("gave no sign of life any more and was ended"));
     }
 }
 
