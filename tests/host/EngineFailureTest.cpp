@@ -68,4 +68,24 @@ TEST_F(EngineFailureTest, OfAConversionIsToldAndTriedOnceMoreWhenItCameFromOutsi
             Expect(each, {"-j", jobs});
 }
 
+TEST_F(EngineFailureTest, IsToldInTheLanguageThatIsAskedFor) {
+    const std::string prefix = "convert=1020\nfault=";
+    const Case cases[] = {
+        {prefix + "document\nreason=LibreOffice's supervisor stopped responding", "failed", 1020,
+         "document", "der Aufsichtsprozess von LibreOffice antwortete nicht mehr"},
+        {prefix + "machine\nreason=LibreOffice took longer than 9 seconds; only 20 files may be "
+                  "open (ulimit -n)",
+         "failed", 1020, "machine",
+         "LibreOffice brauchte mehr als 9 Sekunden; nur 20 Dateien dürfen offen sein (ulimit -n)"},
+        {prefix + "outside\nreason=LibreOffice was ended from outside (signal 9, Killed)", "failed",
+         1020, "machine",
+         "LibreOffice wurde von außen beendet (Signal 9, Killed), auch beim zweiten Versuch"},
+        {prefix + "document\nreason=no word of ours", "failed", 1020, "document",
+         "no word of ours"},
+    };
+    for (const Case& each : cases)
+        for (const char* jobs : {"1", "2"})
+            Expect(each, {"-j", jobs, "--lang", "de"});
+}
+
 } // namespace

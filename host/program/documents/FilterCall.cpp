@@ -1,6 +1,7 @@
 #include "host/program/documents/FilterCall.h"
 
 #include "common/WQServices.h"
+#include "host/program/report/Reasons.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/intl.h>
@@ -22,14 +23,17 @@ bool WasEndedFromOutside(const FilterAnswer& answer) {
 } // namespace
 
 FilterAnswer CallFilter(const wxString& document, const std::function<int()>& work) {
-    const FilterAnswer first = CallOnce(work);
-    if (!WasEndedFromOutside(first))
-        return first;
-    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-        << document << " is tried once more, since " << first.failure->reason;
-    FilterAnswer second = CallOnce(work);
-    if (WasEndedFromOutside(second))
-        second.failure->reason =
-            wxString::Format(_("%s, at the second try too"), second.failure->reason);
-    return second;
+    FilterAnswer answer = CallOnce(work);
+    const bool isSecond = WasEndedFromOutside(answer);
+    if (isSecond) {
+        SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+            << document << " is tried once more, since " << answer.failure->reason;
+        answer = CallOnce(work);
+    }
+    if (answer.failure)
+        answer.failure->reason = TranslateReason(answer.failure->reason);
+    if (isSecond && WasEndedFromOutside(answer))
+        answer.failure->reason =
+            wxString::Format(_("%s, at the second try too"), answer.failure->reason);
+    return answer;
 }

@@ -2,8 +2,6 @@
 
 #include "host/program/machine/StandInKeys.h"
 
-#include <wx/translation.h>
-
 // After the strings, which it takes for granted.
 #include <wx/msw/registry.h>
 
@@ -34,6 +32,5 @@ std::optional<EngineFailure> LastEngineFailure() {
     const wxRegKey key(wxRegKey::HKCU, LastFailureKey);
     if (!key.Exists())
         return std::nullopt;
-    return EngineFailure{wxGetTranslation(TextOf(key, FailureReasonValue)),
-                         FaultOf(TextOf(key, FailureFaultValue))};
+    return EngineFailure{TextOf(key, FailureReasonValue), FaultOf(TextOf(key, FailureFaultValue))};
 }

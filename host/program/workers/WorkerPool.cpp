@@ -4,6 +4,7 @@
 #include "host/program/PathText.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
+#include "host/program/report/Reasons.h"
 #include "host/program/system/Interruption.h"
 #include "plugin/ResultCodes.h"
 
@@ -107,7 +108,7 @@ void WorkerPool::OnLine(std::size_t number, const std::string& line) {
         return;
     std::optional<News> news = DecodeNews(line);
     if (!news) {
-        End(worker, wxTRANSLATE("answered what makes no sense, and was ended"));
+        End(worker, "answered what makes no sense, and was ended");
         return;
     }
     worker.begun = true;
@@ -140,7 +141,7 @@ void WorkerPool::OnEnd(std::size_t number) {
     } else {
         const wxString reason =
             wxString::Format(_("the process that converted it %s"),
-                             worker.ending ? wxGetTranslation(worker.ending) : end.text);
+                             TranslateReason(worker.ending ? wxString(worker.ending) : end.text));
         Fail(number,
              fromOutside ? wxString::Format(_("%s, at the second try too"), reason) : reason,
              fromOutside);
@@ -200,7 +201,7 @@ void WorkerPool::EndTheSilent() {
         if (hasSlept)
             worker.heard = now;
         if (worker.process && now - worker.heard > m_patience)
-            End(worker, wxTRANSLATE("gave no sign of life any more and was ended"));
+            End(worker, "gave no sign of life any more and was ended");
     }
 }
 

@@ -1,0 +1,28 @@
+# Fails when a reason that the program knows by its English words is worded otherwise where it is
+# made.
+file(READ "${REASONS}" reasons)
+file(GLOB_RECURSE sources "${STANDINS}/*.cpp" "${PROGRAM}/linux/*.cpp" "${PROGRAM}/windows/*.cpp"
+     "${PROGRAM}/workers/*.cpp")
+set(made "")
+foreach(source IN LISTS sources)
+    file(READ "${source}" text)
+    string(APPEND made "${text}")
+endforeach()
+
+string(REPLACE ";" "%s" reasons "${reasons}")
+string(REGEX MATCHALL "wxTRANSLATE\\(\"[^\n]*\"\\)" patterns "${reasons}")
+if(NOT patterns)
+    message(FATAL_ERROR "${REASONS} has no reasons.")
+endif()
+string(REPLACE "\\\"" "" made "${made}")
+foreach(pattern IN LISTS patterns)
+    string(REGEX REPLACE "wxTRANSLATE\\(\"(.*)\"\\)" "\\1" pieces "${pattern}")
+    string(REPLACE "\\\"" "" pieces "${pieces}")
+    string(REPLACE "%s" ";" pieces "${pieces}")
+    foreach(piece IN LISTS pieces)
+        string(FIND "${made}" "${piece}" place)
+        if(place EQUAL -1)
+            message(SEND_ERROR "Nothing says \"${piece}\", which is awaited in ${pattern}.")
+        endif()
+    endforeach()
+endforeach()
