@@ -18,6 +18,8 @@ Failure OverdueFailure(const std::string& engine, const TimeLimits& limits) {
 Failure DescribeEngineEnd(const std::string& engine, int status, const MemoryShortage& shortage) {
     if (WIFEXITED(status) && WEXITSTATUS(status) == EngineCannotStart)
         return {engine + " cannot be started", Fault::Machine};
+    if (WIFEXITED(status) && WEXITSTATUS(status) == EngineNotConfined)
+        return {engine + " cannot be kept from the rest of the machine", Fault::Machine};
     return DescribeEnd(engine, status, shortage);
 }
 

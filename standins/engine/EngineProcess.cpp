@@ -51,9 +51,8 @@ bool TakeDescriptors(const std::vector<int>& descriptors) {
     const std::vector<char*> wordPointers = ExecWords(words);
     const std::vector<char*> environmentPointers = ExecWords(environment);
     if (TakeDescriptors(command.descriptors) && chdir(command.folder.c_str()) == 0) {
-        DenyNetwork();
-        if (!command.mayStartProcesses)
-            DenyProcesses();
+        if (!Confine(command.reach))
+            _exit(EngineNotConfined);
         LimitResources(command.resources, command.times);
         execve(wordPointers[0], wordPointers.data(), environmentPointers.data());
     }
@@ -80,9 +79,7 @@ std::vector<std::string> EngineEnvironment(const std::string& folder) {
     std::vector<std::string> environment = {
         "HOME=" + folder,
         "TMPDIR=" + folder,
-        // There is no program that an engine needs; LibreOffice would ask gpg for its version for
-        // each document.
-        "PATH=/nonexistent",
+        "PATH=/nonexistent", // there is no program that an engine may run
         "LC_ALL=C.UTF-8",
     };
     if (const char* zone = std::getenv("TZ")) // dates in documents are those of the user

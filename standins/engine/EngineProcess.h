@@ -1,6 +1,7 @@
 #pragma once
 
-#include "standins/engine/Sandbox.h"
+#include "standins/confinement/Confinement.h"
+#include "standins/confinement/ResourceLimits.h"
 #include "standins/process/Clocks.h"
 #include "standins/process/Descriptor.h"
 
@@ -20,7 +21,7 @@ struct EngineCommand {
     std::vector<int> descriptors; ///< what it gets as descriptors 0, 1, 2 and so on, and no others
     TimeLimits times{};
     ResourceLimits resources;
-    bool mayStartProcesses = true;
+    Reach reach; ///< its files are told by the numbers that the engine knows them under
 };
 
 /// The environment of an engine whose home and temporary files are in `folder`.
@@ -28,9 +29,11 @@ std::vector<std::string> EngineEnvironment(const std::string& folder);
 
 /// The exit code, as a shell has it, of an engine that could not be started.
 constexpr int EngineCannotStart = 127;
+/// That of one that could not be confined.
+constexpr int EngineNotConfined = 126;
 
-/// An engine at work: in a process group of its own, with limits on what it may use, without a
-/// network, without the caller's environment. It dies with the caller.
+/// An engine at work: confined, in a process group of its own, with limits on what it may use,
+/// without the caller's environment. It dies with the caller.
 class EngineProcess {
 public:
     /// Starts it. The caller must have a single thread.

@@ -6,6 +6,7 @@
 #include <CLI/CLI.hpp>
 #include <cstdint>
 #include <string>
+#include <vector>
 
 namespace standins {
 
@@ -16,6 +17,7 @@ constexpr int FirstGivenDescriptor = 4;
 /// What every supervisor finds on its command line.
 struct SupervisorOptions {
     std::string folder; ///< the work folder, not made yet
+    std::vector<std::string> fontFolders;
     long stallSeconds = 0;
     long totalSeconds = 0;
 

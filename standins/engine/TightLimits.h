@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/engine/Sandbox.h"
+#include "standins/confinement/ResourceLimits.h"
 #include "standins/process/Clocks.h"
 
 #include <string>

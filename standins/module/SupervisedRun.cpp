@@ -1,5 +1,6 @@
 #include "standins/module/SupervisedRun.h"
 
+#include "standins/module/FontFolders.h"
 #include "standins/process/ChildProcess.h"
 #include "standins/process/ProcessEnd.h"
 
@@ -38,6 +39,8 @@ std::optional<ChildProcess> StartSupervisor(const SupervisedRun& run, const Chan
         "--stall=" + std::to_string(run.limits.stall.count()),
         "--total=" + std::to_string(run.limits.total.count()),
     };
+    for (const std::string& folder : FontFolders())
+        arguments.push_back("--fonts=" + folder);
     arguments.insert(arguments.end(), run.arguments.begin(), run.arguments.end());
     std::vector<int> descriptors = {nothing.Get(), nothing.Get(), nothing.Get(), channel.Socket()};
     descriptors.insert(descriptors.end(), run.descriptors.begin(), run.descriptors.end());

@@ -40,12 +40,16 @@ std::string UserInstallationUrl(const std::string& workFolder) {
     return std::string("file://") + path.get() + "/profile";
 }
 
+std::vector<std::string> SocketFolders() {
+    return {"/tmp", "/var/tmp"};
+}
+
 void RemoveSocket(const std::string& workFolder) {
     const std::string name = "SingleOfficeIPC_" + SocketId(UserInstallationUrl(workFolder));
-    // The user's number is not in it where the system has no entry for the user.
+    // The user's number is not in it where LibreOffice cannot learn who the user is.
     for (const std::string& socket : {std::to_string(getuid()) + "_" + name, name})
-        for (const char* start : {"/tmp/OSL_PIPE_", "/var/tmp/OSL_PIPE_"})
-            unlink((start + socket).c_str());
+        for (const std::string& folder : SocketFolders())
+            unlink((folder + "/OSL_PIPE_" + socket).c_str());
 }
 
 } // namespace standins

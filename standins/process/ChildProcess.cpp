@@ -79,7 +79,8 @@ std::vector<char*> ExecWords(std::vector<std::string>& words) {
 
 std::optional<ChildProcess> ChildProcess::Start(const std::string& program,
                                                 const std::vector<std::string>& arguments,
-                                                const std::vector<int>& descriptors) {
+                                                const std::vector<int>& descriptors,
+                                                Environment environment) {
     const SpawnDescriptors given(descriptors);
     if (!given.Whole()) {
         errno = EMFILE; // whatever the system calls it
@@ -87,9 +88,11 @@ std::optional<ChildProcess> ChildProcess::Start(const std::string& program,
     }
     std::vector<std::string> words{program};
     words.insert(words.end(), arguments.begin(), arguments.end());
+    char* nothing[] = {nullptr};
     pid_t id = 0;
-    errno = posix_spawn(&id, program.c_str(), given.Get(), SpawnAttributes().Get(),
-                        ExecWords(words).data(), environ);
+    errno =
+        posix_spawn(&id, program.c_str(), given.Get(), SpawnAttributes().Get(),
+                    ExecWords(words).data(), environment == Environment::Empty ? nothing : environ);
     if (errno != 0)
         return std::nullopt;
     ChildProcess child(id, WatchProcess(id));

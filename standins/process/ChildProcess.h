@@ -14,6 +14,9 @@ namespace standins {
 /// @param words must outlive the answer
 std::vector<char*> ExecWords(std::vector<std::string>& words);
 
+/// What a program finds in its environment: what its parent has, or nothing.
+enum class Environment { Inherited, Empty };
+
 /// A helper program started by this process, in a session of its own: it has no terminal, and its
 /// process group has its number. Killed and waited for when the object goes.
 class ChildProcess {
@@ -26,7 +29,8 @@ public:
     /// @return nothing when the program cannot be started; errno tells why
     static std::optional<ChildProcess> Start(const std::string& program,
                                              const std::vector<std::string>& arguments,
-                                             const std::vector<int>& descriptors);
+                                             const std::vector<int>& descriptors,
+                                             Environment environment = Environment::Inherited);
 
     ChildProcess(ChildProcess&& other) noexcept;
     ChildProcess& operator=(ChildProcess&&) = delete;

@@ -59,7 +59,7 @@ TEST_F(ExportCacheTest, WhatCouldNotBeLoadedIsTriedAgain) {
 
 TEST_F(ExportCacheTest, ManyDocumentsDoNotFillTheMachine) {
     // Each leaves 3 MB; a hundred of them would stay if only their number counted.
-    const FakeEngine engine(FakeEngine::MakePdf() + "truncate -s 3M \"$PDF\"");
+    const FakeEngine engine(FakeEngine::MakePdf() + "exec truncate -s 3M \"$PDF\"");
     for (int i = 0; i < 100; ++i)
         EXPECT_EQ("", Open(NewDocument()));
     std::uintmax_t held = 0;

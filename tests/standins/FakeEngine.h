@@ -1,12 +1,13 @@
 #pragma once
 
+#include "standins/process/Descriptor.h"
 #include "tests/support/TemporaryFolder.h"
 
 #include <string>
 
 /// A LibreOffice that does what a shell script says, in the place of the real one from the next
 /// document on. The script finds the work folder as $HOME and the document as $DOCUMENT; what is to
-/// be the result goes to $PDF.
+/// be the result goes to $PDF. See WriteScriptedProgram for what else it has.
 class FakeEngine {
 public:
     explicit FakeEngine(const std::string& script);
@@ -20,4 +21,6 @@ public:
 
 private:
     TemporaryFolder m_folder;
+    standins::Descriptor m_opened; ///< tells when the shell is opened: an engine itself cannot
+    mutable std::size_t m_starts = 0;
 };

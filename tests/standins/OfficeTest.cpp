@@ -105,13 +105,17 @@ fs::path OfficeTest::NewDocument(const std::string& name) const {
     return m_files.Write(name, "Document " + std::to_string(++number));
 }
 
-pid_t OfficeTest::AwaitLibreOffice() const {
+void OfficeTest::AwaitInWorkFolder(const std::string& file) const {
     Await([&] {
         const fs::directory_iterator folders(m_temporary.Path());
-        return std::any_of(begin(folders), end(folders), [](const fs::directory_entry& folder) {
-            return fs::exists(folder.path() / "profile/.lock");
+        return std::any_of(begin(folders), end(folders), [&](const fs::directory_entry& folder) {
+            return fs::exists(folder.path() / file);
         });
     });
+}
+
+pid_t OfficeTest::AwaitLibreOffice() const {
+    AwaitInWorkFolder("profile/.lock");
     return AwaitEngine();
 }
 

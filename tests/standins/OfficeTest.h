@@ -25,6 +25,8 @@ protected:
     std::filesystem::path PrintedFile(const std::filesystem::path& document) const;
     /// Writes a document whose bytes no test before has opened.
     std::filesystem::path NewDocument(const std::string& name = "new.docx") const;
+    /// Waits until an engine has made a file in its work folder.
+    void AwaitInWorkFolder(const std::string& file) const;
     /// Waits until LibreOffice has made the socket that it leaves behind when it is killed.
     pid_t AwaitLibreOffice() const;
 

@@ -3,6 +3,7 @@
 #include "standins/process/Clocks.h"
 
 #include <string>
+#include <vector>
 
 namespace standins {
 
@@ -10,6 +11,7 @@ namespace standins {
 struct DistillerJob {
     std::string program; ///< Ghostscript's full path
     std::string folder;  ///< the work folder, not made yet
+    std::vector<std::string> fontFolders;
     TimeLimits limits{};
     int postScript = -1; ///< open for reading
     int pdf = -1;        ///< open for writing, empty

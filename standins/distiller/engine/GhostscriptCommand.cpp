@@ -2,6 +2,8 @@
 
 #include "standins/distiller/engine/FontNames.h"
 
+#include <filesystem>
+
 namespace standins {
 
 namespace {
@@ -30,6 +32,22 @@ std::vector<std::string> Words(const DistillerJob& job) {
     return words;
 }
 
+/// The program itself, what it brings along, and the files it is handed.
+Reach GhostscriptReach(const WorkFolder& folder, const DistillerJob& job) {
+    const std::filesystem::path prefix =
+        std::filesystem::path(job.program).parent_path().parent_path();
+    Reach reach;
+    reach.readable = {job.program, prefix / "lib", prefix / "share", "/etc/ghostscript",
+                      "/var/lib/ghostscript"};
+    AllowSystem(reach);
+    AllowFonts(reach, job.fontFolders);
+    reach.workFolder = folder.Path();
+    reach.files = {PostScript, Pdf};
+    if (job.profile >= 0)
+        reach.files.push_back(Profile);
+    return reach;
+}
+
 } // namespace
 
 EngineCommand GhostscriptCommand(const WorkFolder& folder, const DistillerJob& job, int input,
@@ -43,7 +61,7 @@ EngineCommand GhostscriptCommand(const WorkFolder& folder, const DistillerJob& j
         command.descriptors.push_back(job.profile);
     command.times = job.limits;
     command.resources.memory = MostGhostscriptMemory;
-    command.mayStartProcesses = false;
+    command.reach = GhostscriptReach(folder, job);
     return command;
 }
 

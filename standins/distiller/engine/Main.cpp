@@ -22,6 +22,7 @@ int Run(int argc, char** argv) {
     const standins::Channel bridge =
         standins::BecomeSupervisor(hasProfile ? 3 : 2, standins::MostGhostscriptMemory);
     job.folder = supervisor.folder;
+    job.fontFolders = supervisor.fontFolders;
     job.limits = supervisor.Limits();
     job.postScript = standins::FirstGivenDescriptor;
     job.pdf = standins::FirstGivenDescriptor + 1;

@@ -3,6 +3,7 @@
 #include "standins/process/Clocks.h"
 
 #include <string>
+#include <vector>
 
 namespace standins {
 
@@ -13,6 +14,7 @@ struct EngineJob {
     std::string extension;    ///< of the document, without a dot
     std::string importFilter; ///< LibreOffice's name of the document's type
     std::string exportTo;     ///< extension, colon, LibreOffice's filter with options if any
+    std::vector<std::string> fontFolders;
     TimeLimits limits{};
 };
 

@@ -2,6 +2,8 @@
 
 #include "standins/office/UserInstallation.h"
 
+#include <filesystem>
+
 namespace standins {
 
 namespace {
@@ -16,15 +18,26 @@ std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
         "--nodefault",
         "--nolockcheck",
         "-env:UserInstallation=" + installation,
-        // As root it would write a stamp into its own program folder.
+        // It would write a stamp into its own program folder.
         "-env:UNO_SHARED_PACKAGES_CACHE=" + installation + "/shared",
         "--infilter=" + job.importFilter,
         "--convert-to",
         job.exportTo,
         "--outdir",
-        folder.Path() + "/out",
+        folder.Path(),
         DocumentPath(folder, job),
     };
+}
+
+Reach LibreOfficeReach(const WorkFolder& folder, const EngineJob& job) {
+    Reach reach;
+    reach.readable = {std::filesystem::path(job.program).parent_path(), "/etc/libreoffice",
+                      "/var/lib/libreoffice"};
+    AllowSystem(reach);
+    AllowFonts(reach, job.fontFolders);
+    reach.workFolder = folder.Path();
+    reach.socketFolders = SocketFolders();
+    return reach;
 }
 
 } // namespace
@@ -34,7 +47,7 @@ std::string DocumentPath(const WorkFolder& folder, const EngineJob& job) {
 }
 
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job) {
-    return folder.Path() + "/out/document." + job.exportTo.substr(0, job.exportTo.find(':'));
+    return folder.Path() + "/document." + job.exportTo.substr(0, job.exportTo.find(':'));
 }
 
 std::string LogPath(const WorkFolder& folder) {
@@ -51,6 +64,7 @@ EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job,
     command.descriptors = {input, log, log};
     command.times = job.limits;
     command.resources.memory = MostMemory;
+    command.reach = LibreOfficeReach(folder, job);
     return command;
 }
 

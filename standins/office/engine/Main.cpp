@@ -22,6 +22,7 @@ int Run(int argc, char** argv) {
     options.add_option("--export", job.exportTo)->required();
     CLI11_PARSE(options, argc, argv);
     job.folder = supervisor.folder;
+    job.fontFolders = supervisor.fontFolders;
     job.limits = supervisor.Limits();
     standins::Supervise(job, standins::FirstGivenDescriptor, server);
     return EXIT_SUCCESS;

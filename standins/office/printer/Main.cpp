@@ -2,11 +2,12 @@
 // a process of its own, since the document is one that anybody may have made. What goes wrong is
 // one line on standard error, and exit code 1 or CannotWrite.
 
+#include "standins/confinement/Confinement.h"
+#include "standins/confinement/ResourceLimits.h"
 #include "standins/office/printer/ExitCode.h"
 #include "standins/office/printer/PostScriptWriter.h"
 
 #include <sys/prctl.h>
-#include <sys/resource.h>
 #include <unistd.h>
 
 #include <CLI/CLI.hpp>
@@ -17,17 +18,27 @@
 #include <map>
 #include <string>
 
+#ifdef __SANITIZE_ADDRESS__
+/// LeakSanitizer looks at a process from another one, which there cannot be here.
+extern "C" int __lsan_is_turned_off();
+extern "C" int __lsan_is_turned_off() {
+    return 1;
+}
+#endif
+
 namespace {
 
-/// Memory for one page at a time is needed, whatever the document asks for.
-void LimitResources() {
-#ifndef __SANITIZE_ADDRESS__ // whose shadow memory takes terabytes of address space
-    constexpr rlim_t MostMemory = rlim_t{4} << 30;
-    const rlimit memory{MostMemory, MostMemory};
-    setrlimit(RLIMIT_AS, &memory);
-#endif
-    const rlimit none{0, 0};
-    setrlimit(RLIMIT_CORE, &none);
+constexpr std::uint64_t MostMemory = std::uint64_t{4} << 30; // of the address space, in bytes
+constexpr std::uint64_t LargestFile = std::uint64_t{4} << 30;
+
+/// Fonts, and what tells of characters, the C library's tables of them included, of the ends of
+/// words, and of the time.
+standins::Reach WriterReach(const std::vector<std::string>& fontFolders) {
+    standins::Reach reach;
+    reach.readable = {"/usr/lib", "/usr/share/poppler", "/usr/share/libthai", "/etc/localtime",
+                      "/usr/share/zoneinfo"};
+    AllowFonts(reach, fontFolders);
+    return reach;
 }
 
 void AddOptions(CLI::App& options, standins::PrintJob& job) {
@@ -64,14 +75,24 @@ int Run(int argc, char** argv) {
     signal(SIGXFSZ, SIG_IGN);               // likewise
     prctl(PR_SET_PDEATHSIG, SIGKILL);       // nobody waits for the pages any more
     close_range(STDERR_FILENO + 1, ~0U, 0); // whatever the host left open
-    LimitResources();
 
     standins::PrintJob job;
+    std::vector<std::string> fontFolders;
+    long totalSeconds = 0;
     CLI::App options("Prints a PDF as PostScript, from standard input to standard output.");
     AddOptions(options, job);
+    options.add_option("--fonts", fontFolders, "a folder of fonts")->allow_extra_args(false);
+    options.add_option("--total", totalSeconds, "how long it may take, in seconds")->required();
     CLI11_PARSE(options, argc, argv);
 
-    const standins::Failure failure = standins::WritePostScript(STDIN_FILENO, STDOUT_FILENO, job);
+    standins::PostScriptOutput output(STDOUT_FILENO, job);
+    const std::chrono::seconds total(totalSeconds);
+    standins::LimitResources({MostMemory, LargestFile}, {total, total});
+    if (!standins::Confine(WriterReach(fontFolders))) {
+        std::fputs("the PostScript writer cannot be kept from the rest of the machine\n", stderr);
+        return standins::CannotWrite;
+    }
+    const standins::Failure failure = standins::WritePostScript(STDIN_FILENO, output, job);
     if (!failure)
         return EXIT_SUCCESS;
     std::fprintf(stderr, "%s\n", failure.reason.c_str());

@@ -23,6 +23,7 @@ constexpr Size Paper{595, 842};
 /// A PostScript file of level 3 in the making.
 class PostScriptOutput {
 public:
+    /// Makes the temporary file that cairo gathers the sheets in, too.
     /// @param file open for writing
     PostScriptOutput(int file, const PrintJob& job);
     ~PostScriptOutput();

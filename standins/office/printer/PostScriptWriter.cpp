@@ -24,10 +24,9 @@ std::vector<Sheet> AllSheets(const std::vector<const Sheets*>& groups) {
     return all;
 }
 
-Failure Print(const std::vector<Sheet>& sheets, int postScript, const PrintJob& job) {
+Failure Print(const std::vector<Sheet>& sheets, PostScriptOutput& output, const PrintJob& job) {
     if (sheets.empty())
         return {"it has no pages"};
-    PostScriptOutput output(postScript, job);
     const auto count = static_cast<long>(sheets.size());
     for (long i = 0; i < count * job.copies && output.IsGood(); ++i) {
         const Sheet& sheet =
@@ -58,16 +57,16 @@ std::vector<Paragraph> CommentTexts(const std::vector<Comment>& comments) {
 
 } // namespace
 
-Failure WritePostScript(int document, int postScript, const PrintJob& job) {
+Failure WritePostScript(int document, PostScriptOutput& output, const PrintJob& job) {
     if (job.contents == Contents::Outline) {
         const TextSheets outline(ReadOutline(document, job.printHidden));
-        return Print(AllSheets({&outline}), postScript, job);
+        return Print(AllSheets({&outline}), output, job);
     }
     const PdfDocument pdf(document);
     const std::vector<Comment> comments = job.comments ? pdf.Comments() : std::vector<Comment>();
     const PdfSheets pages(pdf, job, comments);
     const TextSheets notes(CommentTexts(comments));
-    return Print(AllSheets({&pages, &notes}), postScript, job);
+    return Print(AllSheets({&pages, &notes}), output, job);
 }
 
 } // namespace standins

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "standins/office/printer/PostScriptOutput.h"
 #include "standins/office/printer/PrintJob.h"
 #include "standins/process/Failure.h"
 
@@ -8,9 +9,9 @@ namespace standins {
 /// Prints a document as PostScript level 3: text stays text.
 /// @param document open for reading, a regular file: a PDF, or for an outline an OpenDocument
 /// presentation
-/// @param postScript open for writing
+/// @param output new, and finished afterwards
 /// @return no failure when all is written
 /// @throws std::runtime_error when the document cannot be read
-Failure WritePostScript(int document, int postScript, const PrintJob& job);
+Failure WritePostScript(int document, PostScriptOutput& output, const PrintJob& job);
 
 } // namespace standins

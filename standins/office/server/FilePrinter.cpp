@@ -1,5 +1,6 @@
 #include "standins/office/server/FilePrinter.h"
 
+#include "standins/module/FontFolders.h"
 #include "standins/module/ModulePath.h"
 #include "standins/module/Text.h"
 #include "standins/office/printer/ExitCode.h"
@@ -36,12 +37,15 @@ const std::string WriterName = "the PostScript writer";
     RaiseCannotWrite(request, {ErrorWords(error), Fault::Machine});
 }
 
-std::vector<std::string> WriterArguments(const PrintRequest& request) {
+std::vector<std::string> WriterArguments(const PrintRequest& request, const TimeLimits& limits) {
     std::vector<std::string> arguments = {
         "--title=" + ToUtf8(request.title).value_or("document"),
         "--copies=" + std::to_string(request.copies),
+        "--total=" + std::to_string(limits.total.count()),
         request.collate ? "--collate" : "--no-collate",
     };
+    for (const std::string& folder : FontFolders())
+        arguments.push_back("--fonts=" + folder);
     const std::string user = g_get_user_name();
     if (!user.empty())
         arguments.push_back("--user=" + user);
@@ -56,8 +60,8 @@ std::uint64_t SizeOf(int file) {
 
 /// Waits for the writer, under the two clocks.
 /// @return false when it had to be ended
-bool AwaitWriter(const ChildProcess& writer, int output) {
-    Clocks clocks(ReadTimeLimits());
+bool AwaitWriter(const ChildProcess& writer, int output, const TimeLimits& limits) {
+    Clocks clocks(limits);
     for (;;) {
         pollfd event{writer.ExitDescriptor(), POLLIN, 0};
         if (poll(&event, 1, static_cast<int>(clocks.Interval().count())) > 0)
@@ -89,14 +93,15 @@ Failure DescribeWriter(int status, int messages, const MemoryShortage& shortage)
 }
 
 Failure WritePostScript(const PrintRequest& request, int output) {
+    const TimeLimits limits = ReadTimeLimits();
     const MemoryShortage shortage;
     const Descriptor messages(memfd_create("messages", MFD_CLOEXEC));
     std::optional<ChildProcess> writer =
-        ChildProcess::Start(HelperPath("pdf-to-ps"), WriterArguments(request),
-                            {request.pages->Get(), output, messages.Get()});
+        ChildProcess::Start(HelperPath("pdf-to-ps"), WriterArguments(request, limits),
+                            {request.pages->Get(), output, messages.Get()}, Environment::Empty);
     if (!writer)
         return MachineFailure(WriterName + " cannot be started", errno);
-    if (!AwaitWriter(*writer, output))
+    if (!AwaitWriter(*writer, output, limits))
         return {WriterName + " took too long"};
     return DescribeWriter(writer->Wait(), messages.Get(), shortage);
 }

@@ -1,3 +1,4 @@
+#include "tests/standins/ScriptedProgram.h"
 #include "tests/standins/distiller/BridgeTest.h"
 
 #include <gmock/gmock.h>
@@ -12,13 +13,13 @@ namespace {
 
 class GhostscriptFaultsTest : public BridgeTest {
 protected:
-    /// Puts a Ghostscript that does what a shell script says in the place of the real one. It can
-    /// start no program. Descriptor 4 is the PDF.
+    /// Puts a Ghostscript that does what a shell script says in the place of the real one.
+    /// Descriptor 4 is the PDF.
     void Replace(const std::string& script) const {
-        fs::create_directories(m_files / "bin");
-        const fs::path program = m_files.Write("bin/gs", "#!/bin/sh\n" + script + "\n");
-        fs::permissions(program, fs::perms::owner_all);
-        setenv("PATH", program.parent_path().c_str(), 1);
+        for (const char* folder : {"bin", "lib"})
+            fs::create_directories(m_files / folder);
+        WriteScriptedProgram(m_files / "bin/gs", m_files / "lib", script);
+        setenv("PATH", (m_files / "bin").c_str(), 1);
     }
 };
 

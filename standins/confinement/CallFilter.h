@@ -1,0 +1,12 @@
+#pragma once
+
+namespace standins {
+
+/// Takes from the calling process, and from what it starts, the system calls that reach beyond it:
+/// it makes no connection and no socket but local ones that others must connect to, starts no
+/// process and touches none, and changes no file but by writing to it. Threads, and another program
+/// in its own place, remain.
+/// @return false when that cannot be done
+bool DenyCalls();
+
+} // namespace standins

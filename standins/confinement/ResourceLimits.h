@@ -1,0 +1,25 @@
+#pragma once
+
+#include "standins/process/Clocks.h"
+
+#include <cstdint>
+
+namespace standins {
+
+/// What a program may use that works on a document, in bytes.
+struct ResourceLimits {
+    std::uint64_t memory = 0; ///< its address space
+    std::uint64_t largestFile = std::uint64_t{2} << 30;
+};
+
+/// Limits the address space of the calling process, and of what it starts, to `most` bytes.
+void LimitMemory(std::uint64_t most);
+
+/// The processor time that a program may use: every core busy for the whole time.
+std::uint64_t MostCpuSeconds(TimeLimits times);
+
+/// Limits everything: address space, size of a file, CPU time, no core files. To be called last:
+/// memory that others want afterwards counts too.
+void LimitResources(const ResourceLimits& limits, TimeLimits times);
+
+} // namespace standins
