@@ -156,14 +156,13 @@ TEST_F(EngineFaultsTest, PoliteSignalsDoNotKeepTheSupervisorFromItsWork) {
 TEST_F(EngineFaultsTest, NothingOutlivesAClientThatIsKilled) {
     const fs::path letter = m_files.Write("letter.docx", ReadBytes(Sample("letter.docx")) + "new");
     ExpectNothingOutlivesAKilledClient([&] { Open(letter); }, [&] { return AwaitLibreOffice(); });
-    const fs::path ready = m_files / "ready";
     ExpectNothingOutlivesAKilledClient(
         [&] {
-            const FakeEngine withOrphan("setsid sleep 600 &\n: > '" + ready.string() + "'\nwait");
+            const FakeEngine engine(": > ready; exec sleep 600");
             Open(NewDocument());
         },
         [&] {
-            Await([&] { return fs::remove(ready); });
+            AwaitInWorkFolder("ready");
             Call("DllRegisterServer"); // another client's start leaves alone what is in use
             return AwaitEngine();
         });

@@ -1,48 +1,12 @@
-#include "tests/standins/FakeEngine.h"
+#include "tests/standins/LoopbackListener.h"
 #include "tests/standins/OfficeTest.h"
 
 #include <wx/mstream.h>
 #include <wx/zipstrm.h>
 
-#include <arpa/inet.h>
-#include <poll.h>
-#include <sys/socket.h>
-#include <unistd.h>
-
-#include <cstdlib>
-
 namespace {
 
 class NetworkTest : public OfficeTest {};
-
-/// A server on this machine that answers nobody.
-class LoopbackListener {
-public:
-    LoopbackListener() : m_socket(socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0)) {
-        sockaddr_in address{};
-        socklen_t size = sizeof address;
-        address.sin_family = AF_INET;
-        address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-        EXPECT_EQ(0, bind(m_socket, reinterpret_cast<const sockaddr*>(&address), size));
-        EXPECT_EQ(0, listen(m_socket, 16));
-        getsockname(m_socket, reinterpret_cast<sockaddr*>(&address), &size);
-        m_port = std::to_string(ntohs(address.sin_port));
-    }
-    ~LoopbackListener() { close(m_socket); }
-    LoopbackListener(const LoopbackListener&) = delete;
-    LoopbackListener& operator=(const LoopbackListener&) = delete;
-
-    const std::string& Port() const { return m_port; }
-    /// Whether somebody has come.
-    bool HasVisitor() const {
-        pollfd event{m_socket, POLLIN, 0};
-        return poll(&event, 1, 0) > 0;
-    }
-
-private:
-    int m_socket;
-    std::string m_port;
-};
 
 /// The bytes of an Open XML package.
 /// @param parts by their names; $ in them stands for the address of Open XML's schemas
@@ -100,17 +64,8 @@ std::string DocumentWithLink(const std::string& picture) {
 
 TEST_F(NetworkTest, NoRequestLeavesADocument) {
     const LoopbackListener listener;
-    const std::string picture = "http://127.0.0.1:" + listener.Port() + "/picture.png";
+    const std::string picture =
+        "http://127.0.0.1:" + std::to_string(listener.Port()) + "/picture.png";
     EXPECT_EQ("", Print(m_files.Write("link.docx", DocumentWithLink(picture))));
     EXPECT_FALSE(listener.HasVisitor());
-}
-
-TEST_F(NetworkTest, AnEngineReachesNoServer) {
-    const LoopbackListener listener;
-    const std::string visit = "bash -c ': > /dev/tcp/127.0.0.1/" + listener.Port() + "'";
-    const FakeEngine engine(visit + "\n" + FakeEngine::MakePdf());
-    EXPECT_EQ("", Open(NewDocument()));
-    EXPECT_FALSE(listener.HasVisitor());
-    EXPECT_EQ(0, std::system(visit.c_str())); // NOLINT(concurrency-mt-unsafe,cert-env33-c)
-    EXPECT_TRUE(listener.HasVisitor());
 }
