@@ -26,11 +26,7 @@ const std::initializer_list<int> Absent = {
 };
 
 const std::initializer_list<int> Forbidden = {
-    // New processes, and ways out of the engine's place among them: its watch knows its group.
-    SCMP_SYS(fork),
-    SCMP_SYS(vfork),
-    SCMP_SYS(setpgid),
-    SCMP_SYS(setsid),
+    // Other surroundings.
     SCMP_SYS(unshare),
     SCMP_SYS(setns),
     // Other processes.
@@ -77,6 +73,14 @@ const std::initializer_list<int> Forbidden = {
     SCMP_SYS(bpf),
     SCMP_SYS(perf_event_open),
     SCMP_SYS(userfaultfd),
+};
+
+/// New processes, and ways out of the engine's place among them: its watch knows its group.
+const std::initializer_list<int> Forking = {
+    SCMP_SYS(fork),
+    SCMP_SYS(vfork),
+    SCMP_SYS(setpgid),
+    SCMP_SYS(setsid),
 };
 
 /// Calls that are answered as if they had been done: a program may count on them for files of its
@@ -139,14 +143,20 @@ void DenyNetwork(Filter& filter) {
     filter.Deny({SCMP_SYS(connect)}, ECONNREFUSED);
 }
 
-/// Also where it goes by an argument: a signal to a process, or by an open file; limits; a place
-/// among the processes to be run.
-void DenyOtherProcesses(Filter& filter) {
+/// A child has another number than this process, and sends itself signals, too, when it aborts.
+void DenyForking(Filter& filter) {
     const auto self = static_cast<unsigned>(getpid());
+    filter.Deny(Forking, EPERM);
     filter.DenyIf(SCMP_SYS(clone), HasBits(0, CLONE_THREAD, 0));
     for (const int call :
          {SCMP_SYS(kill), SCMP_SYS(tgkill), SCMP_SYS(rt_sigqueueinfo), SCMP_SYS(rt_tgsigqueueinfo)})
         filter.DenyIf(call, IsNot(0, self));
+    filter.DenyIf(SCMP_SYS(prctl), Is(0, PR_SET_PDEATHSIG)); // it dies with its supervisor
+}
+
+/// Also where it goes by an argument: a signal by an open file; limits; a place among the processes
+/// to be run.
+void DenyOtherProcesses(Filter& filter) {
     for (const int command : {F_SETOWN, F_SETOWN_EX})
         filter.DenyIf(SCMP_SYS(fcntl), Is(1, static_cast<unsigned>(command)));
     for (const unsigned request : {FIOSETOWN, SIOCSPGRP})
@@ -155,7 +165,6 @@ void DenyOtherProcesses(Filter& filter) {
          {SCMP_SYS(prlimit64), SCMP_SYS(sched_setaffinity), SCMP_SYS(sched_setscheduler),
           SCMP_SYS(sched_setparam), SCMP_SYS(sched_setattr)})
         filter.DenyIf(call, IsNot(0, 0));
-    filter.DenyIf(SCMP_SYS(prctl), Is(0, PR_SET_PDEATHSIG)); // it dies with its supervisor
 }
 
 /// An old Landlock lets whoever may read a file empty it on opening it.
@@ -166,7 +175,7 @@ void DenyEmptying(Filter& filter) {
 
 } // namespace
 
-bool DenyCalls() {
+bool DenyCalls(bool mayFork) {
     Filter filter;
     filter.Deny(Absent, ENOSYS);
     for (int call = FirstUnknown; call <= LastUnknown; ++call)
@@ -176,6 +185,8 @@ bool DenyCalls() {
     DenyNetwork(filter);
     DenyOtherProcesses(filter);
     DenyEmptying(filter);
+    if (!mayFork)
+        DenyForking(filter);
     return filter.Load();
 }
 

@@ -42,6 +42,7 @@ bool ConfineToFiles(const Reach& reach) {
            AllowAll(reach.files, [&](int file) { return rules.AllowFile(file); }) &&
            AllowAll(reach.socketFolders,
                     [&](const auto& path) { return rules.AllowSockets(path); }) &&
+           (!reach.mayFork || rules.AllowReading("/proc")) && // a child's own is another than here
            (reach.workFolder.empty() || rules.AllowFolder(reach.workFolder)) &&
            rules.AllowDevice("/dev/null") && rules.Enforce();
 }
@@ -70,7 +71,7 @@ void AllowFonts(Reach& reach, const std::vector<std::string>& folders) {
 
 bool Confine(const Reach& reach) {
     return HasOneThread() && ConfineToFiles(reach) && DropRights() &&
-           (!HasCallFilters() || DenyCalls());
+           (!HasCallFilters() || DenyCalls(reach.mayFork));
 }
 
 } // namespace standins

@@ -39,8 +39,8 @@ Failure RunEngine(const EngineCommand& command, const WorkFolder& folder, Engine
             return MachineFailure(EngineName + " cannot be started", errno);
         Failure ended = watch.Await(engine, [&] { return folder.Size(); });
         status = engine.End();
-        // While the folder tells of it, whatever happens to this process; and before the next start,
-        // which would take itself for a second one.
+        // While the folder tells of it, whatever happens to this process; and before the next
+        // start, which would take itself for a second one.
         RemoveSocket(folder.Path());
         if (ended)
             return ended;

@@ -1,6 +1,9 @@
+#include "standins/confinement/Confinement.h"
+
 #include "standins/module/SupervisedRun.h"
 #include "standins/process/WorkFolder.h"
 #include "tests/standins/LoopbackListener.h"
+#include "tests/standins/confinement/Attempts.h"
 #include "tests/support/TemporaryFolder.h"
 
 #include <fcntl.h>
@@ -13,6 +16,7 @@
 
 #include <csignal>
 #include <cstdlib>
+#include <fstream>
 
 namespace fs = std::filesystem;
 using namespace std::chrono_literals;
@@ -102,6 +106,19 @@ protected:
     OtherProcess m_process;
 };
 
+/// In a process of its own, which ends as one does that finds its memory damaged.
+/// @param anothers a file that belongs to another child
+[[noreturn]] void AttemptAsChild(const fs::path& own, const fs::path& anothers,
+                                 const std::string& targets) {
+    standins::Reach reach;
+    reach.workFolder = own;
+    fs::current_path(own);
+    if (standins::Confine(reach) && access(anothers.c_str(), F_OK) == 0 &&
+        open(anothers.c_str(), O_RDONLY | O_CLOEXEC) < 0)
+        std::ofstream("outcomes") << Attempt(targets) << std::flush;
+    std::abort();
+}
+
 std::string ReadWhole(int file) {
     return ReadBytes("/proc/self/fd/" + std::to_string(file));
 }
@@ -133,6 +150,25 @@ TEST_F(ConfinementTest, LibreOfficeReachesNothing) {
             {document.Get()});
     ASSERT_EQ(standins::MessageKind::Done, result.kind) << result.text;
     ExpectRefused(ReadWhole(result.attachment.Get()));
+}
+
+TEST_F(ConfinementTest, AForkedChildReachesNoMoreThanItsOwn) {
+    const fs::path own = m_engine / "bin";
+    const pid_t parent = fork();
+    if (parent == 0) {
+        standins::Reach ofAll;
+        ofAll.workFolder = m_engine.Path();
+        ofAll.mayFork = true;
+        const pid_t child = standins::Confine(ofAll) ? fork() : -1;
+        if (child == 0)
+            AttemptAsChild(own, m_engine / "lib/targets", Targets());
+        int status = 0;
+        _exit(waitpid(child, &status, 0) == child && WIFSIGNALED(status) ? WTERMSIG(status) : 0);
+    }
+    int status = 0;
+    EXPECT_EQ(parent, waitpid(parent, &status, 0));
+    EXPECT_EQ(SIGABRT, WEXITSTATUS(status));
+    ExpectRefused(ReadBytes(own / "outcomes"));
 }
 
 TEST_F(ConfinementTest, GhostscriptReachesNothing) {

@@ -31,7 +31,7 @@ int main(int argc, char** argv) {
         Write("document.pdf", ReadTargets(program));
     else if (program.filename() == "gs")
         Write("/dev/fd/4", ReadTargets(program));
-    else if (argc == 2) // else it was started by itself
+    else if (argc == 2)
         Write("/dev/stdout", argv[1]);
     std::_Exit(EXIT_SUCCESS); // sanitizers would look for leaks by another process
 }
