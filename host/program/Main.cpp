@@ -1,7 +1,9 @@
 #include "host/program/PathText.h"
 #include "host/program/commands/CommandLine.h"
 #include "host/program/commands/Commands.h"
+#include "host/program/machine/Engines.h"
 #include "host/program/machine/MachineSetup.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/machine/ProgramFiles.h"
 #include "host/program/report/Language.h"
 #include "host/program/report/LogRoutes.h"
@@ -43,6 +45,22 @@ std::filesystem::path FolderOr(const std::optional<std::string>& given, const ch
     return given ? std::filesystem::absolute(FromArgument(*given)) : ProgramFolder() / standard;
 }
 
+/// Tells what documents are not kept from: whoever has required that they are, or else the log.
+/// @return whether documents may be opened, as far as the command opens any
+bool IsIsolatedEnough(const CommandLine& line, Reporter& reporter) {
+    const bool opensDocuments = line.command == Command::Screen || line.command == Command::Convert;
+    const std::optional<MissingPart> missing = FindMissingIsolation();
+    if (opensDocuments && line.requireIsolation && missing) {
+        reporter.Error(missing->Text());
+        return false;
+    }
+    const std::optional<EngineIsolation> isolation = IsolationOfEngines();
+    if (opensDocuments && isolation && !isolation->missing.empty())
+        SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+            << "Documents are not isolated: " << isolation->missing;
+    return true;
+}
+
 ExitCode Run(const CommandLine& line) {
     Reporter reporter(line.json);
     const bool hasLog = StartLog(line);
@@ -55,11 +73,14 @@ ExitCode Run(const CommandLine& line) {
         return ExitCode::WrongUsage;
     }
     Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
-    SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds});
+    SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds,
+                  line.memoryMegabytes});
+    if (!IsIsolatedEnough(line, reporter))
+        return ExitCode::MachineAtFault;
     const std::filesystem::path filtersFolder = FolderOr(line.filtersFolder, "Filters");
     switch (line.command) {
     case Command::Status:
-        return RunStatus(filtersFolder, reporter);
+        return RunStatus(line, filtersFolder, reporter);
     case Command::Screen:
         return RunScreen(line, filtersFolder, reporter);
     case Command::Convert:

@@ -18,7 +18,8 @@ void Limit(__rlimit_resource resource, rlim_t soft, rlim_t hard) {
 
 void LimitMemory([[maybe_unused]] std::uint64_t most) {
 #ifndef __SANITIZE_ADDRESS__ // whose shadow memory takes terabytes of address space
-    Limit(RLIMIT_AS, most, most);
+    constexpr std::uint64_t Unused = std::uint64_t{1} << 30;
+    Limit(RLIMIT_AS, most + Unused, most + Unused);
 #endif
 }
 

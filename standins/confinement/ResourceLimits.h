@@ -8,11 +8,13 @@ namespace standins {
 
 /// What a program may use that works on a document, in bytes.
 struct ResourceLimits {
-    std::uint64_t memory = 0; ///< its address space
+    std::uint64_t memory = 0;
     std::uint64_t largestFile = std::uint64_t{2} << 30;
 };
 
-/// Limits the address space of the calling process, and of what it starts, to `most` bytes.
+/// Limits the address space of the calling process, and of each that it starts: to `most` bytes and
+/// a GiB more, since libraries take addresses without using the memory. Bounds what is taken
+/// between two looks at the memory in use.
 void LimitMemory(std::uint64_t most);
 
 /// The processor time that a program may use: every core busy for the whole time.

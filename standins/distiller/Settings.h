@@ -4,7 +4,8 @@ namespace standins {
 
 /// Under HKEY_LOCAL_MACHINE the engine's name and version, "Engine", entered by registration. Under
 /// HKEY_CURRENT_USER the folders of profiles, entered by the host; there, or else under
-/// HKEY_LOCAL_MACHINE, the limits: the numbers "StallSeconds" and "TotalSeconds".
+/// HKEY_LOCAL_MACHINE, the limits: the numbers "StallSeconds", "TotalSeconds" and
+/// "MemoryMegabytes".
 constexpr const wchar_t* DistillerSettingsKey = L"SOFTWARE\\Orvanta\\Distiller Stand-In";
 constexpr const wchar_t* DistillerEngineValue = L"Engine";
 constexpr const wchar_t* UserProfilesValue = L"UserProfiles";

@@ -1,7 +1,6 @@
 #include "standins/engine/EngineWatch.h"
 
 #include "standins/engine/EngineFailure.h"
-#include "standins/process/ProcessTable.h"
 
 #include <poll.h>
 
@@ -16,9 +15,10 @@ constexpr std::uint64_t MostBytes = std::uint64_t{4} << 30; // in all files toge
 
 } // namespace
 
-EngineWatch::EngineWatch(std::string engine, TimeLimits limits, const Channel& server)
-    : m_engine(std::move(engine)), m_limits(limits), m_clocks(limits), m_server(server),
-      m_heartbeat(server) {}
+EngineWatch::EngineWatch(std::string engine, TimeLimits limits, std::uint64_t mostMemory,
+                         const Channel& server)
+    : m_engine(std::move(engine)), m_limits(limits), m_mostMemory(mostMemory), m_clocks(limits),
+      m_server(server), m_heartbeat(server) {}
 
 Failure EngineWatch::Await(const EngineProcess& engine,
                            const std::function<std::uint64_t()>& bytesWritten) {
@@ -33,16 +33,18 @@ Failure EngineWatch::Await(const EngineProcess& engine,
             return {"nobody waits for it any more", Fault::Outside};
         if (events[0].revents != 0)
             return {};
-        Failure ended = Check({CpuTicksOfGroup(engine.Group()), bytesWritten()});
+        Failure ended = Check(UsageOfGroup(engine.Group()), bytesWritten());
         if (ended)
             return ended;
     }
 }
 
-Failure EngineWatch::Check(const LifeSign& sign) {
-    if (sign.bytesWritten > MostBytes)
+Failure EngineWatch::Check(const GroupUsage& usage, std::uint64_t bytesWritten) {
+    if (usage.memory > m_mostMemory)
+        return MemoryFailure(m_engine, m_mostMemory);
+    if (bytesWritten > MostBytes)
         return {m_engine + " wrote more than it may"};
-    switch (m_clocks.Check(sign)) {
+    switch (m_clocks.Check({usage.cpuTicks, bytesWritten})) {
     case Clocks::State::Stalled:
         return StallFailure(m_engine, m_limits);
     case Clocks::State::Overdue:

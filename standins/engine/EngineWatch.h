@@ -5,6 +5,7 @@
 #include "standins/process/Channel.h"
 #include "standins/process/Clocks.h"
 #include "standins/process/Failure.h"
+#include "standins/process/ProcessTable.h"
 
 #include <cstdint>
 #include <functional>
@@ -12,13 +13,16 @@
 
 namespace standins {
 
-/// The watch over an engine's work on one document, under the two clocks; the engine may be started
+/// The watch over an engine's work on one document, under the two clocks and
+/// the limit on memory; the engine may be started
 /// more than once meanwhile.
 class EngineWatch {
 public:
     /// @param engine its name, for messages
+    /// @param mostMemory of all its processes together, in bytes
     /// @param server is told that the work goes on; when it goes, the work is over
-    EngineWatch(std::string engine, TimeLimits limits, const Channel& server);
+    EngineWatch(std::string engine, TimeLimits limits, std::uint64_t mostMemory,
+                const Channel& server);
 
     /// Waits for the engine.
     /// @param bytesWritten answers how much it has written so far
@@ -26,10 +30,11 @@ public:
     Failure Await(const EngineProcess& engine, const std::function<std::uint64_t()>& bytesWritten);
 
 private:
-    Failure Check(const LifeSign& sign);
+    Failure Check(const GroupUsage& usage, std::uint64_t bytesWritten);
 
     std::string m_engine;
     TimeLimits m_limits;
+    std::uint64_t m_mostMemory;
     Clocks m_clocks;
     const Channel& m_server;
     Heartbeat m_heartbeat;

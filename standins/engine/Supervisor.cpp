@@ -38,6 +38,7 @@ void SupervisorOptions::AddTo(CLI::App& options) {
     options.add_option("--fonts", fontFolders, "a folder of fonts")->allow_extra_args(false);
     options.add_option("--stall", stallSeconds)->required();
     options.add_option("--total", totalSeconds)->required();
+    options.add_option("--memory", mostMemory)->required();
 }
 
 TimeLimits SupervisorOptions::Limits() const {

@@ -20,6 +20,7 @@ struct SupervisorOptions {
     std::vector<std::string> fontFolders;
     long stallSeconds = 0;
     long totalSeconds = 0;
+    std::uint64_t mostMemory = 0; ///< for the document, in bytes
 
     void AddTo(CLI::App& options);
     TimeLimits Limits() const;
@@ -28,7 +29,7 @@ struct SupervisorOptions {
 /// Makes the calling process a supervisor: it keeps nothing but what it was given, ends with its
 /// server and not by signals, and ends what it starts.
 /// @param given how many descriptors it got beside the channel
-/// @param mostMemory its own address space, in bytes
+/// @param mostMemory its own, in bytes; no engine of its gets more
 /// @return the channel to the server
 Channel BecomeSupervisor(int given, std::uint64_t mostMemory);
 

@@ -38,6 +38,7 @@ std::optional<ChildProcess> StartSupervisor(const SupervisedRun& run, const Chan
         "--folder=" + run.folder,
         "--stall=" + std::to_string(run.limits.stall.count()),
         "--total=" + std::to_string(run.limits.total.count()),
+        "--memory=" + std::to_string(run.mostMemory),
     };
     for (const std::string& folder : FontFolders())
         arguments.push_back("--fonts=" + folder);

@@ -18,6 +18,7 @@ struct SupervisedRun {
     std::string folder;                 ///< the work folder, not made yet
     WorkFolder::ClearOutside clearOutside = nullptr;
     TimeLimits limits{};
+    std::uint64_t mostMemory = 0; ///< in bytes
 };
 
 /// Runs it, and returns when nothing of the run is left: no process, no file. The supervisor sees

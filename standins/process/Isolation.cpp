@@ -18,7 +18,7 @@ std::string WhyNoLandlock(int error) {
     case ENOSYS:
         return "the kernel has no Landlock, which needs Linux 5.13, or a container keeps it away";
     case EOPNOTSUPP:
-        return "Landlock is switched off; the kernel's parameter lsm= must list it";
+        return "Landlock is switched off, and must be named in the kernel's parameter lsm=";
     default:
         return "Landlock cannot be used: " + std::generic_category().message(error);
     }

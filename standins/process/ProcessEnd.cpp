@@ -70,6 +70,10 @@ bool MemoryShortage::HasStruck() const {
     return MemoryKills() > m_before;
 }
 
+Failure MemoryFailure(const std::string& program, std::uint64_t most) {
+    return {program + " took more than " + std::to_string(most >> 20) + " MB of memory"};
+}
+
 Failure DescribeEnd(const std::string& program, int status, const MemoryShortage& shortage) {
     if (WIFSIGNALED(status))
         return DescribeSignal(program, WTERMSIG(status), shortage);

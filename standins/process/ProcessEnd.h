@@ -18,6 +18,10 @@ private:
     std::uint64_t m_before;
 };
 
+/// Of a program that had to be ended.
+/// @param most bytes that it may take
+Failure MemoryFailure(const std::string& program, std::uint64_t most);
+
 /// Why a program came to its end.
 /// @param program its name, for people
 /// @param status as waitpid gives it, of a program that this process has not ended itself

@@ -65,6 +65,18 @@ ProcessStatus ReadStatus(pid_t process) {
     return status;
 }
 
+/// In memory and swapped out.
+std::uint64_t MemoryOf(pid_t process) {
+    std::istringstream entries(ReadProcFile(process, "smaps_rollup"));
+    std::uint64_t kilobytes = 0;
+    for (std::string word; entries >> word;) {
+        std::uint64_t number = 0;
+        if ((word == "Pss:" || word == "SwapPss:") && entries >> number)
+            kilobytes += number;
+    }
+    return kilobytes << 10;
+}
+
 void KillChildren() {
     const pid_t self = getpid();
     for (const pid_t process : AllProcesses()) {
@@ -91,12 +103,14 @@ Descriptor WatchProcess(pid_t process) {
     return Descriptor(static_cast<int>(syscall(SYS_pidfd_open, process, 0)));
 }
 
-std::uint64_t CpuTicksOfGroup(pid_t group) {
-    std::uint64_t sum = 0;
+GroupUsage UsageOfGroup(pid_t group) {
+    GroupUsage sum;
     for (const pid_t process : AllProcesses()) {
         const ProcessStatus status = ReadStatus(process);
-        if (status.group == group)
-            sum += status.ticks;
+        if (status.group != group)
+            continue;
+        sum.cpuTicks += status.ticks;
+        sum.memory += MemoryOf(process);
     }
     return sum;
 }

@@ -13,9 +13,14 @@ namespace standins {
 /// set, when there is none to be had
 Descriptor WatchProcess(pid_t process);
 
-/// The CPU time that the processes of a group, and what they waited for, have used so far.
-/// @return in clock ticks
-std::uint64_t CpuTicksOfGroup(pid_t group);
+/// What the processes of a group use together.
+struct GroupUsage {
+    std::uint64_t cpuTicks = 0; ///< so far, with what they waited for
+    std::uint64_t memory = 0;   ///< now, in bytes; what is shared with others counts by its share
+};
+
+/// @return zeros when there is no such group
+GroupUsage UsageOfGroup(pid_t group);
 
 /// Kills the children of the calling process and waits for them, again and again, until none is
 /// left. Where orphans fall to the caller (PR_SET_CHILD_SUBREAPER) this ends all its descendants,

@@ -5,12 +5,14 @@
 #include <windows.h>
 
 #include <wx/string.h>
+#include <wx/utils.h>
 // After the strings, which it takes for granted.
 #include <wx/msw/registry.h>
 
 namespace {
 
 const wxString OwnKey = "SOFTWARE\\Orvanta\\Office Stand-Ins";
+const wxString IsolationKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Isolation";
 const wxString InstallationKey = "SOFTWARE\\Orvanta\\Marlo Quillon";
 const wxString DistillerStandInKey = "SOFTWARE\\Orvanta\\Distiller Stand-In";
 const wxString DistillerKey = "SOFTWARE\\Adobe\\Acrobat Distiller\\9.0";
@@ -41,10 +43,13 @@ STDAPI DllRegisterServer() {
     }
 
     EnterText(wxRegKey::HKLM, OwnKey, "Engine",
-              wxString::Format("Scripted engine, %ld of %ld s, output %ld of %ld s",
+              wxString::Format("Scripted engine, %ld of %ld s, %ld MB, output %ld of %ld s",
                                Number(OwnKey, "StallSeconds"), Number(OwnKey, "TotalSeconds"),
+                               Number(OwnKey, "MemoryMegabytes"),
                                Number(InstallationKey, "OutputStallSeconds"),
                                Number(InstallationKey, "OutputTotalSeconds")));
+    EnterText(wxRegKey::HKLM, IsolationKey, "Means", "Scripted walls");
+    EnterText(wxRegKey::HKLM, IsolationKey, "Missing", wxString(wxGetenv("SCRIPTED_GAP")));
     EnterText(wxRegKey::HKLM, InstallationKey, "InstallPath", TEST_INSTALLATION);
     EnterText(wxRegKey::HKLM, DistillerStandInKey, "Engine", "Scripted Distiller");
     EnterText(wxRegKey::HKLM, DistillerKey, "JobOptionsFolder", TEST_PROFILES);
@@ -54,7 +59,8 @@ STDAPI DllRegisterServer() {
 STDAPI DllUnregisterServer() {
     for (const wxString& progId : ProgIds)
         wxRegKey(wxRegKey::HKCR, progId).DeleteSelf();
-    for (const wxString& key : {OwnKey, InstallationKey, DistillerStandInKey, DistillerKey})
+    for (const wxString& key :
+         {OwnKey, IsolationKey, InstallationKey, DistillerStandInKey, DistillerKey})
         wxRegKey(wxRegKey::HKLM, key).DeleteSelf();
     for (const wxString& key : {OwnKey, DistillerStandInKey})
         wxRegKey(wxRegKey::HKCU, key).DeleteSelf();

@@ -47,10 +47,42 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(run.Records("summary").at(0)["convertible"], (json{"doc", "docx", "xls", "xlsx"}));
 }
 
-TEST(Status, HandsTheClocksToTheEnginesAndTheFilters) {
-    const RunResult run = RunQuillon({"status", "--engine-stall", "5", "--engine-limit", "60"});
-    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s, output 5 of 60 s")) << run.out;
-    EXPECT_TRUE(Contains(RunQuillon({"status"}).out, "Scripted engine, 0 of 0 s, output 0 of 0 s"));
+TEST(Status, HandsTheLimitsToTheEnginesAndTheFilters) {
+    const RunResult run = RunQuillon(
+        {"status", "--engine-stall", "5", "--engine-limit", "60", "--memory-limit", "512"});
+    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s, 512 MB, output 5 of 60 s"))
+        << run.out;
+    EXPECT_TRUE(Contains(RunQuillon({"status"}).out,
+                         "Scripted engine, 0 of 0 s, 3072 MB, output 0 of 0 s"));
+}
+
+TEST(Status, TellsWhatDocumentsAreNotKeptFrom) {
+    EXPECT_TRUE(
+        Contains(RunQuillon({"status", "--require-isolation"}).out, "full (Scripted walls)"));
+    const TemporaryFolder folder;
+    const std::string document = folder.Write("letter.docx", "PK\x03\x04\n").u8string();
+    const std::string gap = "network and processes are not kept from documents";
+    const std::vector<std::string> convert = {"convert", document, "--out", document + ".out"};
+    wxSetEnv("SCRIPTED_GAP", gap);
+    const RunResult status = RunQuillon({"status"});
+    const RunResult warned = RunQuillon(convert);
+    std::vector<std::string> requiring = convert;
+    requiring.emplace_back("--require-isolation");
+    const RunResult refused = RunQuillon(requiring);
+    const RunResult incomplete = RunQuillon({"status", "--require-isolation", "--lang", "de"});
+    wxUnsetEnv("SCRIPTED_GAP");
+
+    EXPECT_EQ(status.exitCode, 0) << status.out;
+    EXPECT_TRUE(Contains(status.out, "incomplete: " + gap)) << status.out;
+    EXPECT_EQ(warned.exitCode, 0) << warned.err;
+    EXPECT_TRUE(Contains(warned.err, "WARN") && Contains(warned.err, gap)) << warned.err;
+    EXPECT_EQ(refused.exitCode, 2);
+    EXPECT_TRUE(Contains(refused.err, gap) && Contains(refused.err, "or without --require"))
+        << refused.err;
+    EXPECT_EQ(refused.out, "");
+    EXPECT_EQ(incomplete.exitCode, 2);
+    EXPECT_TRUE(Contains(incomplete.out, "Es fehlt: Dokumente sind nicht von Netzwerk"))
+        << incomplete.out;
 }
 
 TEST(Status, TellsWhatIsMissingAndWhatToDo) {

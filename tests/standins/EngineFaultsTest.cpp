@@ -95,6 +95,14 @@ TEST_F(EngineFaultsTest, AnEngineThatDoesNotEndIsEnded) {
     ExpectFailure("while :; do :; done", "LibreOffice took longer than 3 seconds");
 }
 
+TEST_F(EngineFaultsTest, AnEngineThatTakesTooMuchMemoryIsEnded) {
+    SetLimit("StallSeconds", 5);
+    SetLimit("MemoryMegabytes", 16);
+    ExpectFailure("A=0123456789ABCDEF; while test ${#A} -lt 40000000; do A=$A$A; done\n"
+                  "while :; do :; done",
+                  "LibreOffice took more than 16 MB of memory");
+}
+
 TEST_F(EngineFaultsTest, AnEngineThatIsRemovedWhileAClientRunsIsTold) {
     WriteRegistryText(HKEY_LOCAL_MACHINE, L"SOFTWARE\\Orvanta\\Office Stand-Ins", L"EnginePath",
                       L"/nowhere");

@@ -12,6 +12,7 @@
 namespace {
 
 constexpr unsigned LongestSeconds = 24 * 60 * 60;
+constexpr unsigned MostMegabytes = 1 << 20;
 constexpr unsigned MostJobs = 64;
 
 constexpr const char* Description =
@@ -45,7 +46,7 @@ Exit codes
   0  done; for status: ready to convert; for settings: saved, or left as they were
   1  some documents were refused or could not be converted
   2  the machine is at fault: no Office application, no printer, no filter, a full disk, no more
-     processes, an engine that was ended from outside, when it was tried again, too; for
+     processes, no isolation where it is required, an engine that was ended from outside, when it was tried again, too; for
      settings: no display to show them on
   3  wrong usage: the command line, the settings file or the output folder
   4  interrupted: Ctrl-C, or a request to end, came before all was done. What is under way is
@@ -57,7 +58,7 @@ Output
   LC_MESSAGES or LANG. In English are this help, the log, what is wrong with a command line, and
   what the system or an engine's libraries say in their own words.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
-  printer, distiller, panel, missing, document, summary and error; lines for people then go to
+  printer, distiller, isolation, panel, missing, document, summary and error; lines for people then go to
   stderr. The "code", the "state" and the "fault" (document, machine or null) of a document are the
   same in every language.
 )";
@@ -149,6 +150,13 @@ void AddCommonOptions(CLI::App& app, CommandLine& line) {
                    "that it prints to be whole, 1800 if not given")
         ->type_name("SECONDS")
         ->check(seconds);
+    app.add_option("--memory-limit", line.memoryMegabytes,
+                   "How much memory engines may take for a document, all of its processes\n"
+                   "together, 3072 if not given")
+        ->type_name("MB")
+        ->check(CLI::Range(256U, MostMegabytes));
+    app.add_flag("--require-isolation", line.requireIsolation,
+                 "Open no document unless it is kept from the rest of the machine; see status");
     app.add_option("--filters", line.filtersFolder,
                    "The folder of filters, if not Filters beside the program")
         ->type_name("DIR");

@@ -9,7 +9,8 @@
 // The program's commands. Each answers with the code to end with.
 
 /// `quillon status`: says what there is to convert with, and what is missing.
-ExitCode RunStatus(const std::filesystem::path& filtersFolder, Reporter& reporter);
+ExitCode RunStatus(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                   Reporter& reporter);
 
 /// `quillon screen`: says of each file whether it can be converted.
 ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,

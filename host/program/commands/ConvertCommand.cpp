@@ -82,6 +82,7 @@ std::vector<std::string> WorkerArguments(const CommandLine& line) {
     pass("--stand-ins", line.standInsFolder);
     pass("--engine-stall", text(line.stallSeconds));
     pass("--engine-limit", text(line.limitSeconds));
+    pass("--memory-limit", std::to_string(line.memoryMegabytes));
     pass("--log", line.logFile);
     pass("--lang", line.language);
     if (line.verbose)

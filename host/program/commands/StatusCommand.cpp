@@ -145,6 +145,23 @@ void TellDistiller(Reporter& reporter) {
         {{"type", "distiller"}, {"engine", JsonText(engine)}, {"profiles", ListOf(profiles)}});
 }
 
+void TellIsolation(unsigned memoryMegabytes, Reporter& reporter) {
+    const std::optional<EngineIsolation> isolation = IsolationOfEngines();
+    const wxString means = isolation ? isolation->means : wxString();
+    const std::optional<MissingPart> missing = FindMissingIsolation();
+    reporter.Line(_("Isolation"));
+    reporter.Line("  " + OneLine(missing ? wxString::Format(_("incomplete: %s"), missing->what)
+                                         : wxString::Format(_("full (%s)"), means)));
+    if (isolation)
+        reporter.Line(
+            "  " + wxString::Format(_("at most %u MB of memory for a document"), memoryMegabytes));
+    reporter.Record({{"type", "isolation"},
+                     {"full", !missing},
+                     {"means", JsonText(means)},
+                     {"missing", JsonText(missing ? missing->what : wxString())},
+                     {"memoryMegabytes", isolation ? Json(memoryMegabytes) : Json()}});
+}
+
 void TellPanel(const FilterSet& filters, Reporter& reporter) {
     const wxString obstacle = filters.Filters().empty() ? _("there is no filter") : PanelObstacle();
     reporter.Line(_("Settings panel"));
@@ -186,13 +203,15 @@ std::vector<MissingPart> FindObstacles(const FilterSet& filters) {
     return obstacles;
 }
 
-ExitCode TellReadiness(const FilterSet& filters, Reporter& reporter) {
+ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter) {
     const wxArrayString convertible = ListConvertible(filters);
     std::vector<MissingPart> missing;
     if (convertible.empty())
         missing = FindObstacles(filters);
     if (const auto pdfMaker = FindMissingPdfMaker())
         missing.push_back(*pdfMaker);
+    if (const auto isolation = FindMissingIsolation(); isolation && requireIsolation)
+        missing.push_back(*isolation);
     for (const MissingPart& part : missing) {
         reporter.Line(wxString::Format(_("Missing: %s"), part.Text()));
         reporter.Record({{"type", "missing"},
@@ -210,12 +229,14 @@ ExitCode TellReadiness(const FilterSet& filters, Reporter& reporter) {
 
 } // namespace
 
-ExitCode RunStatus(const std::filesystem::path& filtersFolder, Reporter& reporter) {
+ExitCode RunStatus(const CommandLine& line, const std::filesystem::path& filtersFolder,
+                   Reporter& reporter) {
     const FilterSet filters(filtersFolder);
     TellFilters(filters, filtersFolder, reporter);
     TellApplications(reporter);
     TellPrinters(reporter);
     TellDistiller(reporter);
+    TellIsolation(line.memoryMegabytes, reporter);
     TellPanel(filters, reporter);
-    return TellReadiness(filters, reporter);
+    return TellReadiness(filters, line.requireIsolation, reporter);
 }

@@ -12,6 +12,16 @@ wxString EngineOf(const char* standIn) {
 
 } // namespace
 
+std::optional<EngineIsolation> IsolationOfEngines() {
+    const auto read = [](const char* value) {
+        return ReadRegistryText(wxRegKey::HKLM, IsolationKey, value);
+    };
+    const std::optional<wxString> means = read(IsolationMeansValue);
+    if (!means)
+        return std::nullopt;
+    return EngineIsolation{*means, read(IsolationMissingValue).value_or(wxString())};
+}
+
 wxString OfficeEngine() {
     return EngineOf(StandInsKey);
 }

@@ -65,11 +65,12 @@ void EnterSeconds(const char* keyName, const char* valueName, std::optional<unsi
         key.DeleteValue(valueName);
 }
 
-/// Sets the clocks on Office's engine, on Distiller's and on the file that Office prints into.
-void EnterClocks(const MachineSetup& setup) {
+/// Sets the limits of Office's engine, of Distiller's and of the file that Office prints into.
+void EnterLimits(const MachineSetup& setup) {
     for (const char* keyName : {StandInsKey, DistillerStandInKey}) {
         EnterSeconds(keyName, StallSecondsValue, setup.stallSeconds);
         EnterSeconds(keyName, TotalSecondsValue, setup.limitSeconds);
+        Enter(wxRegKey::HKCU, keyName, MemoryValue, static_cast<long>(setup.memoryMegabytes));
     }
     EnterSeconds(HostKey, OutputStallSecondsValue, setup.stallSeconds);
     EnterSeconds(HostKey, OutputTotalSecondsValue, setup.limitSeconds);
@@ -79,7 +80,7 @@ void EnterClocks(const MachineSetup& setup) {
 
 void SetUpMachine(const MachineSetup& setup) {
     Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
-    EnterClocks(setup);
+    EnterLimits(setup);
     RegisterStandIns(setup.standInsFolder);
     AddFilePrinter(ProgramFolder() / "Printers" / "QuillonPS.ppd");
 }

@@ -9,8 +9,9 @@ struct MachineSetup {
     /// How long an engine may show no sign of life, and what it prints not grow.
     std::optional<unsigned> stallSeconds;
     std::optional<unsigned> limitSeconds; ///< how long each may take altogether
+    unsigned memoryMegabytes = 0;         ///< how much memory engines may take for a document
 };
 
-/// Enters where the program is installed, the engines' clocks, the Office stand-ins and the file
+/// Enters where the program is installed, the engines' limits, the Office stand-ins and the file
 /// printer. What fails is told by the log; filters then find it missing.
 void SetUpMachine(const MachineSetup& setup);

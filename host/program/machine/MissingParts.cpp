@@ -3,6 +3,7 @@
 #include "host/program/PathText.h"
 #include "host/program/machine/Engines.h"
 #include "host/program/machine/FilePrinter.h"
+#include "host/program/report/Reasons.h"
 #include "host/program/system/InstallAdvice.h"
 #include "machine/FiltersFolder.h"
 #include "machine/InstalledOffice.h"
@@ -99,6 +100,16 @@ std::optional<MissingPart> FindMissingPdfMaker() {
         return MissingPart{_("There is nothing to make PDF files with"),
                            OrPostScript(PdfInstallAdvice()), Result::PdfConversionFailed};
     return std::nullopt;
+}
+
+std::optional<MissingPart> FindMissingIsolation() {
+    const std::optional<EngineIsolation> isolation = IsolationOfEngines();
+    if (isolation && isolation->missing.empty())
+        return std::nullopt;
+    return MissingPart{isolation ? TranslateReason(isolation->missing)
+                                 : _("the applications open documents with all rights of the user"),
+                       _("Work on a system that has what is missing, or without "
+                         "--require-isolation")};
 }
 
 std::optional<MissingPart> FindMissingFor(const wxString& extension) {

@@ -26,6 +26,8 @@ std::optional<MissingPart> FindMissingApplication(OfficeApplication application)
 std::optional<MissingPart> FindMissingPrinter();
 /// What makes PDF files.
 std::optional<MissingPart> FindMissingPdfMaker();
+/// What keeps documents from the rest of the machine.
+std::optional<MissingPart> FindMissingIsolation();
 /// What files with the extension need to be printed.
 /// @param extension without the dot; nothing is known of those that no Office application serves
 std::optional<MissingPart> FindMissingFor(const wxString& extension);

@@ -13,10 +13,17 @@ constexpr const char* LastFailureKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failu
 constexpr const char* FailureReasonValue = "Reason";
 constexpr const char* FailureFaultValue = "Fault";
 
+/// Under HKEY_LOCAL_MACHINE what keeps their engines from the rest of the machine, by its names,
+/// and what is missing there.
+constexpr const char* IsolationKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Isolation";
+constexpr const char* IsolationMeansValue = "Means";
+constexpr const char* IsolationMissingValue = "Missing";
+
 constexpr const char* EngineValue = "Engine"; ///< said: name and version of the engine
 
 constexpr const char* StallSecondsValue = "StallSeconds"; ///< told: a number
 constexpr const char* TotalSecondsValue = "TotalSeconds"; ///< told: a number
+constexpr const char* MemoryValue = "MemoryMegabytes";    ///< told: a number
 /// Told the Distiller stand-in: where the profiles lie that it is asked for by name.
 constexpr const char* UserProfilesValue = "UserProfiles";
 constexpr const char* JobOptionsFolderValue = "JobOptionsFolder";

@@ -4,11 +4,11 @@
 #include "standins/distiller/Settings.h"
 #include "standins/distiller/bridge/Profiles.h"
 #include "standins/module/DocumentFile.h"
+#include "standins/module/LimitSettings.h"
 #include "standins/module/ModulePath.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/SupervisedRun.h"
 #include "standins/module/Text.h"
-#include "standins/module/TimeSettings.h"
 #include "standins/process/NewFile.h"
 #include "standins/process/WorkFolder.h"
 
@@ -89,6 +89,7 @@ SupervisedRun PrepareRun(const Descriptor& postScript, const NewFile& pdf,
     }
     run.folder = WorkFolder::NewPath(DistillerFolderKind);
     run.limits = ReadTimeLimits(DistillerSettingsKey, {60s, 600s});
+    run.mostMemory = ReadMemoryLimit(DistillerSettingsKey);
     return run;
 }
 

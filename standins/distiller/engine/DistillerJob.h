@@ -2,6 +2,7 @@
 
 #include "standins/process/Clocks.h"
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -13,9 +14,10 @@ struct DistillerJob {
     std::string folder;  ///< the work folder, not made yet
     std::vector<std::string> fontFolders;
     TimeLimits limits{};
-    int postScript = -1; ///< open for reading
-    int pdf = -1;        ///< open for writing, empty
-    int profile = -1;    ///< the job options, open for reading; -1 for Ghostscript's own defaults
+    std::uint64_t mostMemory = 0; ///< in bytes, all processes together
+    int postScript = -1;          ///< open for reading
+    int pdf = -1;                 ///< open for writing, empty
+    int profile = -1; ///< the job options, open for reading; -1 for Ghostscript's own defaults
 };
 
 } // namespace standins

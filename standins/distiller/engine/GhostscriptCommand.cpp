@@ -60,7 +60,7 @@ EngineCommand GhostscriptCommand(const WorkFolder& folder, const DistillerJob& j
     if (job.profile >= 0)
         command.descriptors.push_back(job.profile);
     command.times = job.limits;
-    command.resources.memory = MostGhostscriptMemory;
+    command.resources.memory = job.mostMemory;
     command.reach = GhostscriptReach(folder, job);
     return command;
 }

@@ -4,13 +4,9 @@
 #include "standins/engine/EngineProcess.h"
 #include "standins/process/WorkFolder.h"
 
-#include <cstdint>
 #include <string>
 
 namespace standins {
-
-/// What Ghostscript may take of the address space, in bytes.
-constexpr std::uint64_t MostGhostscriptMemory = std::uint64_t{2} << 30;
 
 /// What Ghostscript says when it has read the profile to its end.
 constexpr const char* ProfileIsRead = "%%[Profile is read]%%";

@@ -20,10 +20,11 @@ int Run(int argc, char** argv) {
     options.add_flag("--profile", hasProfile, "it gets a profile, too");
     CLI11_PARSE(options, argc, argv);
     const standins::Channel bridge =
-        standins::BecomeSupervisor(hasProfile ? 3 : 2, standins::MostGhostscriptMemory);
+        standins::BecomeSupervisor(hasProfile ? 3 : 2, supervisor.mostMemory);
     job.folder = supervisor.folder;
     job.fontFolders = supervisor.fontFolders;
     job.limits = supervisor.Limits();
+    job.mostMemory = supervisor.mostMemory;
     job.postScript = standins::FirstGivenDescriptor;
     job.pdf = standins::FirstGivenDescriptor + 1;
     if (hasProfile)

@@ -44,7 +44,7 @@ Ending RunGhostscript(const EngineCommand& command, const DistillerJob& job,
     EngineProcess engine(command);
     if (!engine.IsStarted())
         return {MachineFailure(EngineName + " cannot be started", errno)};
-    EngineWatch watch(EngineName, job.limits, bridge);
+    EngineWatch watch(EngineName, job.limits, job.mostMemory, bridge);
     Ending ending;
     ending.cause = watch.Await(engine, [&] { return folder.Size() + SizeOf(job.pdf); });
     ending.status = engine.End();

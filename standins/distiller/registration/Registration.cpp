@@ -3,6 +3,7 @@
 
 #include "standins/distiller/Ghostscript.h"
 #include "standins/distiller/Settings.h"
+#include "standins/module/IsolationRecord.h"
 #include "standins/module/ModulePath.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
@@ -36,6 +37,7 @@ HRESULT Unregister() {
 HRESULT Register() {
     WorkFolder::DiscardAbandoned(DistillerFolderKind, nullptr); // a client starts
     Unregister();
+    EnterIsolation();
     const std::optional<Ghostscript> ghostscript = FindGhostscript();
     if (!ghostscript)
         return S_OK;

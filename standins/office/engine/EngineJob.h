@@ -2,6 +2,7 @@
 
 #include "standins/process/Clocks.h"
 
+#include <cstdint>
 #include <string>
 #include <vector>
 
@@ -16,6 +17,7 @@ struct EngineJob {
     std::string exportTo;     ///< extension, colon, LibreOffice's filter with options if any
     std::vector<std::string> fontFolders;
     TimeLimits limits{};
+    std::uint64_t mostMemory = 0; ///< in bytes, all processes together
 };
 
 } // namespace standins

@@ -63,7 +63,7 @@ EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job,
     command.folder = folder.Path();
     command.descriptors = {input, log, log};
     command.times = job.limits;
-    command.resources.memory = MostMemory;
+    command.resources.memory = job.mostMemory;
     command.reach = LibreOfficeReach(folder, job);
     return command;
 }

@@ -13,10 +13,6 @@ std::string DocumentPath(const WorkFolder& folder, const EngineJob& job);
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job);
 std::string LogPath(const WorkFolder& folder);
 
-/// What an engine of this kind may take of the address space, in bytes: LibreOffice takes 450 MB
-/// for a letter.
-constexpr std::uint64_t MostMemory = std::uint64_t{4} << 30;
-
 /// How LibreOffice is started on the document in its work folder.
 /// @param input open for reading, its standard input
 /// @param log open for writing, where its messages go

@@ -2,7 +2,6 @@
 // to read.
 
 #include "standins/engine/Supervisor.h"
-#include "standins/office/engine/LibreOfficeCommand.h"
 #include "standins/office/engine/Supervision.h"
 
 #include <cstdlib>
@@ -11,7 +10,6 @@
 namespace {
 
 int Run(int argc, char** argv) {
-    const standins::Channel server = standins::BecomeSupervisor(1, standins::MostMemory);
     standins::EngineJob job;
     standins::SupervisorOptions supervisor;
     CLI::App options("Supervises one run of LibreOffice.");
@@ -21,9 +19,11 @@ int Run(int argc, char** argv) {
     options.add_option("--import", job.importFilter)->required();
     options.add_option("--export", job.exportTo)->required();
     CLI11_PARSE(options, argc, argv);
+    const standins::Channel server = standins::BecomeSupervisor(1, supervisor.mostMemory);
     job.folder = supervisor.folder;
     job.fontFolders = supervisor.fontFolders;
     job.limits = supervisor.Limits();
+    job.mostMemory = supervisor.mostMemory;
     standins::Supervise(job, standins::FirstGivenDescriptor, server);
     return EXIT_SUCCESS;
 }

@@ -57,7 +57,7 @@ Failure MakeOutput(const EngineJob& job, const WorkFolder& folder, const Channel
     const Descriptor log(open(LogPath(folder).c_str(), O_WRONLY | O_CREAT | O_APPEND | O_CLOEXEC,
                               S_IRUSR | S_IWUSR));
     const EngineCommand command = LibreOfficeCommand(folder, job, input.Get(), log.Get());
-    EngineWatch watch(EngineName, job.limits, server);
+    EngineWatch watch(EngineName, job.limits, job.mostMemory, server);
     if (Failure failure = RunEngine(command, folder, watch))
         return failure;
     output = OpenOutput(OutputPath(folder, job));

@@ -28,7 +28,6 @@ extern "C" int __lsan_is_turned_off() {
 
 namespace {
 
-constexpr std::uint64_t MostMemory = std::uint64_t{4} << 30; // of the address space, in bytes
 constexpr std::uint64_t LargestFile = std::uint64_t{4} << 30;
 
 /// Fonts, and what tells of characters, the C library's tables of them included, of the ends of
@@ -79,15 +78,18 @@ int Run(int argc, char** argv) {
     standins::PrintJob job;
     std::vector<std::string> fontFolders;
     long totalSeconds = 0;
+    standins::ResourceLimits limits;
+    limits.largestFile = LargestFile;
     CLI::App options("Prints a PDF as PostScript, from standard input to standard output.");
     AddOptions(options, job);
     options.add_option("--fonts", fontFolders, "a folder of fonts")->allow_extra_args(false);
     options.add_option("--total", totalSeconds, "how long it may take, in seconds")->required();
+    options.add_option("--memory", limits.memory, "how much, in bytes")->required();
     CLI11_PARSE(options, argc, argv);
 
     standins::PostScriptOutput output(STDOUT_FILENO, job);
     const std::chrono::seconds total(totalSeconds);
-    standins::LimitResources({MostMemory, LargestFile}, {total, total});
+    standins::LimitResources(limits, {total, total});
     if (!standins::Confine(WriterReach(fontFolders))) {
         std::fputs("the PostScript writer cannot be kept from the rest of the machine\n", stderr);
         return standins::CannotWrite;

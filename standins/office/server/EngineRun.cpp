@@ -31,6 +31,7 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
     run.folder = WorkFolder::NewPath(FolderKind);
     run.clearOutside = RemoveSocket;
     run.limits = ReadTimeLimits();
+    run.mostMemory = ReadMemoryLimit();
 
     Message result = RunSupervised(run);
     if (result.kind != MessageKind::Done || !result.attachment.IsOpen())

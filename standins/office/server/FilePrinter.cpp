@@ -37,11 +37,18 @@ const std::string WriterName = "the PostScript writer";
     RaiseCannotWrite(request, {ErrorWords(error), Fault::Machine});
 }
 
-std::vector<std::string> WriterArguments(const PrintRequest& request, const TimeLimits& limits) {
+/// What the writer may take.
+struct WriterLimits {
+    TimeLimits times = ReadTimeLimits();
+    std::uint64_t memory = ReadMemoryLimit(); ///< in bytes
+};
+
+std::vector<std::string> WriterArguments(const PrintRequest& request, const WriterLimits& limits) {
     std::vector<std::string> arguments = {
         "--title=" + ToUtf8(request.title).value_or("document"),
         "--copies=" + std::to_string(request.copies),
-        "--total=" + std::to_string(limits.total.count()),
+        "--total=" + std::to_string(limits.times.total.count()),
+        "--memory=" + std::to_string(limits.memory),
         request.collate ? "--collate" : "--no-collate",
     };
     for (const std::string& folder : FontFolders())
@@ -58,17 +65,19 @@ std::uint64_t SizeOf(int file) {
     return fstat(file, &status) == 0 ? static_cast<std::uint64_t>(status.st_size) : 0;
 }
 
-/// Waits for the writer, under the two clocks.
-/// @return false when it had to be ended
-bool AwaitWriter(const ChildProcess& writer, int output, const TimeLimits& limits) {
-    Clocks clocks(limits);
+/// Waits for the writer, under the two clocks and the limit on memory.
+/// @return why it must be ended; no failure when it has ended by itself
+Failure AwaitWriter(const ChildProcess& writer, int output, const WriterLimits& limits) {
+    Clocks clocks(limits.times);
     for (;;) {
         pollfd event{writer.ExitDescriptor(), POLLIN, 0};
         if (poll(&event, 1, static_cast<int>(clocks.Interval().count())) > 0)
-            return true;
-        const LifeSign sign{CpuTicksOfGroup(writer.Id()), SizeOf(output)};
-        if (clocks.Check(sign) != Clocks::State::Running)
-            return false;
+            return {};
+        const GroupUsage usage = UsageOfGroup(writer.Id());
+        if (usage.memory > limits.memory)
+            return MemoryFailure(WriterName, limits.memory);
+        if (clocks.Check({usage.cpuTicks, SizeOf(output)}) != Clocks::State::Running)
+            return {WriterName + " took too long"};
     }
 }
 
@@ -93,7 +102,7 @@ Failure DescribeWriter(int status, int messages, const MemoryShortage& shortage)
 }
 
 Failure WritePostScript(const PrintRequest& request, int output) {
-    const TimeLimits limits = ReadTimeLimits();
+    const WriterLimits limits;
     const MemoryShortage shortage;
     const Descriptor messages(memfd_create("messages", MFD_CLOEXEC));
     std::optional<ChildProcess> writer =
@@ -101,8 +110,8 @@ Failure WritePostScript(const PrintRequest& request, int output) {
                             {request.pages->Get(), output, messages.Get()}, Environment::Empty);
     if (!writer)
         return MachineFailure(WriterName + " cannot be started", errno);
-    if (!AwaitWriter(*writer, output, limits))
-        return {WriterName + " took too long"};
+    if (Failure failure = AwaitWriter(*writer, output, limits))
+        return failure;
     return DescribeWriter(writer->Wait(), messages.Get(), shortage);
 }
 

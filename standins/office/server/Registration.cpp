@@ -1,5 +1,6 @@
 #include "standins/office/server/Registration.h"
 
+#include "standins/module/IsolationRecord.h"
 #include "standins/module/ModulePath.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
@@ -71,6 +72,7 @@ void RemoveFacts() {
 
 HRESULT RegisterApplications() {
     UnregisterApplications();
+    EnterIsolation();
     const std::optional<LibreOffice> libreOffice = FindLibreOffice();
     if (!libreOffice)
         return S_OK;

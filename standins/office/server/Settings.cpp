@@ -1,8 +1,8 @@
 #include "standins/office/server/Settings.h"
 
+#include "standins/module/LimitSettings.h"
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
-#include "standins/module/TimeSettings.h"
 
 using namespace std::chrono_literals;
 
@@ -10,6 +10,10 @@ namespace standins {
 
 TimeLimits ReadTimeLimits() {
     return ReadTimeLimits(SettingsKey, {60s, 600s});
+}
+
+std::uint64_t ReadMemoryLimit() {
+    return ReadMemoryLimit(SettingsKey);
 }
 
 std::string ReadEnginePath() {

@@ -88,6 +88,7 @@ protected:
         run.descriptors = descriptors;
         run.folder = standins::WorkFolder::NewPath("test");
         run.limits = {60s, 60s};
+        run.mostMemory = std::uint64_t{1} << 30;
         return standins::RunSupervised(run);
     }
 
@@ -187,7 +188,32 @@ TEST_F(ConfinementTest, ThePrinterReachesNothing) {
     const std::string command =
         "cd '" + m_engine.Path().string() + "' && TARGETS='" + Targets() +
         "' ASAN_OPTIONS=verify_asan_link_order=0 LD_PRELOAD='" + PROBE_OF_PRINTER +
-        "' '" STANDINS_FOLDER "/pdf-to-ps' --total=60 < /dev/null > outcomes";
+        "' '" STANDINS_FOLDER "/pdf-to-ps' --total=60 --memory=1000000000 < /dev/null > outcomes";
     ASSERT_EQ(0, std::system(command.c_str())); // NOLINT(concurrency-mt-unsafe,cert-env33-c)
     ExpectRefused(ReadBytes(m_engine / "outcomes"));
+}
+
+TEST_F(ConfinementTest, WhatTheSystemLacksIsTold) {
+    const fs::path log = m_engine / "log";
+    const auto run = [&](const std::string& call, const std::string& arguments) {
+        const std::string command = "'" WITHOUT "' " + call + " '" PROGRAM "' " + arguments +
+                                    " > '" + log.string() + "' 2>&1";
+        return WEXITSTATUS(
+            std::system(command.c_str())); // NOLINT(concurrency-mt-unsafe,cert-env33-c)
+    };
+    const std::pair<const char*, const char*> lacks[] = {
+        {"landlock_create_ruleset",
+         "files are not kept from documents: the kernel has no Landlock"},
+        {"seccomp", "network and processes are not kept from documents: the kernel has no seccomp"},
+    };
+    for (const auto& [call, words] : lacks) {
+        EXPECT_EQ(0, run(call, "status"));
+        EXPECT_THAT(ReadBytes(log), HasSubstr(std::string("incomplete: ") + words));
+        const std::string convert = "convert '" SAMPLES_FOLDER "/letter.docx' --ps --out '" +
+                                    m_engine.Path().string() + "'";
+        EXPECT_EQ(2, run(call, convert + " --require-isolation"));
+        EXPECT_THAT(ReadBytes(log), HasSubstr(words));
+        EXPECT_EQ(0, run(call, convert)); // with what there is
+        EXPECT_THAT(ReadBytes(log), HasSubstr(std::string("Documents are not isolated: ") + words));
+    }
 }
