@@ -20,6 +20,14 @@ if(QUILLON_SANITIZE)
         $<$<STREQUAL:$<TARGET_PROPERTY:TYPE>,EXECUTABLE>:${PROJECT_SOURCE_DIR}/cmake/LeakSanitizer.cpp>)
 endif()
 
+# Takes the sanitizers from a target whose code runs in a program that has none.
+function(without_sanitizers target)
+    if(QUILLON_SANITIZE)
+        target_compile_options(${target} PRIVATE -fno-sanitize=all)
+        target_link_options(${target} PRIVATE -fno-sanitize=all)
+    endif()
+endfunction()
+
 find_program(CCACHE ccache)
 if(CCACHE)
     set(CMAKE_CXX_COMPILER_LAUNCHER "${CCACHE}")

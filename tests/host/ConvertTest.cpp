@@ -65,6 +65,23 @@ TEST_F(ConvertTest, EveryFailureKeepsItsCodeAndOneFolderStaysClean) {
     }
 }
 
+TEST_F(ConvertTest, FontsThatAreNotThereAreToldOfTheDocumentThatAsksForThem) {
+    m_folder.Write("a.docx", "PK\x03\x04\nfonts=Calibri>Carlito>metric;Futura>DejaVu Sans>");
+    m_folder.Write("b.docx", "PK\x03\x04\n");
+    for (const char* workers : {"-j1", "-j2"}) {
+        const RunResult run = Convert({"a.docx", "b.docx"}, {workers});
+        const std::vector<nlohmann::json> documents = run.Records("document");
+        EXPECT_EQ(documents.at(0)["fonts"].dump(),
+                  R"([{"asked":"Calibri","sameMetrics":true,"used":"Carlito"},)"
+                  R"({"asked":"Futura","sameMetrics":false,"used":"DejaVu Sans"}])");
+        EXPECT_EQ(documents.at(1)["fonts"].dump(), "[]");
+        EXPECT_NE(run.err.find("fonts not installed: Calibri (set in Carlito, of the same widths), "
+                               "Futura (set in DejaVu Sans)\n"),
+                  std::string::npos)
+            << run.err;
+    }
+}
+
 TEST_F(ConvertTest, AnOlderOutputStaysUntilThereIsAWholeNewOne) {
     fs::create_directory(Out());
     m_folder.Write("out/a.ps", "older");

@@ -13,6 +13,7 @@ TEST(MessagesTest, NewsComeAcrossAsTheyWere) {
     news.outcome->state = State::Failed;
     news.outcome->code = -1007;
     news.outcome->machineAtFault = true;
+    news.outcome->fonts = {{"Calibri", "Carlito", true}, {L"\u660e\u671d", "IPAMincho", false}};
     const std::optional<News> read = DecodeNews(Encode(news));
     ASSERT_TRUE(read && read->outcome);
     EXPECT_EQ(read->step, news.step);
@@ -20,6 +21,9 @@ TEST(MessagesTest, NewsComeAcrossAsTheyWere) {
     EXPECT_EQ(read->outcome->state, State::Failed);
     EXPECT_EQ(read->outcome->code, -1007);
     EXPECT_TRUE(read->outcome->machineAtFault);
+    ASSERT_EQ(read->outcome->fonts.size(), 2U);
+    EXPECT_TRUE(read->outcome->fonts[0].hasSameMetrics);
+    EXPECT_EQ(read->outcome->fonts[1].asked, L"\u660e\u671d");
 }
 
 TEST(MessagesTest, WhatIsNoSuchMessageIsRefused) {

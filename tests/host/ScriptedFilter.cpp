@@ -62,6 +62,18 @@ void LeaveFailure(Script& script) {
     key.SetValue("Reason", script["reason"]);
 }
 
+/// Leaves word of fonts as the stand-ins do: with a line "fonts=ASKED>USED>metric;ASKED>USED>".
+void LeaveFonts(Script& script) {
+    if (script["fonts"].empty())
+        return;
+    wxString fonts = script["fonts"] + ';';
+    fonts.Replace(">", "\t");
+    fonts.Replace(";", "\n");
+    wxRegKey key(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Stand-Ins\\Last Fonts");
+    key.Create();
+    key.SetValue("Fonts", fonts);
+}
+
 int Fail(Script& script, const wxString& operation) {
     const int code = Number(script, operation);
     if (code == 0 || !IsDue(script))
@@ -151,6 +163,7 @@ public:
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
             wxFile(outputFolder + '/' + wxFileName(outputName).GetName() + script["companion"],
                    wxFile::write);
+        LeaveFonts(script);
         return Fail(script, "convert");
     }
 

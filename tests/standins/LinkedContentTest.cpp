@@ -1,58 +1,17 @@
 #include "tests/standins/LoopbackListener.h"
 #include "tests/standins/OfficeTest.h"
+#include "tests/standins/Packages.h"
 #include "tests/standins/Viewers.h"
 
 #include <wx/base64.h>
-#include <wx/mstream.h>
-#include <wx/wfstream.h>
-#include <wx/zipstrm.h>
 
 #include <functional>
-#include <memory>
 
 namespace fs = std::filesystem;
 
 namespace {
 
 class LinkedContentTest : public OfficeTest {};
-
-std::string BytesOf(const wxMemoryOutputStream& stream) {
-    std::string bytes(stream.GetSize(), '\0');
-    stream.CopyTo(bytes.data(), bytes.size());
-    return bytes;
-}
-
-/// The bytes of a sample in which one part, and nothing else, is another.
-std::string WithPart(const std::string& sample, const wxString& part, const std::string& content) {
-    wxFileInputStream file(FilterPath(Sample(sample)));
-    wxZipInputStream parts(file);
-    wxMemoryOutputStream bytes;
-    wxZipOutputStream archive(bytes);
-    while (std::unique_ptr<wxZipEntry> entry{parts.GetNextEntry()}) {
-        if (entry->GetName() != part) {
-            archive.CopyEntry(entry.release(), parts);
-            continue;
-        }
-        archive.PutNextEntry(part);
-        archive.Write(content.data(), content.size());
-    }
-    archive.Close();
-    return BytesOf(bytes);
-}
-
-/// The bytes of an Open XML package.
-/// @param parts by their names; $ in them stands for the address of Open XML's schemas
-std::string Package(std::initializer_list<std::pair<const char*, wxString>> parts) {
-    wxMemoryOutputStream bytes;
-    wxZipOutputStream archive(bytes);
-    for (auto [name, content] : parts) {
-        content.Replace("$", "http://schemas.openxmlformats.org");
-        archive.PutNextEntry(name);
-        archive.WriteAll(content.utf8_str(), content.utf8_str().length());
-    }
-    archive.Close();
-    return BytesOf(bytes);
-}
 
 wxString Relationship(const wxString& target, const wxString& type) {
     return R"(<Relationships xmlns="$/package/2006/relationships"><Relationship Id="rId1" Target=")" +

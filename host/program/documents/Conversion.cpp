@@ -77,6 +77,7 @@ void RunFilter(const ScreenedInput& screened, const Workplace& workplace, const 
             *screened.item, ToText(workplace.Path()).value_or(wxString()), outputName, progress);
     });
     failure = std::move(answer.failure);
+    outcome.fonts = LastFontStandIns();
     if (answer.code != Result::Success)
         return Fail(answer.code, {}, *screened.filter, outcome);
     std::error_code error;

@@ -1,6 +1,7 @@
 #include "host/program/documents/FilterCall.h"
 
 #include "common/WQServices.h"
+#include "host/program/machine/FontStandIns.h"
 #include "host/program/report/Reasons.h"
 #include "plugin/ResultCodes.h"
 
@@ -10,6 +11,7 @@ namespace {
 
 FilterAnswer CallOnce(const std::function<int()>& work) {
     ForgetEngineFailure();
+    ForgetFontStandIns();
     FilterAnswer answer{work(), std::nullopt};
     if (answer.code != Result::Success)
         answer.failure = LastEngineFailure();

@@ -1,9 +1,12 @@
 #pragma once
 
+#include "host/program/machine/FontStandIns.h"
+
 #include <wx/string.h>
 
 #include <filesystem>
 #include <optional>
+#include <vector>
 
 /// How far a file has come.
 enum class State {
@@ -21,9 +24,10 @@ struct Outcome {
     std::filesystem::path output; ///< empty when there is none
     State state = State::Accepted;
     int code = 0;
-    wxString text;                 ///< the code's message
-    wxString reason;               ///< what the host can add for a person; may be empty
-    bool machineAtFault = false;   ///< and not the document
+    wxString text;               ///< the code's message
+    wxString reason;             ///< what the host can add for a person; may be empty
+    bool machineAtFault = false; ///< and not the document
+    std::vector<FontStandIn> fonts;
     std::optional<double> seconds; ///< of screening and conversion
 };
 

@@ -19,6 +19,11 @@ constexpr const char* IsolationKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Isolation";
 constexpr const char* IsolationMeansValue = "Means";
 constexpr const char* IsolationMissingValue = "Missing";
 
+/// Under HKEY_CURRENT_USER the fonts that others stood in for: for each a line with the font asked
+/// for, the one used, and "metric" where lines break alike, with tabs between.
+constexpr const char* LastFontsKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Fonts";
+constexpr const char* FontsValue = "Fonts";
+
 constexpr const char* EngineValue = "Engine"; ///< said: name and version of the engine
 
 constexpr const char* StallSecondsValue = "StallSeconds"; ///< told: a number

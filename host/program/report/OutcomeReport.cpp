@@ -33,6 +33,35 @@ wxString LineOf(const Outcome& outcome) {
     return line;
 }
 
+wxString TextOf(const FontStandIn& font) {
+    return wxString::Format(font.hasSameMetrics ? _("%s (set in %s, of the same widths)")
+                                                : _("%s (set in %s)"),
+                            OneLine(font.asked), OneLine(font.used));
+}
+
+/// A line for people and the log when fonts are not there.
+void TellFonts(const Outcome& outcome, Reporter& reporter) {
+    if (outcome.fonts.empty())
+        return;
+    wxString list;
+    for (const FontStandIn& font : outcome.fonts)
+        list << (list.empty() ? "" : ", ") << TextOf(font);
+    const bool runAlike = std::all_of(outcome.fonts.begin(), outcome.fonts.end(),
+                                      [](const FontStandIn& font) { return font.hasSameMetrics; });
+    SetLevelAndGetLogger(runAlike ? LevelInformation : LevelWarning, __FILE__, __func__, __LINE__)
+        << Shown(outcome.input) << ": " << wxString::Format(_("fonts not installed: %s"), list);
+    reporter.Line("  " + wxString::Format(_("fonts not installed: %s"), list));
+}
+
+Json RecordOf(const std::vector<FontStandIn>& fonts) {
+    Json record = Json::array();
+    for (const FontStandIn& font : fonts)
+        record.push_back({{"asked", JsonText(font.asked)},
+                          {"used", JsonText(font.used)},
+                          {"sameMetrics", font.hasSameMetrics}});
+    return record;
+}
+
 bool IsUnfortunate(const Outcome& outcome) {
     return outcome.state == State::Refused || outcome.state == State::Failed;
 }
@@ -55,6 +84,7 @@ Json RecordOf(const Outcome& outcome) {
     record["text"] = JsonText(outcome.text);
     record["reason"] = JsonText(outcome.reason);
     record["fault"] = FaultOf(outcome);
+    record["fonts"] = RecordOf(outcome.fonts);
     record["seconds"] =
         outcome.seconds ? Json(std::round(*outcome.seconds * 1000.0) / 1000.0) : Json();
     return record;
@@ -100,6 +130,7 @@ void Tell(const Outcome& outcome, Reporter& reporter) {
     const wxString line = LineOf(outcome);
     SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__) << line;
     reporter.Line(line);
+    TellFonts(outcome, reporter);
     reporter.Record(RecordOf(outcome));
 }
 

@@ -45,11 +45,31 @@ std::filesystem::path PathOf(const json& value) {
     return FromArgument(value.get<std::string>());
 }
 
+json ToJson(const std::vector<FontStandIn>& fonts) {
+    json values = json::array();
+    for (const FontStandIn& font : fonts)
+        values.push_back(
+            json::array({font.asked.utf8_string(), font.used.utf8_string(), font.hasSameMetrics}));
+    return values;
+}
+
 json ToJson(const Outcome& outcome) {
-    return {{"input", outcome.input.u8string()},        {"output", outcome.output.u8string()},
-            {"state", static_cast<int>(outcome.state)}, {"code", outcome.code},
-            {"text", outcome.text.utf8_string()},       {"reason", outcome.reason.utf8_string()},
-            {"machineAtFault", outcome.machineAtFault}, {"seconds", outcome.seconds.value_or(0)}};
+    return {{"input", outcome.input.u8string()},
+            {"output", outcome.output.u8string()},
+            {"state", static_cast<int>(outcome.state)},
+            {"code", outcome.code},
+            {"text", outcome.text.utf8_string()},
+            {"reason", outcome.reason.utf8_string()},
+            {"machineAtFault", outcome.machineAtFault},
+            {"seconds", outcome.seconds.value_or(0)},
+            {"fonts", ToJson(outcome.fonts)}};
+}
+
+std::vector<FontStandIn> FontsOf(const json& values) {
+    std::vector<FontStandIn> fonts;
+    for (const json& font : values)
+        fonts.push_back({TextOf(font.at(0)), TextOf(font.at(1)), font.at(2).get<bool>()});
+    return fonts;
 }
 
 Outcome OutcomeOf(const json& value) {
@@ -62,6 +82,7 @@ Outcome OutcomeOf(const json& value) {
     outcome.reason = TextOf(value.at("reason"));
     outcome.machineAtFault = value.at("machineAtFault");
     outcome.seconds = value.at("seconds").get<double>();
+    outcome.fonts = FontsOf(value.at("fonts"));
     return outcome;
 }
 

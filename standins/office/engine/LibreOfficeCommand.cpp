@@ -1,6 +1,7 @@
 #include "standins/office/engine/LibreOfficeCommand.h"
 
 #include "standins/office/UserInstallation.h"
+#include "standins/office/engine/TextLibrary.h"
 
 #include <filesystem>
 
@@ -35,6 +36,7 @@ Reach LibreOfficeReach(const WorkFolder& folder, const EngineJob& job) {
                       "/var/lib/libreoffice"};
     AllowSystem(reach);
     AllowFonts(reach, job.fontFolders);
+    reach.readable.push_back(TextLibraryPath());
     reach.workFolder = folder.Path();
     reach.socketFolders = SocketFolders();
     return reach;
@@ -60,6 +62,7 @@ EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job,
     command.words = Words(folder, job);
     command.environment = EngineEnvironment(folder.Path());
     command.environment.emplace_back("SAL_USE_VCLPLUGIN=svp");
+    command.environment.push_back(std::string("LD_PRELOAD=") + TextLibraryLink);
     command.folder = folder.Path();
     command.descriptors = {input, log, log};
     command.times = job.limits;

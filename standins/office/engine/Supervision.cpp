@@ -5,10 +5,13 @@
 #include "standins/office/UserInstallation.h"
 #include "standins/office/engine/DocumentCopy.h"
 #include "standins/office/engine/EngineOutput.h"
+#include "standins/office/engine/FontStandIns.h"
+#include "standins/office/engine/ImportFilter.h"
 #include "standins/office/engine/LibreOfficeCommand.h"
 #include "standins/office/engine/PackageKind.h"
 #include "standins/office/engine/Profile.h"
 #include "standins/office/engine/Publication.h"
+#include "standins/office/engine/TextLibrary.h"
 #include "standins/process/WorkFolder.h"
 
 #include <fcntl.h>
@@ -78,9 +81,13 @@ Failure ConvertInFolder(const EngineJob& job, int document, const WorkFolder& fo
         return {"it is a document of another application"};
     if (job.extension == "pub" && !IsPublication(DocumentPath(folder, job)))
         return {"it is not a publication"};
-    if (!MakeProfile(folder.Path(), job.program))
+    if (!MakeProfile(folder.Path(), job.program) || !LinkTextLibrary(folder.Path()))
         return MachineFailure(EngineName + "'s profile cannot be written", errno);
-    return MakeOutput(job, folder, server, result.attachment);
+    EngineJob ownJob = job;
+    ownJob.importFilter = ImportFilterOf(DocumentPath(folder, job), job.importFilter);
+    const Failure failure = MakeOutput(ownJob, folder, server, result.attachment);
+    result.text += '\n' + ReadFontStandIns(folder.Path());
+    return failure;
 }
 
 /// The work folder is gone afterwards.

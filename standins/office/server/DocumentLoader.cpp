@@ -1,5 +1,6 @@
 #include "standins/office/server/DocumentLoader.h"
 
+#include "standins/module/LastFonts.h"
 #include "standins/module/Text.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/EngineRun.h"
@@ -17,6 +18,21 @@ namespace {
 [[noreturn]] void RaiseCannotLoad(const std::wstring& path, const Failure& failure) {
     const bool isProtected = failure.fault == Fault::Document && IsPasswordProtected(path);
     RaiseCannotOpen(path, isProtected ? Failure{"it is protected by a password"} : failure);
+}
+
+/// Not again when its bytes are known.
+Export LoadOnce(const std::wstring& path, const DocumentFile& document,
+                const DocumentFormat& format) {
+    ExportCache& cache = ExportCache::Instance();
+    if (Export known = cache.Find(document, format))
+        return known;
+    EngineResult result = RunEngine(document, format);
+    if (result.failure)
+        RaiseCannotLoad(path, result.failure);
+    Export output = std::make_shared<const MadeFile>(
+        MadeFile{std::move(result.output), std::move(result.fonts)});
+    cache.Add(document, format, result.sha256, output);
+    return output;
 }
 
 } // namespace
@@ -39,14 +55,8 @@ DocumentFile OpenDocument(const std::wstring& path) {
 
 Export LoadDocument(const std::wstring& path, const DocumentFile& document,
                     const DocumentFormat& format) {
-    ExportCache& cache = ExportCache::Instance();
-    if (Export known = cache.Find(document, format))
-        return known;
-    EngineResult result = RunEngine(document, format);
-    if (result.failure)
-        RaiseCannotLoad(path, result.failure);
-    Export output = std::make_shared<const Descriptor>(std::move(result.output));
-    cache.Add(document, format, result.sha256, output);
+    Export output = LoadOnce(path, document, format);
+    LeaveFonts(output->fonts);
     return output;
 }
 

@@ -17,7 +17,7 @@ constexpr const char* FolderKind = "office";
 EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format) {
     const std::string program = ReadEnginePath();
     if (program.empty())
-        return {Descriptor(), {}, {"LibreOffice is not installed", Fault::Machine}};
+        return {Descriptor(), {}, {}, {"LibreOffice is not installed", Fault::Machine}};
     SupervisedRun run;
     run.engine = "LibreOffice";
     run.supervisor = HelperPath("office-engine");
@@ -35,8 +35,14 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
 
     Message result = RunSupervised(run);
     if (result.kind != MessageKind::Done || !result.attachment.IsOpen())
-        return {Descriptor(), {}, {result.text, result.fault}};
-    return {std::move(result.attachment), result.text, {}};
+        return {Descriptor(), {}, {}, {result.text, result.fault}};
+    // The sum is a line, the fonts follow; a text that is too long is cut off.
+    const std::size_t sum = result.text.find('\n');
+    const std::size_t end = result.text.rfind('\n') + 1;
+    return {std::move(result.attachment),
+            result.text.substr(0, sum),
+            result.text.substr(sum + 1, end - sum - 1),
+            {}};
 }
 
 void ClearAfterKilledRuns() {

@@ -12,6 +12,7 @@ namespace standins {
 struct EngineResult {
     Descriptor output; ///< what LibreOffice made
     std::string sha256;
+    std::string fonts; ///< those that others stood in for, as LeaveFonts takes them
     Failure failure;
 };
 

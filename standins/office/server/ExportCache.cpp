@@ -55,8 +55,8 @@ Export ExportCache::Find(const DocumentFile& document, const DocumentFormat& for
 void ExportCache::Add(const DocumentFile& document, const DocumentFormat& format,
                       const std::string& sha256, const Export& output) {
     const std::lock_guard lock(m_mutex);
-    m_entries.push_front(
-        {document.size, format.importFilter, format.exportTo, sha256, output, SizeOf(*output)});
+    m_entries.push_front({document.size, format.importFilter, format.exportTo, sha256, output,
+                          SizeOf(output->file)});
     Shrink();
 }
 

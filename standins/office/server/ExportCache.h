@@ -11,9 +11,14 @@
 
 namespace standins {
 
-/// What LibreOffice made of a document, as a rule a PDF, in a file that has no name any more: it
-/// goes with the last that holds it.
-using Export = std::shared_ptr<const Descriptor>;
+/// What LibreOffice made of a document.
+struct MadeFile {
+    Descriptor file;   ///< as a rule a PDF; it has no name any more and goes with this
+    std::string fonts; ///< those that others stood in for, as LeaveFonts takes them
+};
+
+/// Goes with the last that holds it.
+using Export = std::shared_ptr<const MadeFile>;
 
 /// What was made of the documents that were loaded last, so that a document which was tried a
 /// moment ago need not be loaded again. A document is known by its bytes, not by its name or time.

@@ -105,9 +105,9 @@ Failure WritePostScript(const PrintRequest& request, int output) {
     const WriterLimits limits;
     const MemoryShortage shortage;
     const Descriptor messages(memfd_create("messages", MFD_CLOEXEC));
-    std::optional<ChildProcess> writer =
-        ChildProcess::Start(HelperPath("pdf-to-ps"), WriterArguments(request, limits),
-                            {request.pages->Get(), output, messages.Get()}, Environment::Empty);
+    std::optional<ChildProcess> writer = ChildProcess::Start(
+        HelperPath("pdf-to-ps"), WriterArguments(request, limits),
+        {request.pages->file.Get(), output, messages.Get()}, Environment::Empty);
     if (!writer)
         return MachineFailure(WriterName + " cannot be started", errno);
     if (Failure failure = AwaitWriter(*writer, output, limits))

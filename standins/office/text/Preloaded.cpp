@@ -1,0 +1,20 @@
+// Makes of the files here a library that is loaded in front of those of a LibreOffice started for
+// one document.
+
+#include "standins/office/FontUseFile.h"
+#include "standins/office/text/FontUse.h"
+
+#include <cstdlib>
+
+namespace {
+
+void WriteAtTheEnd() {
+    standins::WriteFontUse(standins::FontUseFile);
+}
+
+__attribute__((constructor)) void Begin() {
+    standins::StartFontUse();
+    std::atexit(WriteAtTheEnd);
+}
+
+} // namespace
