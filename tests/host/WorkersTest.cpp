@@ -70,7 +70,7 @@ TEST_F(WorkersTest, OneThatEndsOrStopsFailsItsDocumentOnly) {
             m_folder.Write(name, "script");
         const std::string log = Place("log");
         const RunResult run = Convert({"a.doc", "b.doc", "c.doc", "d.doc", "e.doc"},
-                                      {"-j", "2", "--engine-stall", "2", "--log", log});
+                                      {"-j", "2", "--engine-stall", "5", "--log", log});
         EXPECT_EQ(run.exitCode, 1) << run.err;
         EXPECT_EQ(States(run),
                   (Names{"converted", "failed", "converted", "converted", "converted"}));

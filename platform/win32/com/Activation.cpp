@@ -2,7 +2,13 @@
 #include "platform/win32/com/ClassObjects.h"
 #include "platform/win32/com/InProcessServers.h"
 
+#include <memory>
+
 namespace {
+
+struct Release {
+    void operator()(IUnknown* object) const { object->Release(); }
+};
 
 /// @param factory receives the class object that makes objects of the class
 HRESULT FindFactory(REFCLSID clsid, void** factory) {
@@ -28,11 +34,9 @@ HRESULT WINAPI CoCreateInstance(REFCLSID clsid, LPUNKNOWN outer, DWORD context, 
     if ((context & CLSCTX_INPROC_SERVER) == 0)
         return REGDB_E_CLASSNOTREG;
     void* factory = nullptr;
-    HRESULT result = FindFactory(clsid, &factory);
+    const HRESULT result = FindFactory(clsid, &factory);
     if (FAILED(result))
         return result;
-    auto* classFactory = static_cast<IClassFactory*>(factory);
-    result = classFactory->CreateInstance(outer, iid, object);
-    classFactory->Release();
-    return result;
+    const std::unique_ptr<IClassFactory, Release> held(static_cast<IClassFactory*>(factory));
+    return held->CreateInstance(outer, iid, object); // a server of C++ may throw
 }
