@@ -23,11 +23,11 @@ TEST_F(ExportCacheTest, ADocumentIsLoadedOnceAsLongAsItsBytesStay) {
     EXPECT_EQ(2U, engine.Starts());
 
     fs::copy_file(document, m_files / "copy.docx");
-    EXPECT_EQ("", Print(m_files / "copy.docx"));
-    EXPECT_EQ(2U, engine.Starts());
+    EXPECT_EQ("", Print(m_files / "copy.docx")); // which may print its name
+    EXPECT_EQ(3U, engine.Starts());
     fs::copy_file(document, m_files / "copy.doc"); // of another kind
     EXPECT_EQ("", Print(m_files / "copy.doc"));
-    EXPECT_EQ(3U, engine.Starts());
+    EXPECT_EQ(4U, engine.Starts());
 }
 
 TEST_F(ExportCacheTest, OnlyOptionsThatChangeTheExportLoadAPresentationAgain) {

@@ -38,6 +38,12 @@ std::string TextIn(const std::string& font) {
            "\"/></w:rPr><w:t>Text</w:t></w:r>";
 }
 
+std::string Field(const std::string& instruction) {
+    return "<w:r><w:fldChar w:fldCharType=\"begin\"/></w:r><w:r><w:instrText>" + instruction +
+           "</w:instrText></w:r><w:r><w:fldChar w:fldCharType=\"separate\"/></w:r><w:r><w:t>stale"
+           "</w:t></w:r><w:r><w:fldChar w:fldCharType=\"end\"/></w:r><w:r><w:t>; </w:t></w:r>";
+}
+
 /// A letter as Word 95 writes it: the head of the document's stream and the text behind it.
 std::string LetterOfWord95(const std::string& text) {
     const auto size = static_cast<char>(text.size());
@@ -81,5 +87,30 @@ TEST_F(PageTextTest, PresentationsOfPowerPoint95AreImportedAsSuch) {
             file.AddStream(stream, "slides");
         const fs::path presentation = m_files.Write("1995.ppt", file.Bytes());
         EXPECT_EQ(isOld, Print(presentation, PowerPointOptions()).empty());
+    }
+}
+
+TEST_F(PageTextTest, DocumentsPrintTheirOwnNameAndFolder) {
+    const std::string folder = m_files.Path();
+    const fs::path letter =
+        m_files.Write("50% #1 é.docx", Letter(Field("FILENAME") + Field("FILENAME \\p")));
+    const fs::path book = m_files.Write(
+        "a book.xlsx",
+        WithPart("book.xlsx", "xl/worksheets/sheet1.xml",
+                 "<worksheet xmlns=\"http://schemas.openxmlformats.org/spreadsheetml/2006/main\">"
+                 "<cols><col min=\"1\" max=\"1\" width=\"80\" customWidth=\"1\"/></cols>"
+                 "<sheetData><row r=\"1\"><c r=\"A1\" t=\"str\"><f>CELL(\"filename\")</f>"
+                 "<v>stale</v></c></row></sheetData>"
+                 "<headerFooter><oddHeader>&amp;C&amp;F; &amp;Z</oddHeader></headerFooter>"
+                 "</worksheet>"));
+    for (const auto& [document, texts] :
+         {std::pair(letter, std::vector<std::string>{"50% #1 é.docx;", folder + "/50% #1 é.docx;"}),
+          {book, {"a book.xlsx; ", folder + "/a book.xlsx'"}}}) {
+        EXPECT_EQ("", Print(document));
+        const std::string text = PostScriptText(PrintedFile(document));
+        for (const std::string& expected : texts)
+            EXPECT_THAT(text, HasSubstr(expected));
+        EXPECT_THAT(text, Not(HasSubstr("quillon-office")));
+        EXPECT_THAT(text, Not(HasSubstr("stale")));
     }
 }

@@ -12,6 +12,7 @@ namespace standins {
 struct EngineJob {
     std::string program;      ///< LibreOffice's program folder
     std::string folder;       ///< the work folder, not made yet
+    std::string knownPath;    ///< the document's own; empty when it has none that is UTF-8
     std::string extension;    ///< of the document, without a dot
     std::string importFilter; ///< LibreOffice's name of the document's type
     std::string exportTo;     ///< extension, colon, LibreOffice's filter with options if any

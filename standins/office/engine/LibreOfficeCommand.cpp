@@ -1,13 +1,31 @@
 #include "standins/office/engine/LibreOfficeCommand.h"
 
+#include "standins/office/KnownPath.h"
 #include "standins/office/UserInstallation.h"
 #include "standins/office/engine/TextLibrary.h"
 
+#include <glib.h>
+
 #include <filesystem>
+#include <memory>
+
+namespace fs = std::filesystem;
 
 namespace standins {
 
 namespace {
+
+/// The path by which LibreOffice opens the document: fields and headers print it.
+std::string OpenedPath(const WorkFolder& folder, const EngineJob& job) {
+    return job.knownPath.empty() || !FindsCopies(job.program) ? DocumentPath(folder, job)
+                                                              : job.knownPath;
+}
+
+std::string UrlOf(const std::string& path) {
+    const std::unique_ptr<char, decltype(&g_free)> url(
+        g_filename_to_uri(path.c_str(), nullptr, nullptr), g_free);
+    return url ? url.get() : path;
+}
 
 std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
     const std::string installation = UserInstallationUrl(folder.Path());
@@ -26,13 +44,13 @@ std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
         job.exportTo,
         "--outdir",
         folder.Path(),
-        DocumentPath(folder, job),
+        UrlOf(OpenedPath(folder, job)),
     };
 }
 
 Reach LibreOfficeReach(const WorkFolder& folder, const EngineJob& job) {
     Reach reach;
-    reach.readable = {std::filesystem::path(job.program).parent_path(), "/etc/libreoffice",
+    reach.readable = {fs::path(job.program).parent_path(), "/etc/libreoffice",
                       "/var/lib/libreoffice"};
     AllowSystem(reach);
     AllowFonts(reach, job.fontFolders);
@@ -49,7 +67,8 @@ std::string DocumentPath(const WorkFolder& folder, const EngineJob& job) {
 }
 
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job) {
-    return folder.Path() + "/document." + job.exportTo.substr(0, job.exportTo.find(':'));
+    const std::string stem = fs::path(OpenedPath(folder, job)).stem();
+    return folder.Path() + '/' + stem + '.' + job.exportTo.substr(0, job.exportTo.find(':'));
 }
 
 std::string LogPath(const WorkFolder& folder) {
@@ -63,6 +82,8 @@ EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job,
     command.environment = EngineEnvironment(folder.Path());
     command.environment.emplace_back("SAL_USE_VCLPLUGIN=svp");
     command.environment.push_back(std::string("LD_PRELOAD=") + TextLibraryLink);
+    command.environment.push_back(std::string(KnownPathVariable) + '=' + job.knownPath);
+    command.environment.push_back(std::string(CopyVariable) + '=' + DocumentPath(folder, job));
     command.folder = folder.Path();
     command.descriptors = {input, log, log};
     command.times = job.limits;

@@ -10,6 +10,7 @@ namespace standins {
 
 // The files of a work folder.
 std::string DocumentPath(const WorkFolder& folder, const EngineJob& job);
+/// Named after the document as LibreOffice knows it.
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job);
 std::string LogPath(const WorkFolder& folder);
 

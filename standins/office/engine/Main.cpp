@@ -15,6 +15,7 @@ int Run(int argc, char** argv) {
     CLI::App options("Supervises one run of LibreOffice.");
     supervisor.AddTo(options);
     options.add_option("--program", job.program)->required();
+    options.add_option("--document", job.knownPath)->required();
     options.add_option("--extension", job.extension)->required();
     options.add_option("--import", job.importFilter)->required();
     options.add_option("--export", job.exportTo)->required();

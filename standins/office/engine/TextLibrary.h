@@ -15,4 +15,9 @@ constexpr const char* TextLibraryLink = "./text.so";
 /// @return false when it cannot be; errno tells why
 bool LinkTextLibrary(const std::string& folder);
 
+/// Whether a LibreOffice can be led to the copy of a document by the path that its user knows. It
+/// can when it asks the system by the names that the library has.
+/// @param program LibreOffice's program folder
+bool FindsCopies(const std::string& program);
+
 } // namespace standins

@@ -20,18 +20,18 @@ namespace {
     RaiseCannotOpen(path, isProtected ? Failure{"it is protected by a password"} : failure);
 }
 
-/// Not again when its bytes are known.
+/// Not again when it is known.
 Export LoadOnce(const std::wstring& path, const DocumentFile& document,
                 const DocumentFormat& format) {
     ExportCache& cache = ExportCache::Instance();
-    if (Export known = cache.Find(document, format))
+    if (Export known = cache.Find(path, document, format))
         return known;
-    EngineResult result = RunEngine(document, format);
+    EngineResult result = RunEngine(path, document, format);
     if (result.failure)
         RaiseCannotLoad(path, result.failure);
     Export output = std::make_shared<const MadeFile>(
         MadeFile{std::move(result.output), std::move(result.fonts)});
-    cache.Add(document, format, result.sha256, output);
+    cache.Add(path, document, format, result.sha256, output);
     return output;
 }
 

@@ -19,7 +19,7 @@ const DocumentFormat& FormatOf(const std::wstring& path,
 /// @param path full path
 DocumentFile OpenDocument(const std::wstring& path);
 
-/// Loads it at once, to the last page; not again when its bytes are known.
+/// Loads it at once, to the last page; not again when its bytes and path are known.
 /// @return what the format makes of it
 Export LoadDocument(const std::wstring& path, const DocumentFile& document,
                     const DocumentFormat& format);

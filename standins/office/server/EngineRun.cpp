@@ -2,9 +2,14 @@
 
 #include "standins/module/ModulePath.h"
 #include "standins/module/SupervisedRun.h"
+#include "standins/module/Text.h"
 #include "standins/office/UserInstallation.h"
 #include "standins/office/server/Settings.h"
 #include "standins/process/WorkFolder.h"
+
+#include <filesystem>
+
+namespace fs = std::filesystem;
 
 namespace standins {
 
@@ -14,7 +19,8 @@ constexpr const char* FolderKind = "office";
 
 } // namespace
 
-EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format) {
+EngineResult RunEngine(const std::wstring& path, const DocumentFile& document,
+                       const DocumentFormat& format) {
     const std::string program = ReadEnginePath();
     if (program.empty())
         return {Descriptor(), {}, {}, {"LibreOffice is not installed", Fault::Machine}};
@@ -23,6 +29,7 @@ EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& forma
     run.supervisor = HelperPath("office-engine");
     run.arguments = {
         "--program=" + program,
+        "--document=" + fs::path(ToUtf8(path).value_or("")).lexically_normal().string(),
         std::string("--extension=") + format.extension,
         std::string("--import=") + format.importFilter,
         "--export=" + format.exportTo,

@@ -19,7 +19,8 @@ struct EngineResult {
 /// Lets LibreOffice convert a document, under a supervisor of its own, and returns when nothing of
 /// the run is left: no process, no file. The supervisor sees to it that LibreOffice ends; that the
 /// supervisor itself ends is seen to here.
-EngineResult RunEngine(const DocumentFile& document, const DocumentFormat& format);
+EngineResult RunEngine(const std::wstring& path, const DocumentFile& document,
+                       const DocumentFormat& format);
 
 /// Clears away what is left of runs whose processes were all killed.
 void ClearAfterKilledRuns();

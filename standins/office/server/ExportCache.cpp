@@ -37,14 +37,15 @@ ExportCache& ExportCache::Instance() {
     return cache;
 }
 
-Export ExportCache::Find(const DocumentFile& document, const DocumentFormat& format) {
+Export ExportCache::Find(const std::wstring& path, const DocumentFile& document,
+                         const DocumentFormat& format) {
     if (!MayKnow(document))
         return nullptr;
     const std::string sum = SumOf(document);
     const std::lock_guard lock(m_mutex);
     for (auto entry = m_entries.begin(); entry != m_entries.end(); ++entry) {
-        if (entry->sha256 == sum && entry->importFilter == format.importFilter &&
-            entry->exportTo == format.exportTo) {
+        if (entry->sha256 == sum && entry->path == path &&
+            entry->importFilter == format.importFilter && entry->exportTo == format.exportTo) {
             m_entries.splice(m_entries.begin(), m_entries, entry);
             return entry->output;
         }
@@ -52,10 +53,11 @@ Export ExportCache::Find(const DocumentFile& document, const DocumentFormat& for
     return nullptr;
 }
 
-void ExportCache::Add(const DocumentFile& document, const DocumentFormat& format,
-                      const std::string& sha256, const Export& output) {
+void ExportCache::Add(const std::wstring& path, const DocumentFile& document,
+                      const DocumentFormat& format, const std::string& sha256,
+                      const Export& output) {
     const std::lock_guard lock(m_mutex);
-    m_entries.push_front({document.size, format.importFilter, format.exportTo, sha256, output,
+    m_entries.push_front({path, document.size, format.importFilter, format.exportTo, sha256, output,
                           SizeOf(output->file)});
     Shrink();
 }

@@ -21,20 +21,23 @@ struct MadeFile {
 using Export = std::shared_ptr<const MadeFile>;
 
 /// What was made of the documents that were loaded last, so that a document which was tried a
-/// moment ago need not be loaded again. A document is known by its bytes, not by its name or time.
+/// moment ago need not be loaded again. A document is known by its bytes, and its path, which may
+/// be printed in it.
 class ExportCache {
 public:
     static ExportCache& Instance();
 
     /// @return null when the document is not known
-    Export Find(const DocumentFile& document, const DocumentFormat& format);
+    Export Find(const std::wstring& path, const DocumentFile& document,
+                const DocumentFormat& format);
     /// @param sha256 of the document, as the supervisor sent it
-    void Add(const DocumentFile& document, const DocumentFormat& format, const std::string& sha256,
-             const Export& output);
+    void Add(const std::wstring& path, const DocumentFile& document, const DocumentFormat& format,
+             const std::string& sha256, const Export& output);
     bool IsEmpty();
 
 private:
     struct Entry {
+        std::wstring path;
         std::uint64_t documentSize;
         std::string importFilter;
         std::string exportTo;

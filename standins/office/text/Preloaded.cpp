@@ -2,6 +2,8 @@
 // one document.
 
 #include "standins/office/FontUseFile.h"
+#include "standins/office/KnownPath.h"
+#include "standins/office/text/DocumentPath.h"
 #include "standins/office/text/FontUse.h"
 
 #include <cstdlib>
@@ -13,6 +15,10 @@ void WriteAtTheEnd() {
 }
 
 __attribute__((constructor)) void Begin() {
+    const char* known = std::getenv(standins::KnownPathVariable);
+    const char* copy = std::getenv(standins::CopyVariable);
+    if (known && copy)
+        standins::SetDocumentPath(known, copy);
     standins::StartFontUse();
     std::atexit(WriteAtTheEnd);
 }
