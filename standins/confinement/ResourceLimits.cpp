@@ -18,7 +18,7 @@ void Limit(__rlimit_resource resource, rlim_t soft, rlim_t hard) {
 
 void LimitMemory([[maybe_unused]] std::uint64_t most) {
 #ifndef __SANITIZE_ADDRESS__ // whose shadow memory takes terabytes of address space
-    constexpr std::uint64_t Unused = std::uint64_t{1} << 30;
+    constexpr std::uint64_t Unused = std::uint64_t{512} << 20;
     Limit(RLIMIT_AS, most + Unused, most + Unused);
 #endif
 }

@@ -13,7 +13,7 @@ struct ResourceLimits {
 };
 
 /// Limits the address space of the calling process, and of each that it starts: to `most` bytes and
-/// a GiB more, since libraries take addresses without using the memory. Bounds what is taken
+/// half a GiB more, since libraries take addresses without using the memory. Bounds what is taken
 /// between two looks at the memory in use.
 void LimitMemory(std::uint64_t most);
 

@@ -32,7 +32,7 @@ TimeLimits ReadTimeLimits(const wchar_t* key, const TimeLimits& standard) {
 }
 
 std::uint64_t ReadMemoryLimit(const wchar_t* key) {
-    constexpr DWORD Standard = 3072;
+    constexpr DWORD Standard = 3584;
     constexpr DWORD Most = DWORD{1} << 30;
     return std::uint64_t{ReadNumber(key, L"MemoryMegabytes", 1, Most, Standard)} << 20;
 }

@@ -9,7 +9,7 @@ namespace standins {
 /// @param standard for what is in neither
 TimeLimits ReadTimeLimits(const wchar_t* key, const TimeLimits& standard);
 
-/// Reads how much memory a document may take: the number "MemoryMegabytes" there, or else 3072.
+/// Reads how much memory a document may take: the number "MemoryMegabytes" there, or else 3584.
 /// @return bytes
 std::uint64_t ReadMemoryLimit(const wchar_t* key);
 

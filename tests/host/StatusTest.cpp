@@ -53,7 +53,7 @@ TEST(Status, HandsTheLimitsToTheEnginesAndTheFilters) {
     EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s, 512 MB, output 5 of 60 s"))
         << run.out;
     EXPECT_TRUE(Contains(RunQuillon({"status"}).out,
-                         "Scripted engine, 0 of 0 s, 3072 MB, output 0 of 0 s"));
+                         "Scripted engine, 0 of 0 s, 3584 MB, output 0 of 0 s"));
 }
 
 TEST(Status, TellsWhatDocumentsAreNotKeptFrom) {

@@ -152,7 +152,7 @@ void AddCommonOptions(CLI::App& app, CommandLine& line) {
         ->check(seconds);
     app.add_option("--memory-limit", line.memoryMegabytes,
                    "How much memory engines may take for a document, all of its processes\n"
-                   "together, 3072 if not given")
+                   "together, 3584 if not given")
         ->type_name("MB")
         ->check(CLI::Range(256U, MostMegabytes));
     app.add_flag("--require-isolation", line.requireIsolation,

@@ -26,7 +26,7 @@ struct CommandLine {
     std::optional<std::string> logFile;
     std::optional<unsigned> stallSeconds;
     std::optional<unsigned> limitSeconds;
-    unsigned memoryMegabytes = 3072; ///< for a document
+    unsigned memoryMegabytes = 3584; ///< for a document
     bool requireIsolation = false;
     std::optional<std::string> filtersFolder;
     std::optional<std::string> standInsFolder;
