@@ -145,10 +145,10 @@ TEST_F(ConfinementTest, LibreOfficeReachesNothing) {
     const fs::path path = m_engine.Write("new.docx", "a document");
     const standins::Descriptor document(open(path.c_str(), O_RDONLY | O_CLOEXEC));
     const std::string program = m_engine / "bin";
-    const standins::Message result =
-        Run("soffice.bin", "office-engine",
-            {"--program=" + program, "--extension=docx", "--import=x", "--export=pdf:x"},
-            {document.Get()});
+    const standins::Message result = Run("soffice.bin", "office-engine",
+                                         {"--program=" + program, "--document=" + path.string(),
+                                          "--extension=docx", "--import=x", "--export=pdf:x"},
+                                         {document.Get()});
     ASSERT_EQ(standins::MessageKind::Done, result.kind) << result.text;
     ExpectRefused(ReadWhole(result.attachment.Get()));
 }
