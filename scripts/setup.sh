@@ -7,7 +7,7 @@ build_packages=(
     g++ cmake ninja-build ccache pkg-config
     libwxgtk3.2-dev libgsf-1-dev libcups2-dev libexpat1-dev
     libpoppler-glib-dev libcairo2-dev libpango1.0-dev libfontconfig-dev libglib2.0-dev libseccomp-dev
-    libharfbuzz-dev
+    libharfbuzz-dev libreoffice-dev libreofficekit-dev
     libcli11-dev nlohmann-json3-dev gettext
 )
 run_packages=(

@@ -74,7 +74,8 @@ ExitCode Run(const CommandLine& line) {
     }
     Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
     SetUpMachine({FolderOr(line.standInsFolder, "StandIns"), line.stallSeconds, line.limitSeconds,
-                  line.memoryMegabytes});
+                  line.memoryMegabytes,
+                  line.command == Command::Status && line.engineDocuments != 1U});
     if (!IsIsolatedEnough(line, reporter))
         return ExitCode::MachineAtFault;
     const std::filesystem::path filtersFolder = FolderOr(line.filtersFolder, "Filters");

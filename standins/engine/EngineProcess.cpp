@@ -1,6 +1,7 @@
 #include "standins/engine/EngineProcess.h"
 
 #include "standins/process/ChildProcess.h"
+#include "standins/process/DefaultSignals.h"
 #include "standins/process/ProcessTable.h"
 
 #include <fcntl.h>
@@ -16,14 +17,6 @@
 namespace standins {
 
 namespace {
-
-void DefaultSignals() {
-    for (int number = 1; number < SIGRTMAX; ++number)
-        signal(number, SIG_DFL);
-    sigset_t none;
-    sigemptyset(&none);
-    sigprocmask(SIG_SETMASK, &none, nullptr);
-}
 
 /// @return false when the system has no more descriptors
 bool TakeDescriptors(const std::vector<int>& descriptors) {
@@ -45,7 +38,7 @@ bool TakeDescriptors(const std::vector<int>& descriptors) {
     prctl(PR_SET_PDEATHSIG, SIGKILL);
     if (getppid() != supervisor) // it went before it could take us along
         _exit(EngineCannotStart);
-    DefaultSignals();
+    RestoreDefaultSignals();
     std::vector<std::string> words = command.words;
     std::vector<std::string> environment = command.environment;
     const std::vector<char*> wordPointers = ExecWords(words);
@@ -87,8 +80,9 @@ std::vector<std::string> EngineEnvironment(const std::string& folder) {
     return environment;
 }
 
-EngineProcess::EngineProcess(const EngineCommand& command)
-    : m_mostCpuSeconds(CpuLimit(command.times)) {
+EngineProcess::EngineProcess(TimeLimits times) : m_mostCpuSeconds(CpuLimit(times)) {}
+
+EngineProcess::EngineProcess(const EngineCommand& command) : EngineProcess(command.times) {
     const pid_t supervisor = getpid();
     m_id = fork();
     if (m_id == 0)
@@ -99,7 +93,19 @@ EngineProcess::EngineProcess(const EngineCommand& command)
     m_exit = WatchProcess(m_id);
 }
 
-int EngineProcess::End() {
+EngineProcess EngineProcess::Adopt(pid_t child, TimeLimits times) {
+    EngineProcess engine(times);
+    siginfo_t unused{};
+    if (child <= 0 ||
+        waitid(P_PID, static_cast<id_t>(child), &unused, WEXITED | WNOHANG | WNOWAIT) != 0)
+        return engine; // it is not ours to end
+    setpgid(child, child);
+    engine.m_id = child;
+    engine.m_exit = WatchProcess(child);
+    return engine;
+}
+
+int EngineProcess::End(pid_t spared) {
     int status = 0;
     if (m_id > 0) {
         kill(-m_id, SIGKILL); // nobody has waited for it yet, so the number is still its own
@@ -108,7 +114,7 @@ int EngineProcess::End() {
         if (WIFSIGNALED(status) && WTERMSIG(status) == SIGKILL && UsedUp(usage, m_mostCpuSeconds))
             status = SIGXCPU;
     }
-    EndChildren();
+    EndChildren(spared);
     return status;
 }
 

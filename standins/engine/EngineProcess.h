@@ -38,17 +38,24 @@ class EngineProcess {
 public:
     /// Starts it. The caller must have a single thread.
     explicit EngineProcess(const EngineCommand& command);
+    /// Takes over a child of the caller that another process has forked. IsStarted() tells whether
+    /// there is such a child.
+    /// @param times those of its command
+    static EngineProcess Adopt(pid_t child, TimeLimits times);
 
     bool IsStarted() const { return m_exit.IsOpen(); }
     pid_t Group() const { return m_id; }
     /// Becomes readable when the engine has ended.
     int ExitDescriptor() const { return m_exit.Get(); }
     /// Ends the engine if it has not ended, with everything that it started.
+    /// @param spared another child of the caller that is left alone, or 0
     /// @return the status as waitpid gives it; SIGXCPU, too, where the system has ended it for its
     /// processor time in the way that cannot be ignored
-    int End();
+    int End(pid_t spared = 0);
 
 private:
+    explicit EngineProcess(TimeLimits times);
+
     pid_t m_id = -1;
     rlim_t m_mostCpuSeconds;
     Descriptor m_exit; ///< a pidfd

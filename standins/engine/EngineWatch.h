@@ -24,6 +24,9 @@ public:
     EngineWatch(std::string engine, TimeLimits limits, std::uint64_t mostMemory,
                 const Channel& server);
 
+    /// The engine's name.
+    const std::string& Engine() const { return m_engine; }
+
     /// Waits for the engine.
     /// @param bytesWritten answers how much it has written so far
     /// @return no failure when the engine has ended by itself, else why it must be ended

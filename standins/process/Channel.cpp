@@ -11,7 +11,7 @@ namespace standins {
 
 namespace {
 
-constexpr std::size_t LongestText = 4000;
+constexpr std::size_t LongestText = std::size_t{32} << 10; // paths may have 4 KiB each
 
 /// What stands in front of a message's text.
 std::string Head(MessageKind kind, Fault fault) {

@@ -11,9 +11,14 @@ namespace standins {
 
 /// What a message tells.
 enum class MessageKind : char {
-    Alive = 'a',  ///< the sender is at work
-    Done = 'd',   ///< the work is done; the text and the attachment are its result
-    Failed = 'f', ///< the work failed; the text says why
+    Alive = 'a',   ///< the sender is at work
+    Done = 'd',    ///< the work is done; the text and the attachment are its result
+    Failed = 'f',  ///< the work failed; the text says why
+    Job = 'j',     ///< work to be done, in the text and the attachment
+    Note = 'n',    ///< the text is for the log
+    Part = 'p',    ///< a part of the result, ahead of it
+    Ready = 'r',   ///< the sender can take work
+    Started = 's', ///< the work has begun in a process of its own; the text is its number
 };
 
 struct Message {

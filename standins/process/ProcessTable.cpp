@@ -77,12 +77,14 @@ std::uint64_t MemoryOf(pid_t process) {
     return kilobytes << 10;
 }
 
-void KillChildren() {
+std::vector<pid_t> ChildrenBut(pid_t spared) {
     const pid_t self = getpid();
+    std::vector<pid_t> children;
     for (const pid_t process : AllProcesses()) {
-        if (ReadStatus(process).parent == self)
-            kill(process, SIGKILL);
+        if (process != spared && ReadStatus(process).parent == self)
+            children.push_back(process);
     }
+    return children;
 }
 
 std::vector<pid_t> ProcessesAtHome(const std::string& home) {
@@ -115,15 +117,23 @@ GroupUsage UsageOfGroup(pid_t group) {
     return sum;
 }
 
-void EndChildren() {
+std::uint64_t ResidentBytes(pid_t process) {
+    std::istringstream fields(ReadProcFile(process, "statm"));
+    std::uint64_t skipped = 0;
+    std::uint64_t pages = 0;
+    fields >> skipped >> pages;
+    return pages * static_cast<std::uint64_t>(sysconf(_SC_PAGESIZE));
+}
+
+void EndChildren(pid_t spared) {
     for (;;) {
-        const pid_t ended = waitpid(-1, nullptr, WNOHANG);
-        if (ended < 0 && errno != EINTR)
-            return;
-        if (ended == 0) {
-            KillChildren();
-            waitpid(-1, nullptr, 0);
+        const std::vector<pid_t> children = ChildrenBut(spared);
+        for (const pid_t child : children) { // what they leave is ours in the next round
+            kill(child, SIGKILL);
+            waitpid(child, nullptr, 0);
         }
+        if (children.empty())
+            return;
     }
 }
 

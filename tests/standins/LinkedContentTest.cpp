@@ -11,7 +11,21 @@ namespace fs = std::filesystem;
 
 namespace {
 
-class LinkedContentTest : public OfficeTest {};
+/// With a LibreOffice for so many documents.
+class LinkedContentTest : public OfficeTest, public testing::WithParamInterface<long> {
+protected:
+    void SetUp() override {
+        OfficeTest::SetUp();
+        SetLimit("DocumentsPerStart", GetParam());
+    }
+
+    void TearDown() override {
+        Call("DllUnregisterServer"); // which ends it
+        OfficeTest::TearDown();
+    }
+};
+
+INSTANTIATE_TEST_SUITE_P(Engines, LinkedContentTest, testing::Values(1, 100));
 
 wxString Relationship(const wxString& target, const wxString& type) {
     return R"(<Relationships xmlns="$/package/2006/relationships"><Relationship Id="rId1" Target=")" +
@@ -123,7 +137,7 @@ std::vector<fs::path> WriteSecrets(const TemporaryFolder& folder) {
 
 } // namespace
 
-TEST_F(LinkedContentTest, NothingOfOtherFilesIsPrinted) {
+TEST_P(LinkedContentTest, NothingOfOtherFilesIsPrinted) {
     const LoopbackListener listener;
     std::vector<std::string> others = {"http://127.0.0.1:" + std::to_string(listener.Port()) +
                                        "/picture.png"};
@@ -151,7 +165,7 @@ TEST_F(LinkedContentTest, NothingOfOtherFilesIsPrinted) {
     EXPECT_FALSE(listener.HasVisitor());
 }
 
-TEST_F(LinkedContentTest, NoRequestLeavesADocument) {
+TEST_P(LinkedContentTest, NoRequestLeavesADocument) {
     const LoopbackListener listener;
     const std::string picture =
         "http://127.0.0.1:" + std::to_string(listener.Port()) + "/picture.png";

@@ -1,7 +1,13 @@
 #include "tests/standins/Processes.h"
 
+#include <poll.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+#include <algorithm>
 #include <cctype>
 #include <chrono>
+#include <csignal>
 #include <fstream>
 #include <sstream>
 #include <thread>
@@ -33,6 +39,23 @@ std::vector<pid_t> ProcessesWith(const std::string& text, const char* file) {
 
 std::vector<pid_t> EnginesIn(const fs::path& temporary) {
     return ProcessesWith("HOME=" + temporary.string(), "environ");
+}
+
+std::vector<pid_t> EnginesIn(const fs::path& temporary, const std::string& name) {
+    std::vector<pid_t> engines = EnginesIn(temporary);
+    const auto others = std::remove_if(engines.begin(), engines.end(), [&](pid_t engine) {
+        return Read("/proc/" + std::to_string(engine) + "/comm") != name + "\n";
+    });
+    engines.erase(others, engines.end());
+    return engines;
+}
+
+void EndForCertain(pid_t process) {
+    const auto end = static_cast<int>(syscall(SYS_pidfd_open, process, 0));
+    kill(process, SIGKILL);
+    pollfd event{end, POLLIN, 0};
+    poll(&event, 1, 10'000);
+    close(end);
 }
 
 std::vector<pid_t> SupervisorsIn(const fs::path& temporary) {

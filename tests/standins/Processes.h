@@ -10,6 +10,11 @@
 
 /// The engines whose home lies in a folder for temporary files, with what they have started.
 std::vector<pid_t> EnginesIn(const std::filesystem::path& temporary);
+/// Those of them that go by a name: "office-host" is a LibreOffice that is kept started,
+/// "office-document" its child at work on a document.
+std::vector<pid_t> EnginesIn(const std::filesystem::path& temporary, const std::string& name);
+/// Kills a process, and waits until nothing of it is left: no file that it had open.
+void EndForCertain(pid_t process);
 /// The supervisors whose work folder lies there.
 std::vector<pid_t> SupervisorsIn(const std::filesystem::path& temporary);
 

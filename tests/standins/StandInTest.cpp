@@ -100,8 +100,7 @@ void StandInTest::ExpectNothingOutlivesAKilledClient(
         Signal(client, SIGKILL);
         waitpid(client, nullptr, 0);
         if (withSupervisor) {
-            Signal(supervisor, SIGKILL);
-            EXPECT_TRUE(Await([&] { return SupervisorsIn(m_temporary.Path()).empty(); }));
+            EndForCertain(supervisor);
             EXPECT_NE("", Leftovers()) << "there must be something for the next start to do";
             Call("DllRegisterServer");
         }

@@ -14,6 +14,7 @@ namespace {
 constexpr unsigned LongestSeconds = 24 * 60 * 60;
 constexpr unsigned MostMegabytes = 1 << 20;
 constexpr unsigned MostJobs = 64;
+constexpr unsigned MostEngineDocuments = 10'000;
 
 constexpr const char* Description =
     "quillon converts Office documents (doc docx xls xlsx ppt pptx pps ppsx pub) into files\n"
@@ -98,7 +99,9 @@ void AddConvert(CLI::App& app, CommandLine& line) {
     convert->add_option("--profile", line.profile, "The Distiller profile of the PDF files")
         ->type_name("NAME")
         ->excludes(ps);
-    convert->add_option("-j,--jobs", line.jobs, "How many documents to convert at a time")
+    convert
+        ->add_option("-j,--jobs", line.jobs,
+                     "How many documents to convert at a time; by default as many as pay")
         ->type_name("N")
         ->check(CLI::Range(1U, MostJobs));
     convert->add_option("--set", line.settings, "One setting; may be given several times")
@@ -157,6 +160,11 @@ void AddCommonOptions(CLI::App& app, CommandLine& line) {
         ->check(CLI::Range(256U, MostMegabytes));
     app.add_flag("--require-isolation", line.requireIsolation,
                  "Open no document unless it is kept from the rest of the machine; see status");
+    app.add_option("--engine-documents", line.engineDocuments,
+                   "For how many documents of a run an engine is kept once it is started; 1 to\n"
+                   "start it for each; 500 if not given, or 1 where that is faster")
+        ->type_name("N")
+        ->check(CLI::Range(1U, MostEngineDocuments));
     app.add_option("--filters", line.filtersFolder,
                    "The folder of filters, if not Filters beside the program")
         ->type_name("DIR");

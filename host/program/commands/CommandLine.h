@@ -18,7 +18,7 @@ struct CommandLine {
 
     std::optional<bool> pdf; ///< true for PDF, false for PostScript only
     std::optional<std::string> profile;
-    unsigned jobs = 1; ///< documents at a time
+    std::optional<unsigned> jobs; ///< documents at a time; as many as pay when it is not given
 
     std::optional<std::string> language;
     bool json = false;
@@ -28,6 +28,7 @@ struct CommandLine {
     std::optional<unsigned> limitSeconds;
     unsigned memoryMegabytes = 3584; ///< for a document
     bool requireIsolation = false;
+    std::optional<unsigned> engineDocuments; ///< until an engine is started anew
     std::optional<std::string> filtersFolder;
     std::optional<std::string> standInsFolder;
 };

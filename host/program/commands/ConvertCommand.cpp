@@ -3,10 +3,12 @@
 #include "host/program/documents/Conversion.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
+#include "host/program/machine/MachineSetup.h"
 #include "host/program/report/OutcomeReport.h"
 #include "host/program/report/Progress.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/system/Interruption.h"
+#include "host/program/workers/WorkerCount.h"
 #include "host/program/workers/WorkerPool.h"
 
 #include <wx/intl.h>
@@ -58,6 +60,15 @@ struct Run {
     const OutputFolder& outputFolder;
 };
 
+/// The inputs that are a filter's business.
+std::vector<Input> Convertible(const Run& run) {
+    std::vector<Input> inputs;
+    for (std::size_t i = 0; i < run.inputs.size(); ++i)
+        if (!run.names[i].empty())
+            inputs.push_back(run.inputs[i]);
+    return inputs;
+}
+
 void ConvertInTurn(const Run& run, Reporter& reporter, OrderedReport& report) {
     for (std::size_t i = 0; i < run.inputs.size(); ++i) {
         const Input& input = run.inputs[i];
@@ -90,8 +101,12 @@ std::vector<std::string> WorkerArguments(const CommandLine& line) {
     return arguments;
 }
 
-void ConvertSideBySide(const Run& run, const CommandLine& line, const Settings& settings,
-                       Reporter& reporter, OrderedReport& report) {
+unsigned EngineDocuments(const CommandLine& line, std::size_t documents, std::size_t workers) {
+    return line.engineDocuments.value_or(WorthwhileEngineDocuments(documents, workers));
+}
+
+void ConvertSideBySide(const Run& run, std::size_t workers, const CommandLine& line,
+                       const Settings& settings, Reporter& reporter, OrderedReport& report) {
     std::vector<Assignment> assignments;
     std::vector<std::size_t> numbers; // of the assignments' inputs
     for (std::size_t i = 0; i < run.inputs.size(); ++i) {
@@ -104,8 +119,10 @@ void ConvertSideBySide(const Run& run, const CommandLine& line, const Settings& 
     }
     WorkerPool pool(WorkerArguments(line),
                     std::chrono::seconds(line.stallSeconds.value_or(WorkerPatience)),
-                    {settings.Xml(), run.outputFolder.Path()}, run.filters, reporter);
-    pool.Run(assignments, line.jobs, [&](std::size_t assignment, Outcome outcome) {
+                    {settings.Xml(), run.outputFolder.Path(),
+                     EngineDocuments(line, assignments.size(), workers)},
+                    run.filters, reporter);
+    pool.Run(assignments, workers, [&](std::size_t assignment, Outcome outcome) {
         report.Add(numbers[assignment], std::move(outcome));
     });
 }
@@ -135,9 +152,12 @@ ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filter
     const std::vector<wxString> names = AllotNames(inputs, filters, *outputFolder);
     const Run run = {inputs, names, filters, *outputFolder};
     OrderedReport report(inputs.size(), reporter);
-    if (line.jobs > 1) {
-        ConvertSideBySide(run, line, *settings, reporter, report);
+    const std::vector<Input> convertible = Convertible(run);
+    const std::size_t workers = line.jobs ? *line.jobs : WorthwhileWorkers(convertible);
+    if (workers > 1) {
+        ConvertSideBySide(run, workers, line, *settings, reporter, report);
     } else {
+        KeepEngine(EngineDocuments(line, convertible.size(), workers));
         filters.ApplySettings(settings->Node());
         ConvertInTurn(run, reporter, report);
     }

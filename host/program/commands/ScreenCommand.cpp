@@ -1,8 +1,10 @@
 #include "host/program/commands/Commands.h"
 #include "host/program/documents/Screening.h"
+#include "host/program/machine/MachineSetup.h"
 #include "host/program/report/OutcomeReport.h"
 #include "host/program/settings/Settings.h"
 #include "host/program/system/Interruption.h"
+#include "host/program/workers/WorkerCount.h"
 
 ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,
                    Reporter& reporter) {
@@ -10,6 +12,7 @@ ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filters
     const std::vector<Input> inputs = ListInputs(line.paths);
     if (const auto end = EndIdleRun(filters, inputs, reporter))
         return *end;
+    KeepEngine(line.engineDocuments.value_or(WorthwhileEngineDocuments(inputs.size(), 1)));
     filters.ApplySettings(Settings().Node());
     std::vector<Outcome> outcomes;
     for (const Input& input : inputs) {

@@ -104,10 +104,27 @@ void TellApplications(Reporter& reporter) {
     reporter.Line(_("Office applications"));
     for (const OfficeApplication application : AllOfficeApplications)
         TellApplication(application, reporter);
+}
+
+/// @return why the engine is started anew for each document; nothing when that is not known
+std::optional<wxString> WhyNotKept(const CommandLine& line) {
+    return line.engineDocuments == 1U ? wxString("--engine-documents says so")
+                                      : OfficeEngineKeepingObstacle();
+}
+
+void TellEngine(const CommandLine& line, Reporter& reporter) {
     const wxString engine = OfficeEngine();
     reporter.Line(_("Engine"));
     reporter.Line(OrNone(engine));
-    reporter.Record({{"type", "engine"}, {"version", JsonText(engine)}});
+    Json record = {{"type", "engine"}, {"version", JsonText(engine)}};
+    if (const std::optional<wxString> obstacle = WhyNotKept(line)) {
+        reporter.Line("  " + (obstacle->empty()
+                                  ? wxString("kept started for the documents of a run")
+                                  : "started anew for each document: " + OneLine(*obstacle)));
+        record["kept"] = obstacle->empty();
+        record["reason"] = JsonText(*obstacle);
+    }
+    reporter.Record(record);
 }
 
 void TellPrinters(Reporter& reporter) {
@@ -234,6 +251,7 @@ ExitCode RunStatus(const CommandLine& line, const std::filesystem::path& filters
     const FilterSet filters(filtersFolder);
     TellFilters(filters, filtersFolder, reporter);
     TellApplications(reporter);
+    TellEngine(line, reporter);
     TellPrinters(reporter);
     TellDistiller(reporter);
     TellIsolation(line.memoryMegabytes, reporter);

@@ -1,5 +1,6 @@
 #include "host/program/commands/Commands.h"
 #include "host/program/documents/Conversion.h"
+#include "host/program/machine/MachineSetup.h"
 #include "host/program/settings/Settings.h"
 #include "host/program/system/ChildProcess.h"
 #include "host/program/workers/Messages.h"
@@ -109,6 +110,7 @@ ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& fil
     const std::optional<OutputFolder> outputFolder = OutputFolder::Open(facts.outputFolder, fault);
     if (!settings || !outputFolder)
         EndAtOnce(ExitCode::WrongUsage);
+    KeepEngine(facts.engineDocuments);
     FilterSet filters(filtersFolder);
     filters.ApplySettings(settings->Node());
     run.Done();

@@ -26,6 +26,10 @@ wxString OfficeEngine() {
     return EngineOf(StandInsKey);
 }
 
+std::optional<wxString> OfficeEngineKeepingObstacle() {
+    return ReadRegistryText(wxRegKey::HKLM, StandInsKey, KeepingObstacleValue);
+}
+
 wxString PdfEngine() {
     const wxString standIn = EngineOf(DistillerStandInKey);
     const std::optional<Distiller> distiller = FindDistiller();

@@ -8,6 +8,10 @@
 /// @return empty where they stand for themselves, or there are none
 wxString OfficeEngine();
 
+/// Why that is started anew for each document.
+/// @return empty when it is not; nothing where nobody has looked
+std::optional<wxString> OfficeEngineKeepingObstacle();
+
 /// What makes PDF files on this machine, with its version.
 /// @return empty when nothing is known to
 wxString PdfEngine();

@@ -81,6 +81,11 @@ void EnterLimits(const MachineSetup& setup) {
 void SetUpMachine(const MachineSetup& setup) {
     Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
     EnterLimits(setup);
+    Enter(wxRegKey::HKCU, StandInsKey, ExamineValue, setup.examineEngine ? 1L : 0L);
     RegisterStandIns(setup.standInsFolder);
     AddFilePrinter(ProgramFolder() / "Printers" / "QuillonPS.ppd");
+}
+
+void KeepEngine(unsigned documents) {
+    Enter(wxRegKey::HKCU, StandInsKey, DocumentsPerStartValue, static_cast<long>(documents));
 }

@@ -25,10 +25,15 @@ constexpr const char* LastFontsKey = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Fonts";
 constexpr const char* FontsValue = "Fonts";
 
 constexpr const char* EngineValue = "Engine"; ///< said: name and version of the engine
+/// Said by the Office stand-ins when they are told to examine it: why their engine is started anew
+/// for each document; empty when it is not.
+constexpr const char* KeepingObstacleValue = "KeepingObstacle";
 
 constexpr const char* StallSecondsValue = "StallSeconds"; ///< told: a number
 constexpr const char* TotalSecondsValue = "TotalSeconds"; ///< told: a number
 constexpr const char* MemoryValue = "MemoryMegabytes";    ///< told: a number
+constexpr const char* ExamineValue = "Examine";           ///< told: a number, not 0 for yes
+constexpr const char* DocumentsPerStartValue = "DocumentsPerStart"; ///< told: a number
 /// Told the Distiller stand-in: where the profiles lie that it is asked for by name.
 constexpr const char* UserProfilesValue = "UserProfiles";
 constexpr const char* JobOptionsFolderValue = "JobOptionsFolder";

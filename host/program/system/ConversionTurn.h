@@ -10,6 +10,9 @@ public:
     /// Waits until it is this process's turn.
     ConversionTurn();
 
+    /// Whether turns are taken on this system: then conversions do not overlap.
+    static bool AreTaken();
+
 private:
     std::shared_ptr<void> m_turn;
 };

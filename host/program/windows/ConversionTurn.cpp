@@ -23,3 +23,7 @@ ConversionTurn::ConversionTurn() {
         WaitForSingleObject(mutex, INFINITE); // one that was left behind is ours too
     m_turn.reset(mutex, EndTurn);
 }
+
+bool ConversionTurn::AreTaken() {
+    return true;
+}

@@ -94,7 +94,9 @@ std::string LineOf(const json& message) {
 } // namespace
 
 std::string Encode(const RunFacts& facts) {
-    return LineOf({{"settings", facts.settings}, {"outputFolder", facts.outputFolder.u8string()}});
+    return LineOf({{"settings", facts.settings},
+                   {"outputFolder", facts.outputFolder.u8string()},
+                   {"engineDocuments", facts.engineDocuments}});
 }
 
 std::string Encode(const Assignment& assignment) {
@@ -113,7 +115,8 @@ std::string Encode(const News& news) {
 
 std::optional<RunFacts> DecodeRunFacts(const std::string& line) {
     return Decode<RunFacts>(line, [](const json& message) {
-        return RunFacts{message.at("settings"), PathOf(message.at("outputFolder"))};
+        return RunFacts{message.at("settings"), PathOf(message.at("outputFolder")),
+                        message.at("engineDocuments")};
     });
 }
 

@@ -18,6 +18,7 @@
 struct RunFacts {
     std::string settings; ///< XML
     std::filesystem::path outputFolder;
+    unsigned engineDocuments = 1; ///< until an engine is started anew
 };
 
 /// One document to convert.

@@ -16,6 +16,7 @@ struct EngineJob {
     std::string extension;    ///< of the document, without a dot
     std::string importFilter; ///< LibreOffice's name of the document's type
     std::string exportTo;     ///< extension, colon, LibreOffice's filter with options if any
+    std::string hiddenTo; ///< like exportTo, with hidden slides; empty when that is not asked for
     std::vector<std::string> fontFolders;
     TimeLimits limits{};
     std::uint64_t mostMemory = 0; ///< in bytes, all processes together

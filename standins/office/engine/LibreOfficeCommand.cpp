@@ -1,6 +1,7 @@
 #include "standins/office/engine/LibreOfficeCommand.h"
 
 #include "standins/office/KnownPath.h"
+#include "standins/office/OfficeReach.h"
 #include "standins/office/UserInstallation.h"
 #include "standins/office/engine/TextLibrary.h"
 
@@ -49,16 +50,15 @@ std::vector<std::string> Words(const WorkFolder& folder, const EngineJob& job) {
 }
 
 Reach LibreOfficeReach(const WorkFolder& folder, const EngineJob& job) {
-    Reach reach;
-    reach.readable = {fs::path(job.program).parent_path(), "/etc/libreoffice",
-                      "/var/lib/libreoffice"};
-    AllowSystem(reach);
-    AllowFonts(reach, job.fontFolders);
+    Reach reach = OfficeReach(job.program, job.fontFolders);
     reach.readable.push_back(TextLibraryPath());
     reach.workFolder = folder.Path();
     reach.socketFolders = SocketFolders();
     return reach;
 }
+
+/// A name that no document has.
+constexpr const char* HiddenOutputName = "profile/hidden.pdf";
 
 } // namespace
 
@@ -69,6 +69,10 @@ std::string DocumentPath(const WorkFolder& folder, const EngineJob& job) {
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job) {
     const std::string stem = fs::path(OpenedPath(folder, job)).stem();
     return folder.Path() + '/' + stem + '.' + job.exportTo.substr(0, job.exportTo.find(':'));
+}
+
+std::string HiddenOutputPath(const WorkFolder& folder) {
+    return folder.Path() + "/" + HiddenOutputName;
 }
 
 std::string LogPath(const WorkFolder& folder) {
@@ -90,6 +94,17 @@ EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job,
     command.resources.memory = job.mostMemory;
     command.reach = LibreOfficeReach(folder, job);
     return command;
+}
+
+HostOrder OrderFor(const WorkFolder& folder, const EngineJob& job) {
+    return {folder.Path(),
+            DocumentPath(folder, job),
+            OpenedPath(folder, job),
+            job.importFilter,
+            job.exportTo,
+            OutputPath(folder, job),
+            job.hiddenTo,
+            HiddenOutputPath(folder)};
 }
 
 } // namespace standins

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "standins/engine/EngineProcess.h"
+#include "standins/office/HostOrder.h"
 #include "standins/office/engine/EngineJob.h"
 #include "standins/process/WorkFolder.h"
 
@@ -12,6 +13,7 @@ namespace standins {
 std::string DocumentPath(const WorkFolder& folder, const EngineJob& job);
 /// Named after the document as LibreOffice knows it.
 std::string OutputPath(const WorkFolder& folder, const EngineJob& job);
+std::string HiddenOutputPath(const WorkFolder& folder);
 std::string LogPath(const WorkFolder& folder);
 
 /// How LibreOffice is started on the document in its work folder.
@@ -19,5 +21,8 @@ std::string LogPath(const WorkFolder& folder);
 /// @param log open for writing, where its messages go
 EngineCommand LibreOfficeCommand(const WorkFolder& folder, const EngineJob& job, int input,
                                  int log);
+
+/// What LibreOffice is asked to do when it is started already.
+HostOrder OrderFor(const WorkFolder& folder, const EngineJob& job);
 
 } // namespace standins

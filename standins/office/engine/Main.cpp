@@ -1,15 +1,28 @@
-// The supervisor of one engine run. The server of the Office applications gives it the document
-// to read.
+// The supervisor of engine runs. The server of the Office applications gives it the document to
+// read; or, when it is a standing one, one job after the other.
 
 #include "standins/engine/Supervisor.h"
+#include "standins/office/engine/OfficeHost.h"
 #include "standins/office/engine/Supervision.h"
+#include "standins/process/Words.h"
 
+#include <algorithm>
 #include <cstdlib>
 #include <exception>
+#include <vector>
 
 namespace {
 
-int Run(int argc, char** argv) {
+using Words = std::vector<std::string>;
+
+/// Has CLI11 read the words.
+/// @throws CLI::Error when they are no such options
+void Read(CLI::App& options, Words words) {
+    std::reverse(words.begin(), words.end()); // as CLI11 wants them
+    options.parse(words);
+}
+
+standins::EngineJob ReadJob(const Words& words) {
     standins::EngineJob job;
     standins::SupervisorOptions supervisor;
     CLI::App options("Supervises one run of LibreOffice.");
@@ -19,21 +32,74 @@ int Run(int argc, char** argv) {
     options.add_option("--extension", job.extension)->required();
     options.add_option("--import", job.importFilter)->required();
     options.add_option("--export", job.exportTo)->required();
-    CLI11_PARSE(options, argc, argv);
-    const standins::Channel server = standins::BecomeSupervisor(1, supervisor.mostMemory);
+    options.add_option("--hidden", job.hiddenTo);
+    Read(options, words);
     job.folder = supervisor.folder;
     job.fontFolders = supervisor.fontFolders;
     job.limits = supervisor.Limits();
     job.mostMemory = supervisor.mostMemory;
+    return job;
+}
+
+standins::HostSettings ReadHostSettings(const Words& words) {
+    standins::HostSettings settings;
+    standins::SupervisorOptions supervisor;
+    CLI::App options("Supervises one run of LibreOffice after the other.");
+    supervisor.AddTo(options);
+    options.add_option("--program", settings.program)->required();
+    options.add_option("--documents", settings.mostDocuments)->required();
+    Read(options, words);
+    settings.folder = supervisor.folder;
+    settings.fontFolders = supervisor.fontFolders;
+    settings.limits = supervisor.Limits();
+    settings.mostMemory = supervisor.mostMemory;
+    return settings;
+}
+
+/// Whether the supervisor is to serve for many documents.
+bool IsStanding(const Words& words) {
+    return std::any_of(words.begin(), words.end(),
+                       [](const std::string& word) { return word.rfind("--documents=", 0) == 0; });
+}
+
+/// Tries whether LibreOffice can be kept started.
+void Examine(standins::OfficeHost& host, const standins::Channel& server) {
+    const bool isReady = host.AwaitReady(server);
+    server.Send(isReady ? standins::MessageKind::Done : standins::MessageKind::Failed,
+                host.Reason());
+}
+
+/// Keeps LibreOffice started while there is a server.
+void Stand(const Words& words) {
+    const standins::HostSettings settings = ReadHostSettings(words);
+    const standins::Channel server = standins::BecomeSupervisor(0, settings.mostMemory);
+    standins::OfficeHost host(settings);
+    host.Start();
+    if (settings.mostDocuments == 0)
+        return Examine(host, server);
+    while (const std::optional<standins::Message> job = server.Receive()) {
+        standins::Supervise(ReadJob(standins::SplitWords(job->text)), job->attachment.Get(), server,
+                            &host);
+        host.RenewIfDue();
+    }
+}
+
+void RunOnce(const Words& words) {
+    const standins::EngineJob job = ReadJob(words);
+    const standins::Channel server = standins::BecomeSupervisor(1, job.mostMemory);
     standins::Supervise(job, standins::FirstGivenDescriptor, server);
-    return EXIT_SUCCESS;
 }
 
 } // namespace
 
 int main(int argc, char** argv) {
     try {
-        return Run(argc, argv);
+        const Words words(argv + 1, argv + argc);
+        if (IsStanding(words))
+            Stand(words);
+        else
+            RunOnce(words);
+        return EXIT_SUCCESS;
     } catch (const std::exception&) { // the server sees the channel close
         return EXIT_FAILURE;
     }

@@ -29,9 +29,16 @@ Export LoadOnce(const std::wstring& path, const DocumentFile& document,
     EngineResult result = RunEngine(path, document, format);
     if (result.failure)
         RaiseCannotLoad(path, result.failure);
-    Export output = std::make_shared<const MadeFile>(
-        MadeFile{std::move(result.output), std::move(result.fonts)});
+    Export output =
+        std::make_shared<const MadeFile>(MadeFile{std::move(result.output), result.fonts});
     cache.Add(path, document, format, result.sha256, output);
+    if (result.hiddenOutput.IsOpen()) {
+        DocumentFormat hidden = format;
+        hidden.exportTo = format.hiddenTo;
+        cache.Add(path, document, hidden, result.sha256,
+                  std::make_shared<const MadeFile>(
+                      MadeFile{std::move(result.hiddenOutput), result.fonts}));
+    }
     return output;
 }
 

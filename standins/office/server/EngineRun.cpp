@@ -1,9 +1,9 @@
 #include "standins/office/server/EngineRun.h"
 
 #include "standins/module/ModulePath.h"
-#include "standins/module/SupervisedRun.h"
 #include "standins/module/Text.h"
 #include "standins/office/UserInstallation.h"
+#include "standins/office/server/KeptEngine.h"
 #include "standins/office/server/Settings.h"
 #include "standins/process/WorkFolder.h"
 
@@ -13,17 +13,12 @@ namespace fs = std::filesystem;
 
 namespace standins {
 
-namespace {
-
-constexpr const char* FolderKind = "office";
-
-} // namespace
-
 EngineResult RunEngine(const std::wstring& path, const DocumentFile& document,
                        const DocumentFormat& format) {
     const std::string program = ReadEnginePath();
     if (program.empty())
-        return {Descriptor(), {}, {}, {"LibreOffice is not installed", Fault::Machine}};
+        return {
+            Descriptor(), Descriptor(), {}, {}, {"LibreOffice is not installed", Fault::Machine}};
     SupervisedRun run;
     run.engine = "LibreOffice";
     run.supervisor = HelperPath("office-engine");
@@ -34,26 +29,31 @@ EngineResult RunEngine(const std::wstring& path, const DocumentFile& document,
         std::string("--import=") + format.importFilter,
         "--export=" + format.exportTo,
     };
+    if (!format.hiddenTo.empty())
+        run.arguments.push_back("--hidden=" + format.hiddenTo);
     run.descriptors = {document.descriptor.Get()};
-    run.folder = WorkFolder::NewPath(FolderKind);
+    run.folder = WorkFolder::NewPath(OfficeFolderKind);
     run.clearOutside = RemoveSocket;
     run.limits = ReadTimeLimits();
     run.mostMemory = ReadMemoryLimit();
+    Descriptor hiddenOutput;
+    run.takePart = [&hiddenOutput](Message part) { hiddenOutput = std::move(part.attachment); };
 
-    Message result = RunSupervised(run);
+    Message result = RunByKeptEngine(run, program);
     if (result.kind != MessageKind::Done || !result.attachment.IsOpen())
-        return {Descriptor(), {}, {}, {result.text, result.fault}};
+        return {Descriptor(), Descriptor(), {}, {}, {result.text, result.fault}};
     // The sum is a line, the fonts follow; a text that is too long is cut off.
     const std::size_t sum = result.text.find('\n');
     const std::size_t end = result.text.rfind('\n') + 1;
     return {std::move(result.attachment),
+            std::move(hiddenOutput),
             result.text.substr(0, sum),
             result.text.substr(sum + 1, end - sum - 1),
             {}};
 }
 
 void ClearAfterKilledRuns() {
-    WorkFolder::DiscardAbandoned(FolderKind, RemoveSocket);
+    WorkFolder::DiscardAbandoned(OfficeFolderKind, RemoveSocket);
 }
 
 } // namespace standins

@@ -10,7 +10,8 @@ namespace standins {
 
 /// What came of an engine run.
 struct EngineResult {
-    Descriptor output; ///< what LibreOffice made
+    Descriptor output;       ///< what LibreOffice made
+    Descriptor hiddenOutput; ///< the same with hidden slides; closed when it is not known
     std::string sha256;
     std::string fonts; ///< those that others stood in for, as LeaveFonts takes them
     Failure failure;

@@ -24,6 +24,7 @@ Export OpenedDocument::MadeAs(const std::string& exportTo) const {
     Pages();
     DocumentFormat format = m_format;
     format.exportTo = exportTo;
+    format.hiddenTo.clear();
     return LoadDocument(m_path, m_file, format);
 }
 

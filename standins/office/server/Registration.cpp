@@ -5,6 +5,7 @@
 #include "standins/module/RegistryKey.h"
 #include "standins/module/Text.h"
 #include "standins/office/server/Applications.h"
+#include "standins/office/server/KeptEngine.h"
 #include "standins/office/server/LibreOffice.h"
 #include "standins/office/server/Settings.h"
 
@@ -57,7 +58,9 @@ void Unregister(const Application& application) {
 bool EnterFacts(const LibreOffice& libreOffice) {
     const RegistryKey key = RegistryKey::Create(HKEY_LOCAL_MACHINE, SettingsKey);
     return key.SetText(EngineValue, FromUtf8(libreOffice.name)) &&
-           key.SetText(EnginePathValue, FromUtf8(libreOffice.program));
+           key.SetText(EnginePathValue, FromUtf8(libreOffice.program)) &&
+           (!ReadExamine() ||
+            key.SetText(KeepingObstacleValue, WhyEngineCannotBeKept(libreOffice.program)));
 }
 
 void RemoveFacts() {
@@ -66,6 +69,7 @@ void RemoveFacts() {
     const RegistryKey key = RegistryKey::Create(HKEY_LOCAL_MACHINE, SettingsKey);
     key.Delete(EngineValue);
     key.Delete(EnginePathValue);
+    key.Delete(KeepingObstacleValue);
 }
 
 } // namespace
@@ -85,6 +89,7 @@ HRESULT RegisterApplications() {
 }
 
 HRESULT UnregisterApplications() {
+    EndKeptEngine();
     for (const Application& application : Applications())
         Unregister(application);
     RemoveFacts();

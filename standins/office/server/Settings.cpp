@@ -16,6 +16,16 @@ std::uint64_t ReadMemoryLimit() {
     return ReadMemoryLimit(SettingsKey);
 }
 
+bool ReadExamine() {
+    return RegistryKey::Open(HKEY_CURRENT_USER, SettingsKey).Number(L"Examine").value_or(0) != 0;
+}
+
+unsigned ReadDocumentsPerStart() {
+    return RegistryKey::Open(HKEY_CURRENT_USER, SettingsKey)
+        .Number(L"DocumentsPerStart")
+        .value_or(1);
+}
+
 std::string ReadEnginePath() {
     const RegistryKey key = RegistryKey::Open(HKEY_LOCAL_MACHINE, SettingsKey);
     return ToUtf8(key.Text(EnginePathValue).value_or(std::wstring())).value_or(std::string());

@@ -7,10 +7,10 @@ namespace standins {
 namespace {
 
 const std::vector<DocumentFormat> Formats = {
-    {"ppt", "MS PowerPoint 97", SlidesExport},
-    {"pps", "MS PowerPoint 97 AutoPlay", SlidesExport},
-    {"pptx", "Impress MS PowerPoint 2007 XML", SlidesExport},
-    {"ppsx", "Impress MS PowerPoint 2007 XML AutoPlay", SlidesExport},
+    {"ppt", "MS PowerPoint 97", SlidesExport, HiddenSlidesExport},
+    {"pps", "MS PowerPoint 97 AutoPlay", SlidesExport, HiddenSlidesExport},
+    {"pptx", "Impress MS PowerPoint 2007 XML", SlidesExport, HiddenSlidesExport},
+    {"ppsx", "Impress MS PowerPoint 2007 XML AutoPlay", SlidesExport, HiddenSlidesExport},
 };
 
 constexpr UINT OpenFileName = 0; // the others have no bearing: nothing is changed or shown

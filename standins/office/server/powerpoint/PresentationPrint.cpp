@@ -8,7 +8,7 @@ namespace {
 // for both.
 #define IMPRESS_PDF                                                                                \
     "pdf:impress_pdf_Export:{\"ExportNotes\":{\"type\":\"boolean\",\"value\":\"true\"}"
-constexpr const char* HiddenSlides = R"(,"ExportHiddenSlides":{"type":"boolean","value":"true"})";
+#define HIDDEN_SLIDES ",\"ExportHiddenSlides\":{\"type\":\"boolean\",\"value\":\"true\"}"
 constexpr const char* OnlyNotesPages =
     R"(,"ExportNotesPages":{"type":"boolean","value":"true"})"
     R"(,"ExportOnlyNotesPages":{"type":"boolean","value":"true"})";
@@ -36,13 +36,14 @@ int SlidesPerHandout(PresentationPrint::Output output) {
 } // namespace
 
 const char* const SlidesExport = IMPRESS_PDF "}";
+const char* const HiddenSlidesExport = IMPRESS_PDF HIDDEN_SLIDES "}";
 
 std::string ExportFor(const PresentationPrint& print) {
     if (print.output == PresentationPrint::Outline)
         return "odp:impress8";
     std::string pdf = IMPRESS_PDF;
     if (print.hiddenSlides)
-        pdf += HiddenSlides;
+        pdf += HIDDEN_SLIDES;
     if (print.output == PresentationPrint::NotesPages)
         pdf += OnlyNotesPages;
     return pdf + "}";
@@ -70,6 +71,7 @@ std::vector<std::string> LayoutFor(const PresentationPrint& print) {
     return layout;
 }
 
+#undef HIDDEN_SLIDES
 #undef IMPRESS_PDF
 
 } // namespace standins

@@ -40,6 +40,8 @@ using SharedPresentationPrint = std::shared_ptr<PresentationPrint>;
 
 /// How a presentation is loaded to begin with: as its slides, without the hidden ones.
 extern const char* const SlidesExport;
+/// The same with the hidden ones, which may be asked for next.
+extern const char* const HiddenSlidesExport;
 
 /// As what the engine must make the presentation for this print, as in DocumentFormat.
 std::string ExportFor(const PresentationPrint& print);
