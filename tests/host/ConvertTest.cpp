@@ -13,7 +13,7 @@ TEST_F(ConvertTest, DrivesTheFilterInItsOrderAndReportsTheOutput) {
     m_folder.Write("a.doc", "script");
     m_folder.Write("b.doc", "script");
     const std::string log = (m_folder / "log").string();
-    const RunResult run = Convert({"a.doc", "b.doc"}, {"--log", log});
+    const RunResult run = Convert({"a.doc", "b.doc"}, {"-j", "1", "--log", log});
     ASSERT_EQ(run.exitCode, 0) << run.err;
     const json document = run.Records("document").at(0);
     EXPECT_EQ(document["state"], "converted");
@@ -186,7 +186,7 @@ TEST_F(ConvertTest, AnInterruptionFinishesTheDocumentAndReportsTheRest) {
     m_folder.Write("a.doc", "started=" + started + "\nwait=" + (m_folder / "go").string());
     m_folder.Write("b.doc", "script");
     for (const auto ask : {&RunningProgram::Interrupt, &RunningProgram::Terminate}) {
-        RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc", "b.doc"})));
+        RunningProgram program(QuillonCommand(ArgumentsFor({"a.doc", "b.doc"}, {"-j", "1"})));
         AwaitFile(started);
         (program.*ask)();
         program.AwaitNote();
