@@ -55,13 +55,15 @@ Exit codes
 
 Output
   One line for each file when it is done, in the order of the files: input, output, state, result
-  code, its text, seconds. What the program says is in the language of --lang, or else of LC_ALL,
+  code, its text, seconds; below it, the fonts that it asks for and that are not installed, with
+  those that stood in. What the program says is in the language of --lang, or else of LC_ALL,
   LC_MESSAGES or LANG. In English are this help, the log, what is wrong with a command line, and
   what the system or an engine's libraries say in their own words.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
   printer, distiller, isolation, panel, missing, document, summary and error; lines for people then go to
   stderr. The "code", the "state" and the "fault" (document, machine or null) of a document are the
-  same in every language.
+  same in every language; "fonts" are those not installed, each with what was "asked" for and "used",
+  and whether both have the "sameMetrics", so that lines break alike.
 )";
 
 std::string SettingsTable() {
