@@ -2,7 +2,7 @@
 
 #include "plugin/WQPlugin.h"
 
-#include <windows.h>
+#include <wx/msw/wrapwin.h>
 
 #include <filesystem>
 #include <memory>
