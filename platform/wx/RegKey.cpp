@@ -116,7 +116,10 @@ bool wxRegKey::SetValue(const wxString& name, const wxString& value) {
 }
 
 bool wxRegKey::DeleteValue(const wxString& name) {
-    return Open() && RegDeleteValueW(m_key, ValueName(name)) == ERROR_SUCCESS;
+    if (!Open())
+        return false;
+    const LSTATUS result = RegDeleteValueW(m_key, ValueName(name));
+    return result == ERROR_SUCCESS || result == ERROR_FILE_NOT_FOUND;
 }
 
 bool wxRegKey::DeleteSelf() {

@@ -30,6 +30,7 @@ public:
     bool QueryValue(const wxString& name, long* value) const;
     bool SetValue(const wxString& name, long value);
     bool SetValue(const wxString& name, const wxString& value);
+    /// A value that is not there is no failure.
     bool DeleteValue(const wxString& name);
     bool DeleteSelf();
 
