@@ -40,6 +40,8 @@ add_dependencies(libreoffice uno_headers)
 target_include_directories(libreoffice SYSTEM INTERFACE
     "${uno_headers}" "${LIBREOFFICE_SDK}/include" "${LIBREOFFICEKIT_INCLUDE}")
 target_compile_definitions(libreoffice INTERFACE CPPU_ENV=gcc3 LINUX UNX LOK_USE_UNSTABLE_API)
+# What those of the SDK need in turn lies with the program.
+target_link_options(libreoffice INTERFACE "-Wl,-rpath-link,${LIBREOFFICE_PROGRAM}")
 target_link_libraries(libreoffice INTERFACE
     "${LIBREOFFICE_SDK}/lib/libuno_cppu.so"
     "${LIBREOFFICE_SDK}/lib/libuno_cppuhelpergcc3.so"
