@@ -115,7 +115,8 @@ std::optional<EngineProcess> OfficeHost::Fork(const HostOrder& order, int log,
     const std::optional<Message> answer = Await(server);
     if (!answer || answer->kind != MessageKind::Started)
         return Fail(answer ? answer->text : m_reason);
-    EngineProcess engine = EngineProcess::Adopt(std::atoi(answer->text.c_str()), m_settings.limits);
+    const auto child = static_cast<pid_t>(std::strtol(answer->text.c_str(), nullptr, 10));
+    EngineProcess engine = EngineProcess::Adopt(child, m_settings.limits);
     if (!engine.IsStarted())
         return Fail("its child cannot be watched: " + ErrorWords(errno));
     ++m_served;
