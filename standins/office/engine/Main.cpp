@@ -22,6 +22,15 @@ void Read(CLI::App& options, Words words) {
     options.parse(words);
 }
 
+/// Takes over what every supervisor is told.
+template <typename Settings>
+void Take(const standins::SupervisorOptions& options, Settings& settings) {
+    settings.folder = options.folder;
+    settings.fontFolders = options.fontFolders;
+    settings.limits = options.Limits();
+    settings.mostMemory = options.mostMemory;
+}
+
 standins::EngineJob ReadJob(const Words& words) {
     standins::EngineJob job;
     standins::SupervisorOptions supervisor;
@@ -34,10 +43,7 @@ standins::EngineJob ReadJob(const Words& words) {
     options.add_option("--export", job.exportTo)->required();
     options.add_option("--hidden", job.hiddenTo);
     Read(options, words);
-    job.folder = supervisor.folder;
-    job.fontFolders = supervisor.fontFolders;
-    job.limits = supervisor.Limits();
-    job.mostMemory = supervisor.mostMemory;
+    Take(supervisor, job);
     return job;
 }
 
@@ -49,10 +55,7 @@ standins::HostSettings ReadHostSettings(const Words& words) {
     options.add_option("--program", settings.program)->required();
     options.add_option("--documents", settings.mostDocuments)->required();
     Read(options, words);
-    settings.folder = supervisor.folder;
-    settings.fontFolders = supervisor.fontFolders;
-    settings.limits = supervisor.Limits();
-    settings.mostMemory = supervisor.mostMemory;
+    Take(supervisor, settings);
     return settings;
 }
 

@@ -31,8 +31,8 @@ std::string TemporaryFolder(const EngineJob& job) {
 
 /// What comes of a job.
 struct Result {
-    std::string
-        text; ///< the document's SHA-256, and a line for each font that another stands in for
+    /// The document's SHA-256, and a line for each font that another stands in for.
+    std::string text;
     Descriptor output;
     Descriptor hiddenOutput; ///< closed when there is none
 };
