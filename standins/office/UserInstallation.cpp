@@ -48,8 +48,8 @@ void RemoveSocket(const std::string& workFolder) {
     const std::string name = "SingleOfficeIPC_" + SocketId(UserInstallationUrl(workFolder));
     // The user's number is not in it where LibreOffice cannot learn who the user is.
     for (const std::string& socket : {std::to_string(getuid()) + "_" + name, name})
-        for (const std::string& folder : SocketFolders())
-            unlink((folder + "/OSL_PIPE_" + socket).c_str());
+        for (std::string path : SocketFolders())
+            unlink(path.append("/OSL_PIPE_").append(socket).c_str());
 }
 
 } // namespace standins

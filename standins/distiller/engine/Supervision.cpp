@@ -94,7 +94,7 @@ Failure Distill(const DistillerJob& job, const Channel& bridge) {
     const WorkFolder folder(job.folder);
     if (!folder.IsMade())
         return MachineFailure("no folder can be made in " + TemporaryFolder(job), errno);
-    const Failure failure = MakePdf(job, folder, bridge);
+    Failure failure = MakePdf(job, folder, bridge);
     if (!IsDocumentsFault(failure))
         return failure;
     if (IsFull(job.pdf))
