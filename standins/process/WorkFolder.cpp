@@ -39,7 +39,7 @@ std::string NamePrefix(const std::string& kind) {
 }
 
 bool IsNumber(std::string_view text) {
-    return !text.empty() && text.find_first_not_of("0123456789") == text.npos;
+    return !text.empty() && text.find_first_not_of("0123456789") == std::string_view::npos;
 }
 
 /// Whether NewPath gives such names.
@@ -48,7 +48,7 @@ bool IsName(std::string_view name, const std::string& prefix) {
         return false;
     const std::string_view numbers = name.substr(prefix.size());
     const std::size_t dash = numbers.find('-');
-    return dash != numbers.npos && IsNumber(numbers.substr(0, dash)) &&
+    return dash != std::string_view::npos && IsNumber(numbers.substr(0, dash)) &&
            IsNumber(numbers.substr(dash + 1));
 }
 

@@ -81,9 +81,9 @@ TEST_P(DriverTest, EndsWithAnyCallThatFails) {
             EXPECT_EQ(Result::PrintFailed, run.Print());
             const std::vector<std::string>& journal = run.office.Journal();
             ASSERT_GT(journal.size(), step);
+            const auto next = journal.begin() + static_cast<std::ptrdiff_t>(step) + 1;
             for (const std::string& line : GetParam().afterFailure)
-                if (!IsRelease(line) ||
-                    std::find(journal.begin() + step + 1, journal.end(), line) != journal.end())
+                if (!IsRelease(line) || std::find(next, journal.end(), line) != journal.end())
                     expected.push_back(line);
             EXPECT_THAT(journal, ElementsAreArray(expected));
             EXPECT_EQ(GetParam().steps[step].percent, run.progress.percents.back()) << step;

@@ -51,7 +51,7 @@ Failure MakeOutput(const EngineJob& job, const WorkFolder& folder, const Surroun
                               S_IRUSR | S_IWUSR));
     const EngineCommand command = LibreOfficeCommand(folder, job, input.Get(), log.Get());
     EngineWatch watch(EngineName, job.limits, job.mostMemory, around.server);
-    const Failure failure = RunLibreOffice(
+    Failure failure = RunLibreOffice(
         {command, OrderFor(folder, job)}, around.host, watch, [&folder] { return folder.Size(); },
         around.server);
     if (failure)
@@ -79,7 +79,7 @@ Failure ConvertInFolder(const EngineJob& job, int document, const WorkFolder& fo
         return MachineFailure(EngineName + "'s profile cannot be written", errno);
     EngineJob ownJob = job;
     ownJob.importFilter = ImportFilterOf(DocumentPath(folder, job), job.importFilter);
-    const Failure failure = MakeOutput(ownJob, folder, around, result);
+    Failure failure = MakeOutput(ownJob, folder, around, result);
     result.text += '\n' + ReadFontStandIns(folder.Path());
     return failure;
 }
@@ -89,7 +89,7 @@ Failure Convert(const EngineJob& job, int document, const Surroundings& around, 
     const WorkFolder folder(job.folder);
     if (!folder.IsMade())
         return MachineFailure("no folder can be made in " + TemporaryFolder(job), errno);
-    const Failure failure = ConvertInFolder(job, document, folder, around, result);
+    Failure failure = ConvertInFolder(job, document, folder, around, result);
     const bool lacksRoom = IsDocumentsFault(failure) && IsFull(folder.Path());
     return lacksRoom ? NoRoomFailure(TemporaryFolder(job)) : failure;
 }
