@@ -10,6 +10,7 @@ set(uno_types
     com.sun.star.beans.PropertyValue
     com.sun.star.beans.XPropertySet
     com.sun.star.container.XNameReplace
+    com.sun.star.document.MacroExecMode
     com.sun.star.drawing.XDrawPagesSupplier
     com.sun.star.frame.XComponentLoader
     com.sun.star.frame.XStorable

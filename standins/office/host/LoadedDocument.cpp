@@ -4,6 +4,7 @@
 
 #include <com/sun/star/beans/PropertyValue.hpp>
 #include <com/sun/star/beans/XPropertySet.hpp>
+#include <com/sun/star/document/MacroExecMode.hpp>
 #include <com/sun/star/drawing/XDrawPagesSupplier.hpp>
 #include <com/sun/star/frame/XComponentLoader.hpp>
 #include <com/sun/star/frame/XStorable.hpp>
@@ -64,6 +65,7 @@ uno::Reference<lang::XComponent> Load(const OUString& url, const OUString& impor
         .Add("OpenNewView", true)
         .Add("Hidden", true)
         .Add("Silent", true)
+        .Add("MacroExecutionMode", document::MacroExecMode::NEVER_EXECUTE)
         .Add("FilterName", importFilter);
     return desktop->loadComponentFromURL(url, "_blank", 0, arguments.All());
 }
