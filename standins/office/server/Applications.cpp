@@ -1,10 +1,5 @@
 #include "standins/office/server/Applications.h"
 
-#include "standins/office/server/excel/ExcelApplication.h"
-#include "standins/office/server/powerpoint/PowerPointApplication.h"
-#include "standins/office/server/publisher/PublisherApplication.h"
-#include "standins/office/server/word/WordApplication.h"
-
 namespace standins {
 
 const std::vector<Application>& Applications() {
@@ -13,22 +8,22 @@ const std::vector<Application>& Applications() {
          L"Word.Application",
          L"Word, served by LibreOffice",
          {"libswlo.so"},
-         MakeObject<WordApplication>},
+         StartWord},
         {{0x111CA3CB, 0xD64A, 0x4DD7, {0x9A, 0x0F, 0x63, 0xC1, 0x02, 0x32, 0xBF, 0xEC}},
          L"Excel.Application",
          L"Excel, served by LibreOffice",
          {"libsclo.so"},
-         MakeObject<ExcelApplication>},
+         StartExcel},
         {{0xFB1FDA8C, 0xEE57, 0x4938, {0x87, 0x8B, 0xB5, 0x7A, 0x25, 0x51, 0xD5, 0x53}},
          L"PowerPoint.Application",
          L"PowerPoint, served by LibreOffice",
          {"libsdlo.so"},
-         MakeObject<PowerPointApplication>},
+         StartPowerPoint},
         {{0x6DB2C1F6, 0x5C0B, 0x4C94, {0x9B, 0x1D, 0x5A, 0x0E, 0x7F, 0x3C, 0xD8, 0x42}},
          L"Publisher.Application",
          L"Publisher, served by LibreOffice",
          {"libsdlo.so", "libwpftdrawlo.so"}, // Draw, and its import of publications
-         MakeObject<PublisherApplication>},
+         StartPublisher},
     };
     return applications;
 }

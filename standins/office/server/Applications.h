@@ -17,6 +17,13 @@ struct Application {
 
 const std::vector<Application>& Applications();
 
+// A new running application each, as the root of its object model.
+
+IDispatch* StartWord();
+IDispatch* StartExcel();
+IDispatch* StartPowerPoint();
+IDispatch* StartPublisher();
+
 /// The version of Office that the stand-ins say they are, as the last part of a ProgID.
 constexpr const wchar_t* OfficeVersion = L"16";
 

@@ -7,6 +7,7 @@
 
 #include <cwchar>
 #include <exception>
+#include <memory>
 #include <new>
 
 namespace standins {
@@ -95,7 +96,7 @@ HRESULT AutomationObject::GetIDsOfNames(REFIID /*reserved*/, LPOLESTR* names, UI
                                         LCID /*locale*/, DISPID* ids) {
     if (!names || !ids || count == 0)
         return E_INVALIDARG;
-    const Member* member = FindMember(Members(), names[0]);
+    const Member* member = FindMember(m_members, names[0]);
     ids[0] = member ? member->id : DISPID_UNKNOWN;
     for (UINT i = 1; i < count; ++i) // names of arguments
         ids[i] = DISPID_UNKNOWN;
@@ -109,7 +110,7 @@ HRESULT AutomationObject::Invoke(DISPID id, REFIID reserved, LCID /*locale*/, WO
         return DISP_E_UNKNOWNINTERFACE;
     if (!arguments)
         return E_INVALIDARG;
-    const Member* member = FindMember(Members(), id, flags);
+    const Member* member = FindMember(m_members, id, flags);
     if (!member)
         return DISP_E_MEMBERNOTFOUND;
     if (const HRESULT suits = CheckArguments(*member, *arguments); FAILED(suits))

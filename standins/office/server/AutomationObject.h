@@ -4,7 +4,6 @@
 #include "standins/office/server/Session.h"
 
 #include <atomic>
-#include <memory>
 #include <vector>
 
 namespace standins {
@@ -41,12 +40,10 @@ public:
                                      UINT* badArgument) final;
 
 protected:
-    using SharedSession = std::shared_ptr<Session>;
-
-    explicit AutomationObject(SharedSession session) : m_session(std::move(session)) {}
+    /// @param members its table
+    AutomationObject(SharedSession session, std::vector<Member> members)
+        : m_session(std::move(session)), m_members(std::move(members)) {}
     virtual ~AutomationObject() = default;
-
-    virtual const std::vector<Member>& Members() const = 0;
 
     const SharedSession& TheSession() const { return m_session; }
 
@@ -54,6 +51,7 @@ private:
     void Perform(const Member& member, Call& call);
 
     SharedSession m_session;
+    std::vector<Member> m_members;
     std::atomic<ULONG> m_references = 1;
 };
 
@@ -63,7 +61,7 @@ IDispatch* MakeObject(Arguments&&... arguments) {
     return new Object(std::forward<Arguments>(arguments)...);
 }
 
-// From a table's line to the operation of the object.
+// The lines of a table: an object's operation, and how it is called.
 
 template <typename Object>
 Object& As(AutomationObject& object, void (Object::*)(Call&)) {
@@ -73,6 +71,21 @@ Object& As(AutomationObject& object, void (Object::*)(Call&)) {
 template <auto Operation>
 void Handle(AutomationObject& object, Call& call) {
     (As(object, Operation).*Operation)(call);
+}
+
+template <auto Operation>
+Member Method(DISPID id, const wchar_t* name, UINT required, UINT accepted) {
+    return {id, DISPATCH_METHOD, name, required, accepted, Handle<Operation>};
+}
+
+template <auto Operation>
+Member Get(DISPID id, const wchar_t* name) {
+    return {id, DISPATCH_PROPERTYGET, name, 0, 0, Handle<Operation>};
+}
+
+template <auto Operation>
+Member Put(DISPID id, const wchar_t* name) {
+    return {id, DISPATCH_PROPERTYPUT, name, 1, 1, Handle<Operation>};
 }
 
 } // namespace standins

@@ -2,6 +2,7 @@
 
 #include "standins/office/server/ModuleUse.h"
 
+#include <memory>
 #include <string>
 #include <utility>
 
@@ -17,5 +18,7 @@ struct Session {
     std::wstring printer;  ///< the active printer
     ModuleUse use{};
 };
+
+using SharedSession = std::shared_ptr<Session>;
 
 } // namespace standins

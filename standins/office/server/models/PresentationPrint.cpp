@@ -1,4 +1,4 @@
-#include "standins/office/server/powerpoint/PresentationPrint.h"
+#include "standins/office/server/models/PresentationPrint.h"
 
 namespace standins {
 

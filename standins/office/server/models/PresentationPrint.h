@@ -1,6 +1,5 @@
 #pragma once
 
-#include <memory>
 #include <string>
 #include <vector>
 
@@ -35,8 +34,6 @@ struct PresentationPrint {
     bool frames = false;
     bool comments = true;
 };
-
-using SharedPresentationPrint = std::shared_ptr<PresentationPrint>;
 
 /// How a presentation is loaded to begin with: as its slides, without the hidden ones.
 extern const char* const SlidesExport;
