@@ -1,4 +1,4 @@
-#include "platform/win32/com/ComObject.h"
+#include "platform/com/ComObject.h"
 #include "platform/win32/log/LogSink.h"
 #include "platform/win32/storage/Document.h"
 #include "platform/win32/text/Utf8.h"
@@ -12,7 +12,7 @@ namespace {
 
 constexpr std::size_t LongestName = 31;
 
-class Stream final : public win32::ComObject<IStream> {
+class Stream final : public ComObject<IStream> {
 public:
     Stream(std::shared_ptr<Document> document, GsfInputPointer input, std::wstring key)
         : ComObject(IID_IStream), m_document(std::move(document)), m_input(std::move(input)),
@@ -62,7 +62,7 @@ private:
     std::uint64_t m_position = 0;
 };
 
-class Storage final : public win32::ComObject<IStorage> {
+class Storage final : public ComObject<IStorage> {
 public:
     explicit Storage(std::shared_ptr<Document> document)
         : ComObject(IID_IStorage), m_document(std::move(document)) {}

@@ -57,28 +57,6 @@ HRESULT Raise(const Raised& error, const wchar_t* source, EXCEPINFO* exception) 
 
 } // namespace
 
-HRESULT AutomationObject::QueryInterface(REFIID iid, void** object) {
-    if (!object)
-        return E_POINTER;
-    *object = nullptr;
-    if (iid != IID_IUnknown && iid != IID_IDispatch)
-        return E_NOINTERFACE;
-    *object = static_cast<IDispatch*>(this);
-    AddRef();
-    return S_OK;
-}
-
-ULONG AutomationObject::AddRef() {
-    return ++m_references;
-}
-
-ULONG AutomationObject::Release() {
-    const ULONG left = --m_references;
-    if (left == 0)
-        delete this;
-    return left;
-}
-
 HRESULT AutomationObject::GetTypeInfoCount(UINT* count) {
     if (!count)
         return E_POINTER;

@@ -1,9 +1,9 @@
 #pragma once
 
+#include "platform/com/ComObject.h"
 #include "standins/office/server/Call.h"
 #include "standins/office/server/Session.h"
 
-#include <atomic>
 #include <vector>
 
 namespace standins {
@@ -23,14 +23,8 @@ struct Member {
 /// An object of an application's object model. It is driven by DISPID; its table says what it
 /// answers. It lives until its last Release, the application's Quit or not; after Quit every call
 /// raises.
-class AutomationObject : public IDispatch {
+class AutomationObject : public ComObject<IDispatch> {
 public:
-    AutomationObject(const AutomationObject&) = delete;
-    AutomationObject& operator=(const AutomationObject&) = delete;
-
-    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) final;
-    ULONG STDMETHODCALLTYPE AddRef() final;
-    ULONG STDMETHODCALLTYPE Release() final;
     HRESULT STDMETHODCALLTYPE GetTypeInfoCount(UINT* count) final;
     HRESULT STDMETHODCALLTYPE GetTypeInfo(UINT index, LCID locale, ITypeInfo** info) final;
     HRESULT STDMETHODCALLTYPE GetIDsOfNames(REFIID reserved, LPOLESTR* names, UINT count,
@@ -42,8 +36,7 @@ public:
 protected:
     /// @param members its table
     AutomationObject(SharedSession session, std::vector<Member> members)
-        : m_session(std::move(session)), m_members(std::move(members)) {}
-    virtual ~AutomationObject() = default;
+        : ComObject(IID_IDispatch), m_session(std::move(session)), m_members(std::move(members)) {}
 
     const SharedSession& TheSession() const { return m_session; }
 
@@ -52,7 +45,6 @@ private:
 
     SharedSession m_session;
     std::vector<Member> m_members;
-    std::atomic<ULONG> m_references = 1;
 };
 
 /// Makes an object of the given class; the reference is the caller's.

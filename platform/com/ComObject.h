@@ -1,10 +1,10 @@
 #pragma once
 
+// Written on the Windows API alone, for whoever implements an interface of COM's.
+
 #include <objbase.h>
 
 #include <atomic>
-
-namespace win32 {
 
 /// The part of IUnknown that is the same for every object: counted references, one interface.
 /// Make one with new and hand it out: it begins with the caller's reference and goes by its last
@@ -43,5 +43,3 @@ private:
     const IID& m_iid; // one of the fixed ones
     std::atomic<ULONG> m_references = 1;
 };
-
-} // namespace win32
