@@ -30,5 +30,7 @@ endfunction()
 
 find_program(CCACHE ccache)
 if(CCACHE)
-    set(CMAKE_CXX_COMPILER_LAUNCHER "${CCACHE}")
+    # It looks into precompiled headers only when it is told that they may be trusted.
+    set(CMAKE_CXX_COMPILER_LAUNCHER "${CMAKE_COMMAND}" -E env
+        CCACHE_SLOPPINESS=pch_defines,time_macros "${CCACHE}")
 endif()
