@@ -1,6 +1,5 @@
 #include "host/program/commands/CommandLine.h"
 
-#include "host/program/ExitCode.h"
 #include "host/program/settings/RunSettings.h"
 
 #include <CLI/CLI.hpp>
@@ -10,11 +9,6 @@
 #include <sstream>
 
 namespace {
-
-constexpr unsigned LongestSeconds = 24 * 60 * 60;
-constexpr unsigned MostMegabytes = 1 << 20;
-constexpr unsigned MostJobs = 64;
-constexpr unsigned MostEngineDocuments = 10'000;
 
 constexpr const char* Description =
     "quillon converts Office documents (doc docx xls xlsx ppt pptx pps ppsx pub) into files\n"
@@ -78,101 +72,14 @@ std::string SettingsTable() {
     return table.str();
 }
 
-void AddPaths(CLI::App& command, CommandLine& line) {
-    command.add_option("PATH", line.paths, "Files, or folders of files")->required();
-}
-
-void AddConvert(CLI::App& app, CommandLine& line) {
-    CLI::App* const convert =
-        app.add_subcommand("convert", "Convert documents: quillon convert PATH… --out DIR");
-    AddPaths(*convert, line);
-    convert->add_option("-o,--out", line.out, "The folder for the output")
-        ->required()
-        ->type_name("DIR");
-    convert->add_option("--printer", line.printer, "The printer to print on")->type_name("NAME");
-    convert->add_option("--settings", line.settingsFile, "A file with settings")
-        ->type_name("FILE.xml");
-    CLI::Option* const ps = convert->add_flag_callback(
-        "--ps", [&line] { line.pdf = false; }, "Make PostScript files only");
-    convert
-        ->add_flag_callback(
-            "--pdf", [&line] { line.pdf = true; }, "Make PDF files too")
-        ->excludes(ps);
-    convert->add_option("--profile", line.profile, "The Distiller profile of the PDF files")
-        ->type_name("NAME")
-        ->excludes(ps);
-    convert
-        ->add_option("-j,--jobs", line.jobs,
-                     "How many documents to convert at a time; by default as many as pay")
-        ->type_name("N")
-        ->check(CLI::Range(1U, MostJobs));
-    convert->add_option("--set", line.settings, "One setting; may be given several times")
-        ->type_name("KEY=VALUE")
-        ->allow_extra_args(false);
-    convert->final_callback([&line] { line.command = Command::Convert; });
-}
-
-void AddSettings(CLI::App& app, CommandLine& line) {
-    CLI::App* const settings =
-        app.add_subcommand("settings", "Show the filters' settings in a window and change them:\n"
-                                       "quillon settings --settings FILE.xml");
-    settings->add_option("--settings", line.settingsFile, "The file; if there is none, it is made")
-        ->required()
-        ->type_name("FILE.xml");
-    settings->final_callback([&line] { line.command = Command::Settings; });
-}
-
-void AddCommands(CLI::App& app, CommandLine& line) {
-    app.add_subcommand("status", "Show what there is to convert with, and what is missing")
-        ->final_callback([&line] { line.command = Command::Status; });
-    CLI::App* const screen = app.add_subcommand(
-        "screen", "Show which files can be converted, converting none: quillon screen PATH…");
-    AddPaths(*screen, line);
-    screen->final_callback([&line] { line.command = Command::Screen; });
-    AddConvert(app, line);
-    AddSettings(app, line);
-    app.add_subcommand("worker")->group("")->final_callback(
-        [&line] { line.command = Command::Worker; }); // see WorkerPool
+void AddCommands(CLI::App& app, Command& chosen) {
+    for (AddCommand* const add : AllCommands)
+        add(app, chosen);
     app.require_subcommand(1);
-    for (CLI::App* const command : app.get_subcommands({}))
+    for (CLI::App* const command : app.get_subcommands({})) {
         command->fallthrough();
-}
-
-void AddCommonOptions(CLI::App& app, CommandLine& line) {
-    const CLI::Range seconds(1U, LongestSeconds);
-    app.add_option("--lang", line.language, "The language of texts and windows: de, fr, es, ja, en")
-        ->type_name("LANG");
-    app.add_flag("--json", line.json, "Write JSON Lines to stdout, lines for people to stderr");
-    app.add_flag("-v,--verbose", line.verbose, "Show the whole log on stderr, not only warnings");
-    app.add_option("--log", line.logFile, "Append the whole log to a file")->type_name("FILE");
-    app.add_option("--engine-stall", line.stallSeconds,
-                   "How long an engine may show no sign of life, 60 if not given, and the file\n"
-                   "that it prints not grow, 120 if not given")
-        ->type_name("SECONDS")
-        ->check(seconds);
-    app.add_option("--engine-limit", line.limitSeconds,
-                   "How long an engine may take for a document, 600 if not given, and the file\n"
-                   "that it prints to be whole, 1800 if not given")
-        ->type_name("SECONDS")
-        ->check(seconds);
-    app.add_option("--memory-limit", line.memoryMegabytes,
-                   "How much memory engines may take for a document, all of its processes\n"
-                   "together, 3584 if not given")
-        ->type_name("MB")
-        ->check(CLI::Range(256U, MostMegabytes));
-    app.add_flag("--require-isolation", line.requireIsolation,
-                 "Open no document unless it is kept from the rest of the machine; see status");
-    app.add_option("--engine-documents", line.engineDocuments,
-                   "For how many documents of a run an engine is kept once it is started; 1 to\n"
-                   "start it for each; 500 if not given, or 1 where that is faster")
-        ->type_name("N")
-        ->check(CLI::Range(1U, MostEngineDocuments));
-    app.add_option("--filters", line.filtersFolder,
-                   "The folder of filters, if not Filters beside the program")
-        ->type_name("DIR");
-    app.add_option("--stand-ins", line.standInsFolder,
-                   "The folder of Office stand-ins, if not StandIns beside the program")
-        ->type_name("DIR");
+        command->set_help_flag(); // the program's is one for all
+    }
 }
 
 bool TakesValue(const CLI::App& app, const std::string& name) {
@@ -220,10 +127,8 @@ std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& argum
     app.set_help_flag("-h,--help", "Print this help");
     app.set_version_flag("--version", "quillon " QUILLON_VERSION, "Print the version");
     app.footer(Notes + SettingsTable() + ExitCodes);
-    AddCommonOptions(app, line);
-    AddCommands(app, line);
-    for (CLI::App* const command : app.get_subcommands({}))
-        command->set_help_flag();
+    AddCommonOptions(app, line.options);
+    AddCommands(app, line.command);
     try {
         if (arguments.empty())
             throw CLI::RequiredError("A command");

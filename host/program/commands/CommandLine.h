@@ -1,36 +1,15 @@
 #pragma once
 
+#include "host/program/commands/Command.h"
+
 #include <optional>
 #include <string>
 #include <vector>
 
-enum class Command { Status, Screen, Convert, Settings, Worker };
-
-/// What the command line asks for. Texts and paths are as they were given.
+/// What the command line asks for.
 struct CommandLine {
-    Command command = Command::Status;
-    std::vector<std::string> paths; ///< of screen and convert
-
-    std::string out;
-    std::optional<std::string> printer;
-    std::optional<std::string> settingsFile; ///< of convert and settings
-    std::vector<std::string> settings;       ///< KEY=VALUE
-
-    std::optional<bool> pdf; ///< true for PDF, false for PostScript only
-    std::optional<std::string> profile;
-    std::optional<unsigned> jobs; ///< documents at a time; as many as pay when it is not given
-
-    std::optional<std::string> language;
-    bool json = false;
-    bool verbose = false;
-    std::optional<std::string> logFile;
-    std::optional<unsigned> stallSeconds;
-    std::optional<unsigned> limitSeconds;
-    unsigned memoryMegabytes = 3584; ///< for a document
-    bool requireIsolation = false;
-    std::optional<unsigned> engineDocuments; ///< until an engine is started anew
-    std::optional<std::string> filtersFolder;
-    std::optional<std::string> standInsFolder;
+    CommonOptions options;
+    Command command;
 };
 
 /// Reads the command line; answers a question for help, or a mistake, itself.

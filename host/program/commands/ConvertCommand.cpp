@@ -1,5 +1,5 @@
-#include "host/program/PathText.h"
-#include "host/program/commands/Commands.h"
+#include "host/program/base/PathText.h"
+#include "host/program/commands/Command.h"
 #include "host/program/documents/Conversion.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
@@ -13,9 +13,19 @@
 
 #include <wx/intl.h>
 
+#include <CLI/CLI.hpp>
+
 namespace {
 
+constexpr unsigned MostJobs = 64;
 constexpr unsigned WorkerPatience = 60; // seconds
+
+struct ConvertOptions {
+    std::vector<std::string> paths;
+    std::string out;
+    SettingsOptions settings;
+    std::optional<unsigned> jobs; ///< documents at a time; as many as pay when it is not given
+};
 
 /// The base name of each input's output, in the inputs' order; empty for those that are no text,
 /// or no filter's business. Given out beforehand, so that they do not depend on which documents
@@ -80,32 +90,17 @@ void ConvertInTurn(const Run& run, Reporter& reporter, OrderedReport& report) {
 }
 
 /// The arguments that make this program a worker of the run.
-std::vector<std::string> WorkerArguments(const CommandLine& line) {
-    std::vector<std::string> arguments = {"worker"};
-    const auto pass = [&arguments](const char* option, const std::optional<std::string>& value) {
-        if (value)
-            arguments.insert(arguments.end(), {option, *value});
-    };
-    const auto text = [](const std::optional<unsigned>& number) {
-        return number ? std::optional(std::to_string(*number)) : std::nullopt;
-    };
-    pass("--filters", line.filtersFolder);
-    pass("--stand-ins", line.standInsFolder);
-    pass("--engine-stall", text(line.stallSeconds));
-    pass("--engine-limit", text(line.limitSeconds));
-    pass("--memory-limit", std::to_string(line.memoryMegabytes));
-    pass("--log", line.logFile);
-    pass("--lang", line.language);
-    if (line.verbose)
-        arguments.emplace_back("--verbose");
+std::vector<std::string> WorkerArguments(const CommonOptions& options) {
+    std::vector<std::string> arguments = OptionsForWorkers(options);
+    arguments.insert(arguments.begin(), "worker");
     return arguments;
 }
 
-unsigned EngineDocuments(const CommandLine& line, std::size_t documents, std::size_t workers) {
-    return line.engineDocuments.value_or(WorthwhileEngineDocuments(documents, workers));
+unsigned EngineDocuments(const CommonOptions& options, std::size_t documents, std::size_t workers) {
+    return options.engineDocuments.value_or(WorthwhileEngineDocuments(documents, workers));
 }
 
-void ConvertSideBySide(const Run& run, std::size_t workers, const CommandLine& line,
+void ConvertSideBySide(const Run& run, std::size_t workers, const CommonOptions& options,
                        const Settings& settings, Reporter& reporter, OrderedReport& report) {
     std::vector<Assignment> assignments;
     std::vector<std::size_t> numbers; // of the assignments' inputs
@@ -117,35 +112,33 @@ void ConvertSideBySide(const Run& run, std::size_t workers, const CommandLine& l
         assignments.push_back({run.inputs[i], run.names[i]});
         numbers.push_back(i);
     }
-    WorkerPool pool(WorkerArguments(line),
-                    std::chrono::seconds(line.stallSeconds.value_or(WorkerPatience)),
+    WorkerPool pool(WorkerArguments(options),
+                    std::chrono::seconds(options.stallSeconds.value_or(WorkerPatience)),
                     {settings.Xml(), run.outputFolder.Path(),
-                     EngineDocuments(line, assignments.size(), workers)},
+                     EngineDocuments(options, assignments.size(), workers)},
                     run.filters, reporter);
     pool.Run(assignments, workers, [&](std::size_t assignment, Outcome outcome) {
         report.Add(numbers[assignment], std::move(outcome));
     });
 }
 
-} // namespace
-
-ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filtersFolder,
+ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
                     Reporter& reporter) {
     Obstacle obstacle;
-    const std::optional<Settings> settings = MakeRunSettings(line, obstacle);
+    const std::optional<Settings> settings = MakeRunSettings(convert.settings, obstacle);
     if (!settings) {
         reporter.Error(obstacle.text);
         return obstacle.exitCode;
     }
-    FilterSet filters(filtersFolder);
-    const std::vector<Input> inputs = ListInputs(line.paths);
+    FilterSet filters(options.FiltersFolder());
+    const std::vector<Input> inputs = ListInputs(convert.paths);
     if (const auto end = EndIdleRun(filters, inputs, reporter))
         return *end;
     wxString fault;
-    std::optional<OutputFolder> outputFolder = OutputFolder::Open(FromArgument(line.out), fault);
+    std::optional<OutputFolder> outputFolder = OutputFolder::Open(FromArgument(convert.out), fault);
     if (!outputFolder) {
         reporter.Error(wxString::Format(_("the output folder %s cannot be used: %s"),
-                                        Shown(FromArgument(line.out)), fault));
+                                        Shown(FromArgument(convert.out)), fault));
         return ExitCode::WrongUsage;
     }
     Workplace::RemoveAbandoned(outputFolder->Path());
@@ -153,13 +146,56 @@ ExitCode RunConvert(const CommandLine& line, const std::filesystem::path& filter
     const Run run = {inputs, names, filters, *outputFolder};
     OrderedReport report(inputs.size(), reporter);
     const std::vector<Input> convertible = Convertible(run);
-    const std::size_t workers = line.jobs ? *line.jobs : WorthwhileWorkers(convertible);
+    const std::size_t workers = convert.jobs ? *convert.jobs : WorthwhileWorkers(convertible);
     if (workers > 1) {
-        ConvertSideBySide(run, workers, line, *settings, reporter, report);
+        ConvertSideBySide(run, workers, options, *settings, reporter, report);
     } else {
-        KeepEngine(EngineDocuments(line, convertible.size(), workers));
+        KeepEngine(EngineDocuments(options, convertible.size(), workers));
         filters.ApplySettings(settings->Node());
         ConvertInTurn(run, reporter, report);
     }
     return report.Finish();
+}
+
+void AddSettingsOptions(CLI::App& convert, SettingsOptions& options) {
+    convert.add_option("--printer", options.printer, "The printer to print on")->type_name("NAME");
+    convert.add_option("--settings", options.file, "A file with settings")->type_name("FILE.xml");
+    CLI::Option* const ps = convert.add_flag_callback(
+        "--ps", [&options] { options.pdf = false; }, "Make PostScript files only");
+    convert
+        .add_flag_callback(
+            "--pdf", [&options] { options.pdf = true; }, "Make PDF files too")
+        ->excludes(ps);
+    convert.add_option("--profile", options.profile, "The Distiller profile of the PDF files")
+        ->type_name("NAME")
+        ->excludes(ps);
+}
+
+} // namespace
+
+void AddConvert(CLI::App& program, Command& chosen) {
+    CLI::App* const convert =
+        program.add_subcommand("convert", "Convert documents: quillon convert PATH… --out DIR");
+    const auto given = std::make_shared<ConvertOptions>();
+    AddPaths(*convert, given->paths);
+    convert->add_option("-o,--out", given->out, "The folder for the output")
+        ->required()
+        ->type_name("DIR");
+    AddSettingsOptions(*convert, given->settings);
+    convert
+        ->add_option("-j,--jobs", given->jobs,
+                     "How many documents to convert at a time; by default as many as pay")
+        ->type_name("N")
+        ->check(CLI::Range(1U, MostJobs));
+    convert
+        ->add_option("--set", given->settings.assignments,
+                     "One setting; may be given several times")
+        ->type_name("KEY=VALUE")
+        ->allow_extra_args(false);
+    convert->final_callback([&chosen, given] {
+        chosen.opensDocuments = true;
+        chosen.run = [given](const CommonOptions& options, Reporter& reporter) {
+            return RunConvert(*given, options, reporter);
+        };
+    });
 }

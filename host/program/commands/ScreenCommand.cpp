@@ -1,4 +1,4 @@
-#include "host/program/commands/Commands.h"
+#include "host/program/commands/Command.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/machine/MachineSetup.h"
 #include "host/program/report/OutcomeReport.h"
@@ -6,13 +6,18 @@
 #include "host/program/system/Interruption.h"
 #include "host/program/workers/WorkerCount.h"
 
-ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filtersFolder,
-                   Reporter& reporter) {
-    FilterSet filters(filtersFolder);
-    const std::vector<Input> inputs = ListInputs(line.paths);
+#include <CLI/CLI.hpp>
+
+namespace {
+
+using Paths = std::vector<std::string>;
+
+ExitCode Run(const Paths& paths, const CommonOptions& options, Reporter& reporter) {
+    FilterSet filters(options.FiltersFolder());
+    const std::vector<Input> inputs = ListInputs(paths);
     if (const auto end = EndIdleRun(filters, inputs, reporter))
         return *end;
-    KeepEngine(line.engineDocuments.value_or(WorthwhileEngineDocuments(inputs.size(), 1)));
+    KeepEngine(options.engineDocuments.value_or(WorthwhileEngineDocuments(inputs.size(), 1)));
     filters.ApplySettings(Settings().Node());
     std::vector<Outcome> outcomes;
     for (const Input& input : inputs) {
@@ -21,4 +26,19 @@ ExitCode RunScreen(const CommandLine& line, const std::filesystem::path& filters
         Tell(outcomes.back(), reporter);
     }
     return TellSummary(outcomes, reporter);
+}
+
+} // namespace
+
+void AddScreen(CLI::App& program, Command& chosen) {
+    CLI::App* const screen = program.add_subcommand(
+        "screen", "Show which files can be converted, converting none: quillon screen PATH…");
+    const auto paths = std::make_shared<Paths>();
+    AddPaths(*screen, *paths);
+    screen->final_callback([&chosen, paths] {
+        chosen.opensDocuments = true;
+        chosen.run = [paths](const CommonOptions& options, Reporter& reporter) {
+            return Run(*paths, options, reporter);
+        };
+    });
 }

@@ -1,14 +1,16 @@
-#include "host/program/PathText.h"
-#include "host/program/commands/Commands.h"
+#include "host/program/base/PathText.h"
+#include "host/program/commands/Command.h"
 #include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/SettingsDialogue.h"
 
 #include <wx/intl.h>
 
-ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filtersFolder,
-                     Reporter& reporter) {
-    const std::filesystem::path file = FromArgument(*line.settingsFile);
+#include <CLI/CLI.hpp>
+
+namespace {
+
+ExitCode Run(const std::filesystem::path& file, const CommonOptions& options, Reporter& reporter) {
     wxString fault;
     std::optional<Settings> settings = Settings::LoadForEditing(file, fault);
     if (!settings || !ToText(file)) {
@@ -18,7 +20,7 @@ ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filte
     }
     FillIn(*settings);
     TranslateChoices(*settings);
-    const FilterSet filters(filtersFolder);
+    const FilterSet filters(options.FiltersFolder());
     SettingsDialogue dialogue(filters, *settings, file);
     if (!dialogue.HasPanel()) {
         reporter.Error(_("no filter has settings to show; `quillon status` lists the filters"));
@@ -28,4 +30,22 @@ ExitCode RunSettings(const CommandLine& line, const std::filesystem::path& filte
     reporter.Line(saved ? wxString::Format(_("The settings are saved in %s."), Shown(file))
                         : _("The settings are left as they were."));
     return ExitCode::Done;
+}
+
+} // namespace
+
+void AddSettings(CLI::App& program, Command& chosen) {
+    CLI::App* const settings = program.add_subcommand(
+        "settings", "Show the filters' settings in a window and change them:\n"
+                    "quillon settings --settings FILE.xml");
+    const auto file = std::make_shared<std::string>();
+    settings->add_option("--settings", *file, "The file; if there is none, it is made")
+        ->required()
+        ->type_name("FILE.xml");
+    settings->final_callback([&chosen, file] {
+        chosen.showsWindows = true;
+        chosen.run = [file](const CommonOptions& options, Reporter& reporter) {
+            return Run(FromArgument(*file), options, reporter);
+        };
+    });
 }

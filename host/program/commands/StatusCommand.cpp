@@ -1,5 +1,5 @@
-#include "host/program/PathText.h"
-#include "host/program/commands/Commands.h"
+#include "host/program/base/PathText.h"
+#include "host/program/commands/Command.h"
 #include "host/program/filters/FilterSet.h"
 #include "host/program/machine/Engines.h"
 #include "host/program/machine/FilePrinter.h"
@@ -10,6 +10,8 @@
 #include "plugin/ResultCodes.h"
 
 #include <wx/intl.h>
+
+#include <CLI/CLI.hpp>
 
 namespace {
 
@@ -107,17 +109,17 @@ void TellApplications(Reporter& reporter) {
 }
 
 /// @return why the engine is started anew for each document; nothing when that is not known
-std::optional<wxString> WhyNotKept(const CommandLine& line) {
-    return line.engineDocuments == 1U ? wxString("--engine-documents says so")
-                                      : OfficeEngineKeepingObstacle();
+std::optional<wxString> WhyNotKept(const CommonOptions& options) {
+    return options.engineDocuments == 1U ? wxString("--engine-documents says so")
+                                         : OfficeEngineKeepingObstacle();
 }
 
-void TellEngine(const CommandLine& line, Reporter& reporter) {
+void TellEngine(const CommonOptions& options, Reporter& reporter) {
     const wxString engine = OfficeEngine();
     reporter.Line(_("Engine"));
     reporter.Line(OrNone(engine));
     Json record = {{"type", "engine"}, {"version", JsonText(engine)}};
-    if (const std::optional<wxString> obstacle = WhyNotKept(line)) {
+    if (const std::optional<wxString> obstacle = WhyNotKept(options)) {
         reporter.Line("  " + (obstacle->empty()
                                   ? wxString("kept started for the documents of a run")
                                   : "started anew for each document: " + OneLine(*obstacle)));
@@ -244,17 +246,25 @@ ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter
     return exitCode;
 }
 
-} // namespace
-
-ExitCode RunStatus(const CommandLine& line, const std::filesystem::path& filtersFolder,
-                   Reporter& reporter) {
-    const FilterSet filters(filtersFolder);
-    TellFilters(filters, filtersFolder, reporter);
+ExitCode Run(const CommonOptions& options, Reporter& reporter) {
+    const std::filesystem::path folder = options.FiltersFolder();
+    const FilterSet filters(folder);
+    TellFilters(filters, folder, reporter);
     TellApplications(reporter);
-    TellEngine(line, reporter);
+    TellEngine(options, reporter);
     TellPrinters(reporter);
     TellDistiller(reporter);
-    TellIsolation(line.memoryMegabytes, reporter);
+    TellIsolation(options.memoryMegabytes, reporter);
     TellPanel(filters, reporter);
-    return TellReadiness(filters, line.requireIsolation, reporter);
+    return TellReadiness(filters, options.requireIsolation, reporter);
+}
+
+} // namespace
+
+void AddStatus(CLI::App& program, Command& chosen) {
+    program.add_subcommand("status", "Show what there is to convert with, and what is missing")
+        ->final_callback([&chosen] {
+            chosen.examinesEngine = true;
+            chosen.run = Run;
+        });
 }

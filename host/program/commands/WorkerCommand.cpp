@@ -1,10 +1,11 @@
-#include "host/program/commands/Commands.h"
+#include "host/program/commands/Command.h"
 #include "host/program/documents/Conversion.h"
 #include "host/program/machine/MachineSetup.h"
 #include "host/program/settings/Settings.h"
 #include "host/program/system/ChildProcess.h"
 #include "host/program/workers/Messages.h"
 
+#include <CLI/CLI.hpp>
 #include <condition_variable>
 #include <deque>
 #include <mutex>
@@ -124,10 +125,17 @@ ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& fil
     return ExitCode::Done;
 }
 
-} // namespace
-
-ExitCode RunWorker(const std::filesystem::path& filtersFolder) {
+ExitCode RunWorker(const CommonOptions& options, Reporter& /*reporter*/) {
     Run run;
     const std::optional<RunFacts> facts = run.Next(DecodeRunFacts);
-    return facts ? Serve(run, *facts, filtersFolder) : ExitCode::Done;
+    return facts ? Serve(run, *facts, options.FiltersFolder()) : ExitCode::Done;
+}
+
+} // namespace
+
+void AddWorker(CLI::App& program, Command& chosen) {
+    program.add_subcommand("worker")->group("")->final_callback([&chosen] {
+        chosen.isWorker = true;
+        chosen.run = RunWorker;
+    });
 }

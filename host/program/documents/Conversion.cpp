@@ -1,6 +1,6 @@
 #include "host/program/documents/Conversion.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/documents/FilterCall.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"

@@ -1,8 +1,8 @@
 #include "host/program/documents/FilterCall.h"
 
 #include "common/WQServices.h"
+#include "host/program/base/Reasons.h"
 #include "host/program/machine/FontStandIns.h"
-#include "host/program/report/Reasons.h"
 #include "plugin/ResultCodes.h"
 
 #include <wx/intl.h>

@@ -1,6 +1,6 @@
 #include "host/program/documents/InputCheck.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/documents/Outcome.h"
 #include "plugin/ResultCodes.h"
 

@@ -1,6 +1,6 @@
 #include "host/program/documents/Inputs.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 #include <wx/filename.h>
 

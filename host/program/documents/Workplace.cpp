@@ -1,6 +1,6 @@
 #include "host/program/documents/Workplace.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/system/DurableMove.h"
 
 #include <windows.h>

@@ -1,7 +1,7 @@
 #include "host/program/filters/FilterModule.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 namespace {
 

@@ -1,6 +1,6 @@
 #include "host/program/filters/FilterSet.h"
 
-#include "host/program/machine/ProgramFiles.h"
+#include "host/program/base/ProgramFiles.h"
 
 FilterSet::FilterSet(const std::filesystem::path& folder) {
     for (const std::filesystem::path& file : ModuleFiles(folder)) {

@@ -1,7 +1,7 @@
 #include "host/program/system/ChildProcess.h"
 
-#include "host/program/PathText.h"
-#include "host/program/machine/ProgramFiles.h"
+#include "host/program/base/PathText.h"
+#include "host/program/base/ProgramFiles.h"
 
 #include <fcntl.h>
 #include <spawn.h>

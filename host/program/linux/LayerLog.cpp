@@ -1,5 +1,5 @@
 #include "common/WQServices.h"
-#include "host/program/report/LogRoutes.h"
+#include "host/program/system/LogRoutes.h"
 #include "platform/win32/log/LogSink.h"
 
 void RouteLayerLog() {

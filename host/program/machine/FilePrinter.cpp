@@ -1,7 +1,7 @@
 #include "host/program/machine/FilePrinter.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 #include <windows.h>
 #include <winspool.h>

@@ -1,9 +1,9 @@
 #include "host/program/machine/MachineSetup.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
+#include "host/program/base/ProgramFiles.h"
 #include "host/program/machine/FilePrinter.h"
-#include "host/program/machine/ProgramFiles.h"
 #include "host/program/machine/StandInKeys.h"
 #include "machine/Distiller.h"
 #include "machine/FiltersFolder.h"

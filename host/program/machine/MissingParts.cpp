@@ -1,9 +1,9 @@
 #include "host/program/machine/MissingParts.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
+#include "host/program/base/Reasons.h"
 #include "host/program/machine/Engines.h"
 #include "host/program/machine/FilePrinter.h"
-#include "host/program/report/Reasons.h"
 #include "host/program/system/InstallAdvice.h"
 #include "machine/FiltersFolder.h"
 #include "machine/InstalledOffice.h"

@@ -1,7 +1,7 @@
 #include "host/program/report/OutcomeReport.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/services/OneLine.h"
 
 #include <wx/intl.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/ExitCode.h"
+#include "host/program/base/ExitCode.h"
 #include "host/program/documents/Inputs.h"
 #include "host/program/documents/Outcome.h"
 #include "host/program/filters/FilterSet.h"

@@ -1,7 +1,7 @@
 #include "host/program/settings/RunSettings.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/machine/FilePrinter.h"
 #include "machine/Distiller.h"
 
@@ -81,17 +81,17 @@ bool CheckProfile(const Settings& settings, Obstacle& obstacle) {
     return false;
 }
 
-void ApplyOptions(const CommandLine& line, Settings& settings) {
+void ApplyOptions(const SettingsOptions& options, Settings& settings) {
     const auto text = [](const std::string& argument) {
         return Shown(FromArgument(argument)); // what is no text is no name either
     };
-    if (line.printer)
-        settings.Set("PRINTER", text(*line.printer));
-    if (line.profile)
-        settings.Set("SELECTEDDISTILLERPROFILE", text(*line.profile));
-    if (line.pdf) {
-        settings.Set("OUTPUTFILETYPEPS", *line.pdf ? "0" : "1");
-        settings.Set("OUTPUTFILETYPEPDF", *line.pdf ? "1" : "0");
+    if (options.printer)
+        settings.Set("PRINTER", text(*options.printer));
+    if (options.profile)
+        settings.Set("SELECTEDDISTILLERPROFILE", text(*options.profile));
+    if (options.pdf) {
+        settings.Set("OUTPUTFILETYPEPS", *options.pdf ? "0" : "1");
+        settings.Set("OUTPUTFILETYPEPDF", *options.pdf ? "1" : "0");
     }
 }
 
@@ -142,23 +142,22 @@ wxString UnusableSettings(const std::filesystem::path& file, const wxString& fau
     return wxString::Format(_("the settings file %s cannot be used: %s"), Shown(file), fault);
 }
 
-std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle) {
+std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Obstacle& obstacle) {
     std::optional<Settings> settings = Settings();
-    if (line.settingsFile) {
+    if (options.file) {
         wxString fault;
-        settings = Settings::Load(FromArgument(*line.settingsFile), fault);
+        settings = Settings::Load(FromArgument(*options.file), fault);
         if (!settings)
-            obstacle = {ExitCode::WrongUsage,
-                        UnusableSettings(FromArgument(*line.settingsFile), fault)};
+            obstacle = {ExitCode::WrongUsage, UnusableSettings(FromArgument(*options.file), fault)};
     }
     if (!settings)
         return std::nullopt;
-    for (const std::string& assignment : line.settings)
+    for (const std::string& assignment : options.assignments)
         if (!Apply(assignment, *settings, obstacle))
             return std::nullopt;
-    ApplyOptions(line, *settings);
+    ApplyOptions(options, *settings);
     FillIn(*settings);
-    const bool takesProfile = line.profile || settings->Value("OUTPUTFILETYPEPS") != "1";
+    const bool takesProfile = options.profile || settings->Value("OUTPUTFILETYPEPS") != "1";
     if (!CheckPrinter(*settings, obstacle) || (takesProfile && !CheckProfile(*settings, obstacle)))
         return std::nullopt;
     return settings;

@@ -1,12 +1,12 @@
 #pragma once
 
-#include "host/program/ExitCode.h"
-#include "host/program/commands/CommandLine.h"
+#include "host/program/base/ExitCode.h"
 #include "host/program/settings/Settings.h"
 
 #include <wx/string.h>
 
 #include <optional>
+#include <string>
 #include <vector>
 
 /// A setting that filters know.
@@ -33,7 +33,16 @@ void FillIn(Settings& settings);
 /// What is said of a settings file that cannot be used.
 wxString UnusableSettings(const std::filesystem::path& file, const wxString& fault);
 
+/// What a command line says of the settings. Texts and paths are as they were given.
+struct SettingsOptions {
+    std::optional<std::string> file;
+    std::vector<std::string> assignments; ///< KEY=VALUE
+    std::optional<std::string> printer;
+    std::optional<bool> pdf; ///< true for PDF, false for PostScript only
+    std::optional<std::string> profile;
+};
+
 /// Puts together the settings of a run: the file's, the command line's in their place, and what
 /// FillIn adds.
 /// @param obstacle receives why there is no result
-std::optional<Settings> MakeRunSettings(const CommandLine& line, Obstacle& obstacle);
+std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Obstacle& obstacle);

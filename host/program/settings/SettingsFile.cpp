@@ -1,6 +1,6 @@
 #include "host/program/settings/SettingsFile.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/settings/Settings.h"
 
 #include <wx/file.h>

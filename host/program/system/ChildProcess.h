@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/workers/LineChannel.h"
+#include "host/program/system/LineChannel.h"
 
 #include <wx/string.h>
 

@@ -1,7 +1,7 @@
 #include "host/program/window/SettingsDialogue.h"
 
 #include "common/Themer.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 #include "host/program/settings/ChoiceTexts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"

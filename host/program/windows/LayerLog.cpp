@@ -1,3 +1,3 @@
-#include "host/program/report/LogRoutes.h"
+#include "host/program/system/LogRoutes.h"
 
 void RouteLayerLog() {} // the system keeps its log elsewhere

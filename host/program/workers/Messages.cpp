@@ -1,6 +1,6 @@
 #include "host/program/workers/Messages.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 #include <limits>
 #include <nlohmann/json.hpp>

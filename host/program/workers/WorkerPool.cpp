@@ -1,10 +1,10 @@
 #include "host/program/workers/WorkerPool.h"
 
 #include "common/WQServices.h"
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
+#include "host/program/base/Reasons.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
-#include "host/program/report/Reasons.h"
 #include "host/program/system/Interruption.h"
 #include "plugin/ResultCodes.h"
 

@@ -1,4 +1,4 @@
-#include "host/program/report/Reasons.h"
+#include "host/program/base/Reasons.h"
 
 #include <wx/intl.h>
 

@@ -1,4 +1,4 @@
-#include "host/program/report/LogRoutes.h"
+#include "host/program/system/LogRoutes.h"
 
 #include "common/WQServices.h"
 

@@ -1,4 +1,4 @@
-#include "host/program/workers/LineChannel.h"
+#include "host/program/system/LineChannel.h"
 
 std::optional<std::string> LineChannel::Read() const {
     std::string line;

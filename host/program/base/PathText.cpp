@@ -1,4 +1,4 @@
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 #include "host/services/OneLine.h"
 

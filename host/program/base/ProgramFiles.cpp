@@ -1,6 +1,6 @@
-#include "host/program/machine/ProgramFiles.h"
+#include "host/program/base/ProgramFiles.h"
 
-#include "host/program/PathText.h"
+#include "host/program/base/PathText.h"
 
 #include <wx/stdpaths.h>
 

@@ -1,0 +1,39 @@
+#pragma once
+
+#include "host/program/base/ExitCode.h"
+#include "host/program/commands/CommonOptions.h"
+#include "host/program/report/Reporter.h"
+
+#include <functional>
+
+/// The command that a command line asks for.
+struct Command {
+    /// Runs it, when the machine is set up.
+    /// @return the code to end with
+    std::function<ExitCode(const CommonOptions&, Reporter&)> run;
+
+    bool opensDocuments = false; ///< and none without isolation where that is required
+    bool showsWindows = false;
+    bool examinesEngine = false; ///< says how the engine can be run
+    bool isWorker = false;       ///< another process of this program decides when it ends
+};
+
+/// Adds a command with its options to the program's.
+/// @param chosen receives the command when it is asked for
+using AddCommand = void(CLI::App& program, Command& chosen);
+
+// Each has a file of its own, with its options and its run.
+
+/// `quillon status`: says what there is to convert with, and what is missing.
+AddCommand AddStatus;
+/// `quillon screen`: says of each file whether it can be converted.
+AddCommand AddScreen;
+/// `quillon convert`: converts documents into a folder.
+AddCommand AddConvert;
+/// `quillon settings`: shows the filters' settings panels in a window, and stores what is chosen.
+AddCommand AddSettings;
+/// `quillon worker`: converts what another process of this program asks for; see WorkerPool.
+AddCommand AddWorker;
+
+/// All of them, in the order of the help.
+constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen, AddConvert, AddSettings, AddWorker};
