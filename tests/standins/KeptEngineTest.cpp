@@ -51,6 +51,19 @@ protected:
         return found.empty() ? 0 : found.front();
     }
 
+    /// A LibreOffice that has the fault which its file "fault" names.
+    fs::path FaultyProgram(const fs::path& real) const {
+        fs::path program = m_files / "program";
+        fs::create_directory(program);
+        for (const fs::directory_entry& entry : fs::directory_iterator(real))
+            if (entry.path().filename() != "libmergedlo.so" && entry.path().filename() != "soffice")
+                fs::create_symlink(entry, program / entry.path().filename());
+        fs::copy_file(FAULTY_LIBREOFFICE, program / "libmergedlo.so");
+        fs::copy_file(real / "soffice", program / "soffice"); // by which it is found
+        fs::create_symlink(real / "libmergedlo.so", program / "real");
+        return program;
+    }
+
     /// What the document prints as, but for the date. Without the wait of PowerPoint's driver.
     std::string Printed(const fs::path& document) {
         const bool isPresentation = document.extension().string().rfind(".pp", 0) == 0;
@@ -99,6 +112,24 @@ TEST_F(KeptEngineTest, ItIsStartedAnewAfterSoManyDocuments) {
     EXPECT_NE(hosts.front(), hosts.back());
 }
 
+TEST_F(KeptEngineTest, ItIsStartedAnewWhenItHasGrown) {
+    const fs::path real = MachineText(Settings, "EnginePath");
+    const fs::path program = FaultyProgram(real);
+    // What the real one has is found by this name too.
+    fs::create_symlink(real / "libmergedlo.so", program / "libcomphelper.so");
+    RegisterWithPath(program);
+    for (const bool isRenewed : {false, true}) {
+        m_files.Write("program/fault", isRenewed ? "grows" : "none");
+        Open(NewLetter()); // of which it makes nothing, as most of its parts lie elsewhere
+        const pid_t before = AwaitProcess("office-host");
+        Open(NewLetter());
+        Await([&] { return isRenewed == (AwaitProcess("office-host") != before); });
+        EXPECT_EQ(isRenewed, AwaitProcess("office-host") != before);
+        Call("DllUnregisterServer");
+        RegisterWithPath(program);
+    }
+}
+
 TEST_F(KeptEngineTest, AProcessMayBeKilledOrStoppedWhileADocumentIsUnderWay) {
     SetLimit("StallSeconds", 2);
     struct Case {
@@ -142,14 +173,7 @@ TEST_F(KeptEngineTest, NothingOutlivesAClientThatIsKilled) {
 
 TEST_F(KeptEngineTest, WhereItCannotBeKeptItIsStartedForEachDocumentAndTheReasonIsTold) {
     const fs::path real = MachineText(Settings, "EnginePath");
-    const fs::path program = m_files / "program";
-    fs::create_directory(program);
-    for (const fs::directory_entry& entry : fs::directory_iterator(real))
-        if (entry.path().filename() != "libmergedlo.so" && entry.path().filename() != "soffice")
-            fs::create_symlink(entry, program / entry.path().filename());
-    fs::copy_file(FAULTY_LIBREOFFICE, program / "libmergedlo.so");
-    fs::copy_file(real / "soffice", program / "soffice"); // by which it is found
-    fs::create_symlink(real / "libmergedlo.so", program / "real");
+    const fs::path program = FaultyProgram(real);
     SetLimit("StallSeconds", 2);
     SetLimit("Examine", 1);
     const std::pair<const char*, const char*> faults[] = {
