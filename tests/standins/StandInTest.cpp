@@ -1,7 +1,7 @@
 #include "tests/standins/StandInTest.h"
 
 #include "common/LoadedModule.h"
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "tests/standins/Processes.h"
 
 #include <windows.h>

@@ -1,6 +1,6 @@
 #include "common/WQServices.h"
 #include "host/program/system/LogRoutes.h"
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 
 void RouteLayerLog() {
     win32::SetLogSink([](const std::string& record) {

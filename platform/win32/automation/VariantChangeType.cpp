@@ -1,5 +1,5 @@
 #include "platform/win32/automation/VariantTypes.h"
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/text/CaseFold.h"
 
 #include <charconv>

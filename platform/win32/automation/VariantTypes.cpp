@@ -1,6 +1,6 @@
 #include "platform/win32/automation/VariantTypes.h"
 
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 
 namespace win32 {
 

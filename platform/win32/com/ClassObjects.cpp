@@ -1,7 +1,7 @@
 #include "platform/win32/com/ClassObjects.h"
 
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/com/Apartment.h"
-#include "platform/win32/log/LogSink.h"
 
 #include <algorithm>
 #include <map>

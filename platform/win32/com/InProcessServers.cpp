@@ -1,7 +1,7 @@
 #include "platform/win32/com/InProcessServers.h"
 
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/com/ClassRegistry.h"
-#include "platform/win32/log/LogSink.h"
 #include "platform/win32/text/Utf8.h"
 
 #include <windows.h>

@@ -1,4 +1,4 @@
-#include "platform/win32/errors/ErrorCodes.h"
+#include "platform/win32/base/Errors.h"
 #include "platform/win32/files/OpenFile.h"
 
 #include <sys/stat.h>

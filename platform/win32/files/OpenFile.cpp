@@ -1,6 +1,6 @@
 #include "platform/win32/files/OpenFile.h"
 
-#include "platform/win32/errors/ErrorCodes.h"
+#include "platform/win32/base/Errors.h"
 #include "platform/win32/text/Utf8.h"
 
 #include <fcntl.h>

@@ -1,5 +1,5 @@
-#include "platform/win32/errors/ErrorCodes.h"
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/Errors.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/modules/ModuleTable.h"
 #include "platform/win32/text/Utf8.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/win32/handles/HandleTable.h"
+#include "platform/win32/base/HandleTable.h"
 
 #include <windows.h>
 

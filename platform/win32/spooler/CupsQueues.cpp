@@ -1,6 +1,6 @@
 #include "platform/win32/spooler/CupsQueues.h"
 
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/text/Utf8.h"
 
 #include <cups/cups.h>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "platform/win32/errors/ErrorCodes.h"
+#include "platform/win32/base/Errors.h"
 
 #include <algorithm>
 #include <cwchar>

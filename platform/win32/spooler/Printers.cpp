@@ -1,4 +1,4 @@
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/spooler/PackRecords.h"
 #include "platform/win32/spooler/Spooler.h"
 #include "platform/win32/text/CaseFold.h"

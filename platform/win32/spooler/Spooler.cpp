@@ -1,6 +1,6 @@
 #include "platform/win32/spooler/Spooler.h"
 
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/spooler/CupsQueues.h"
 #include "platform/win32/text/CaseFold.h"
 

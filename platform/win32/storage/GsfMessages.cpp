@@ -1,6 +1,6 @@
 #include "platform/win32/storage/GsfMessages.h"
 
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 
 #include <glib.h>
 

@@ -1,5 +1,5 @@
 #include "platform/com/ComObject.h"
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 #include "platform/win32/storage/Document.h"
 #include "platform/win32/text/Utf8.h"
 

@@ -1,6 +1,12 @@
-#include "platform/win32/errors/ErrorCodes.h"
+#include "platform/win32/base/Errors.h"
 
 #include <cerrno>
+
+namespace {
+
+thread_local DWORD t_lastError = ERROR_SUCCESS;
+
+} // namespace
 
 namespace win32 {
 
@@ -43,3 +49,11 @@ DWORD ErrorFromErrno(int number) {
 }
 
 } // namespace win32
+
+DWORD WINAPI GetLastError() {
+    return t_lastError;
+}
+
+void WINAPI SetLastError(DWORD error) {
+    t_lastError = error;
+}

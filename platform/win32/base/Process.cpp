@@ -2,8 +2,10 @@
 
 #include <windows.h>
 
+#include <chrono>
 #include <fstream>
 #include <string>
+#include <thread>
 
 namespace {
 
@@ -38,4 +40,8 @@ std::wstring ReadCommandLine() {
 LPWSTR WINAPI GetCommandLineW() {
     static std::wstring line = ReadCommandLine();
     return line.data();
+}
+
+void WINAPI Sleep(DWORD milliseconds) {
+    std::this_thread::sleep_for(std::chrono::milliseconds(milliseconds));
 }

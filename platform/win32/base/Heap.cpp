@@ -1,4 +1,4 @@
-#include "platform/win32/log/LogSink.h"
+#include "platform/win32/base/LogSink.h"
 
 #include <windows.h>
 

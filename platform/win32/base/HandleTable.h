@@ -5,6 +5,7 @@
 
 #include <windef.h>
 
+#include <atomic>
 #include <map>
 #include <memory>
 #include <mutex>
@@ -12,7 +13,10 @@
 namespace win32 {
 
 /// A value that no handle of the process had before; neither null nor one of Windows' fixed values.
-ULONG_PTR NextHandleValue();
+inline ULONG_PTR NextHandleValue() {
+    static std::atomic<ULONG_PTR> next{ULONG_PTR{1} << 32}; // above the registry's root keys
+    return next.fetch_add(4);
+}
 
 /// The open handles of one kind and what they stand for. Safe to use from several threads; an
 /// object that one thread still works with outlives its handle.
