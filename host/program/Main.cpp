@@ -28,51 +28,43 @@ bool StartLog(const CommonOptions& options) {
     return !options.logFile || Log::ToFile(FromArgument(*options.logFile));
 }
 
-/// @return whether the language asked for is in use
-bool StartLanguage(const CommonOptions& options, Reporter& reporter) {
-    wxString fault;
-    const auto wanted =
-        options.language ? std::optional(wxString::FromUTF8(*options.language)) : std::nullopt;
-    if (UseLanguage(wanted, fault))
-        return true;
-    reporter.Error("there are no texts in the language " + *wanted +
-                   "; the languages are: " + fault);
-    return false;
+/// @return why the language asked for is not in use
+std::optional<Fault> StartLanguage(const CommonOptions& options) {
+    return UseLanguage(options.language ? std::optional(wxString::FromUTF8(*options.language))
+                                        : std::nullopt);
 }
 
-/// Tells what documents are not kept from: whoever has required that they are, or else the log.
-/// @return whether the command may open documents
-bool IsIsolatedEnough(const CommonOptions& options, Reporter& reporter) {
-    const std::optional<MissingPart> missing = FindMissingIsolation();
-    if (options.requireIsolation && missing) {
-        reporter.Error(missing->Text());
-        return false;
-    }
+/// Tells the log what documents are not kept from, or whoever has required that they are.
+/// @return why the command may open no documents
+std::optional<Fault> CheckIsolation(const CommonOptions& options) {
+    if (options.requireIsolation)
+        if (const std::optional<Fault> missing = FindMissingIsolation())
+            return missing;
     const std::optional<EngineIsolation> isolation = IsolationOfEngines();
     if (isolation && !isolation->missing.empty())
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "Documents are not isolated: " << isolation->missing;
-    return true;
+    return std::nullopt;
 }
 
 ExitCode Run(const CommandLine& line) {
     const auto& [options, command] = line;
     Reporter reporter(options.json);
     const bool hasLog = StartLog(options);
-    if (!StartLanguage(options, reporter))
-        return ExitCode::WrongUsage;
-    if (!hasLog) {
-        reporter.Error(
-            wxString::Format(_("the log file %s cannot be written; choose another one with --log"),
-                             Shown(FromArgument(*options.logFile))));
-        return ExitCode::WrongUsage;
-    }
+    if (const auto fault = StartLanguage(options))
+        return reporter.Error(*fault);
+    if (!hasLog)
+        return reporter.Error(
+            {wxString::Format(_("the log file %s cannot be written; choose another one with --log"),
+                              Shown(FromArgument(*options.logFile))),
+             Blame::Usage});
     Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
     SetUpMachine({options.StandInsFolder(), options.stallSeconds, options.limitSeconds,
                   options.memoryMegabytes,
                   command.examinesEngine && options.engineDocuments != 1U});
-    if (command.opensDocuments && !IsIsolatedEnough(options, reporter))
-        return ExitCode::MachineAtFault;
+    if (command.opensDocuments)
+        if (const auto fault = CheckIsolation(options))
+            return reporter.Error(*fault);
     return command.run(options, reporter);
 }
 
@@ -89,9 +81,12 @@ ExitCode TellNoDisplay(const CommonOptions& options) {
     wxAppConsole console; // the texts are looked for beside the program, which it knows
     wxApp::SetInstance(&console);
     Reporter reporter(options.json);
-    if (StartLanguage(options, reporter))
-        reporter.Error(_("there is no display to show the settings on; run it on a desktop, or set "
-                         "them with convert --set"));
+    const std::optional<Fault> fault = StartLanguage(options);
+    reporter.Error(
+        fault ? *fault
+              : Fault{_("there is no display to show the settings on; run it on a desktop, or set "
+                        "them with convert --set"),
+                      Blame::Machine});
     wxApp::SetInstance(nullptr);
     return ExitCode::MachineAtFault;
 }

@@ -57,9 +57,6 @@ std::vector<nlohmann::json> RunResult::Records(const std::string& type) const {
     return records;
 }
 
-RunningProgram::RunningProgram(const std::vector<std::string>& command)
-    : m_process(command, m_folder / "out", m_folder / "err") {}
-
 void RunningProgram::AwaitNote() const {
     Await("the note",
           [this] { return Err().find("finishing what is under way") != std::string::npos; });
@@ -72,7 +69,7 @@ void RunningProgram::InterruptTwice() const {
 }
 
 RunResult RunningProgram::Wait() {
-    const int exitCode = m_process.Wait();
+    const int exitCode = ExitCode();
     return {exitCode, ReadBytes(m_folder / "out"), ReadBytes(m_folder / "err")};
 }
 

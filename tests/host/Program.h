@@ -1,8 +1,8 @@
 #pragma once
 
-#include "tests/host/Process.h"
 #include "tests/support/TemporaryFolder.h"
 
+#include <cstdint>
 #include <filesystem>
 #include <functional>
 #include <nlohmann/json.hpp>
@@ -21,16 +21,19 @@ struct RunResult {
     std::vector<nlohmann::json> Records(const std::string& type) const;
 };
 
-/// A program that has been started and not yet waited for.
+/// A program that has been started; killed with the object unless it has been waited for.
 class RunningProgram {
 public:
-    /// @param command the program's path and its arguments
+    /// @param command the program's path and its arguments, UTF-8
     explicit RunningProgram(const std::vector<std::string>& command);
+    ~RunningProgram();
+    RunningProgram(const RunningProgram&) = delete;
+    RunningProgram& operator=(const RunningProgram&) = delete;
 
     /// Asks it to end, as Ctrl-C does.
-    void Interrupt() const { m_process.Interrupt(); }
+    void Interrupt() const;
     /// Asks it to end in the other way that the system has, if it has one.
-    void Terminate() const { m_process.Terminate(); }
+    void Terminate() const;
     /// Waits until it has said that it finishes what is under way, and so taken the request in.
     void AwaitNote() const;
     /// Asks it to end, and when it has taken that in, once more.
@@ -41,9 +44,18 @@ public:
     std::string Err() const { return ReadBytes(m_folder / "err"); }
 
 private:
-    TemporaryFolder m_folder; ///< holds its output
-    Process m_process;
+    static constexpr std::intptr_t None = -1;
+
+    /// Waits until it has ended.
+    int ExitCode();
+
+    TemporaryFolder m_folder;       ///< holds its output
+    std::intptr_t m_process = None; ///< the system's id or handle
 };
+
+/// Whether a process of `quillon` runs that was given the argument; where tests run one at a time,
+/// any such process.
+bool IsQuillonRunningWith(const std::string& argument);
 
 RunResult RunProgram(const std::vector<std::string>& command);
 

@@ -34,20 +34,20 @@ fs::path FromText(const wxString& text) {
     return fs::u8path(text.utf8_string());
 }
 
-std::optional<wxString> ToText(const fs::path& path) {
-    const std::string utf8 = path.u8string();
-    wxString text = wxString::FromUTF8(utf8);
-    if (text.empty() && !utf8.empty())
-        return std::nullopt;
+bool IsText(const fs::path& path) {
+    return path.empty() || !ToText(path).empty();
+}
+
+wxString ToText(const fs::path& path) {
+    const wxString text = wxString::FromUTF8(path.u8string());
     // Three bytes can spell half a surrogate pair, which the conversion above lets through where
     // a wchar_t has 32 bits; UTF-8 has no such letters.
     const std::wstring wide = text.ToStdWstring();
-    if (sizeof(wchar_t) == 4 && std::any_of(wide.begin(), wide.end(), IsSurrogate))
-        return std::nullopt;
-    return text;
+    const bool hasHalves =
+        sizeof(wchar_t) == 4 && std::any_of(wide.begin(), wide.end(), IsSurrogate);
+    return hasHalves ? wxString() : text;
 }
 
 wxString Shown(const fs::path& path) {
-    const std::optional<wxString> text = ToText(path);
-    return text ? OneLine(*text) : EscapeBytes(path.u8string());
+    return IsText(path) ? OneLine(ToText(path)) : EscapeBytes(path.u8string());
 }

@@ -3,7 +3,6 @@
 #include <wx/string.h>
 
 #include <filesystem>
-#include <optional>
 #include <string>
 #include <system_error>
 
@@ -13,9 +12,13 @@ std::filesystem::path FromArgument(const std::string& utf8);
 
 std::filesystem::path FromText(const wxString& text);
 
-/// The path as a filter can take it.
-/// @return nothing when its name is not valid text
-std::optional<wxString> ToText(const std::filesystem::path& path);
+/// Whether the path is valid text. Those from outside are asked once, where they come in; what is
+/// made of them and of texts is text, too.
+bool IsText(const std::filesystem::path& path);
+
+/// The path as filters and the system's functions take it.
+/// @return empty when it is not text
+wxString ToText(const std::filesystem::path& path);
 
 /// The path for people: one line, bytes that are no text escaped ("\xe4").
 wxString Shown(const std::filesystem::path& path);

@@ -23,7 +23,7 @@ std::vector<fs::path> ModuleFiles(const fs::path& folder) {
          entry.increment(error)) {
         std::error_code unreadable;
         if (entry->path().extension() == QUILLON_MODULE_SUFFIX &&
-            entry->is_regular_file(unreadable) && ToText(entry->path()))
+            entry->is_regular_file(unreadable) && IsText(entry->path()))
             files.push_back(entry->path());
     }
     std::sort(files.begin(), files.end());

@@ -34,9 +34,9 @@ std::vector<wxString> AllotNames(const std::vector<Input>& inputs, const FilterS
                                  OutputFolder& outputFolder) {
     std::vector<wxString> names;
     for (const Input& input : inputs) {
-        const std::optional<wxString> fileName = ToText(input.full.filename());
-        names.push_back(fileName && ToText(input.given) && filters.Claiming(ExtensionOf(input))
-                            ? outputFolder.Allot(*fileName)
+        const bool isText = IsText(input.full) && IsText(input.given);
+        names.push_back(isText && filters.Claiming(ExtensionOf(input))
+                            ? outputFolder.Allot(ToText(input.full.filename()))
                             : wxString());
     }
     return names;
@@ -124,22 +124,19 @@ void ConvertSideBySide(const Run& run, std::size_t workers, const CommonOptions&
 
 ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
                     Reporter& reporter) {
-    Obstacle obstacle;
-    const std::optional<Settings> settings = MakeRunSettings(convert.settings, obstacle);
-    if (!settings) {
-        reporter.Error(obstacle.text);
-        return obstacle.exitCode;
-    }
+    Fault fault;
+    const std::optional<Settings> settings = MakeRunSettings(convert.settings, fault);
+    if (!settings)
+        return reporter.Error(fault);
     FilterSet filters(options.FiltersFolder());
     const std::vector<Input> inputs = ListInputs(convert.paths);
     if (const auto end = EndIdleRun(filters, inputs, reporter))
         return *end;
-    wxString fault;
     std::optional<OutputFolder> outputFolder = OutputFolder::Open(FromArgument(convert.out), fault);
     if (!outputFolder) {
-        reporter.Error(wxString::Format(_("the output folder %s cannot be used: %s"),
-                                        Shown(FromArgument(convert.out)), fault));
-        return ExitCode::WrongUsage;
+        fault.what = wxString::Format(_("the output folder %s cannot be used: %s"),
+                                      Shown(FromArgument(convert.out)), fault.what);
+        return reporter.Error(fault);
     }
     Workplace::RemoveAbandoned(outputFolder->Path());
     const std::vector<wxString> names = AllotNames(inputs, filters, *outputFolder);

@@ -11,21 +11,20 @@
 namespace {
 
 ExitCode Run(const std::filesystem::path& file, const CommonOptions& options, Reporter& reporter) {
-    wxString fault;
+    Fault fault;
     std::optional<Settings> settings = Settings::LoadForEditing(file, fault);
-    if (!settings || !ToText(file)) {
-        reporter.Error(
-            UnusableSettings(file, settings ? _("its name is not valid UTF-8 text") : fault));
-        return ExitCode::WrongUsage;
-    }
+    if (settings && !IsText(file))
+        fault = {_("its name is not valid UTF-8 text"), Blame::Usage};
+    if (!settings || !IsText(file))
+        return reporter.Error(UnusableSettings(file, fault));
     FillIn(*settings);
     TranslateChoices(*settings);
     const FilterSet filters(options.FiltersFolder());
     SettingsDialogue dialogue(filters, *settings, file);
-    if (!dialogue.HasPanel()) {
-        reporter.Error(_("no filter has settings to show; `quillon status` lists the filters"));
-        return ExitCode::MachineAtFault;
-    }
+    if (!dialogue.HasPanel())
+        return reporter.Error(
+            {_("no filter has settings to show; `quillon status` lists the filters"),
+             Blame::Machine});
     const bool saved = dialogue.ShowModal() == wxID_SAVE;
     reporter.Line(saved ? wxString::Format(_("The settings are saved in %s."), Shown(file))
                         : _("The settings are left as they were."));

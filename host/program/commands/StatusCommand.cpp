@@ -4,10 +4,10 @@
 #include "host/program/machine/Engines.h"
 #include "host/program/machine/FilePrinter.h"
 #include "host/program/machine/MissingParts.h"
+#include "host/program/report/Readiness.h"
 #include "host/services/OneLine.h"
 #include "machine/Distiller.h"
 #include "machine/InstalledOffice.h"
-#include "plugin/ResultCodes.h"
 
 #include <wx/intl.h>
 
@@ -27,22 +27,9 @@ wxString OrNone(const wxString& text) {
     return "  " + (text.empty() ? _("none") : OneLine(text));
 }
 
-template <typename Texts>
-Json ListOf(const Texts& texts) {
-    Json list = Json::array();
-    for (const wxString& text : texts)
-        list.push_back(JsonText(text));
-    return list;
-}
-
-/// Why the filter is not ready, in its own words.
-wxString Unreadiness(const Filter& filter) {
-    return filter.IsReady() ? wxString() : filter.ErrorText(Result::NotInitialized);
-}
-
 void TellFilter(const Filter& filter, Reporter& reporter) {
     const PluginInfo& info = filter.Info();
-    const wxString fault = Unreadiness(filter);
+    const wxString fault = filter.Unreadiness();
     const wxString about = wxString::Format(_("%s, %s, for %s"), info.version, info.vendor,
                                             wxJoin(filter.Extensions(), ' ', 0));
     const wxString readiness =
@@ -52,7 +39,7 @@ void TellFilter(const Filter& filter, Reporter& reporter) {
                      {"identifier", JsonText(info.identifier)},
                      {"version", JsonText(info.version)},
                      {"vendor", JsonText(info.vendor)},
-                     {"extensions", ListOf(filter.Extensions())},
+                     {"extensions", JsonTexts(filter.Extensions())},
                      {"ready", filter.IsReady()},
                      {"text", JsonText(fault)}});
 }
@@ -89,7 +76,7 @@ wxString Describe(OfficeApplication application, const wxString& version) {
 void TellApplication(OfficeApplication application, Reporter& reporter) {
     const unsigned long number = RegisteredVersionOf(application);
     const wxString version = number ? wxString::Format("%lu", number) : wxString();
-    const std::optional<MissingPart> missing = FindMissingApplication(application);
+    const std::optional<Fault> missing = FindMissingApplication(application);
     const wxString advice = missing ? missing->advice : wxString();
     const wxString found = Describe(application, version);
     reporter.Line(Entry(NameOf(application),
@@ -161,13 +148,13 @@ void TellDistiller(Reporter& reporter) {
     for (const wxString& profile : profiles)
         reporter.Line("  " + wxString::Format(_("profile %s"), OneLine(profile)));
     reporter.Record(
-        {{"type", "distiller"}, {"engine", JsonText(engine)}, {"profiles", ListOf(profiles)}});
+        {{"type", "distiller"}, {"engine", JsonText(engine)}, {"profiles", JsonTexts(profiles)}});
 }
 
 void TellIsolation(unsigned memoryMegabytes, Reporter& reporter) {
     const std::optional<EngineIsolation> isolation = IsolationOfEngines();
     const wxString means = isolation ? isolation->means : wxString();
-    const std::optional<MissingPart> missing = FindMissingIsolation();
+    const std::optional<Fault> missing = FindMissingIsolation();
     reporter.Line(_("Isolation"));
     reporter.Line("  " + OneLine(missing ? wxString::Format(_("incomplete: %s"), missing->what)
                                          : wxString::Format(_("full (%s)"), means)));
@@ -182,68 +169,14 @@ void TellIsolation(unsigned memoryMegabytes, Reporter& reporter) {
 }
 
 void TellPanel(const FilterSet& filters, Reporter& reporter) {
-    const wxString obstacle = filters.Filters().empty() ? _("there is no filter") : PanelObstacle();
+    const std::optional<Fault> obstacle = filters.Filters().empty()
+                                              ? Fault{_("there is no filter"), Blame::Machine}
+                                              : FindMissingForPanel();
+    const wxString reason = obstacle ? obstacle->Text() : wxString();
     reporter.Line(_("Settings panel"));
-    reporter.Line("  " + (obstacle.empty() ? _("can be used")
-                                           : wxString::Format(_("disabled: %s"), obstacle)));
-    reporter.Record(
-        {{"type", "panel"}, {"enabled", obstacle.empty()}, {"reason", JsonText(obstacle)}});
-}
-
-/// The extensions of the files that a filter is ready for and the machine can print.
-wxArrayString ListConvertible(const FilterSet& filters) {
-    wxArrayString extensions;
-    for (const auto& filter : filters.Filters())
-        for (const wxString& extension : filter->Extensions())
-            if (filter->IsReady() && !FindMissingFor(extension))
-                extensions.Add(extension);
-    return extensions;
-}
-
-/// Why there is nothing that could be converted.
-std::vector<MissingPart> FindObstacles(const FilterSet& filters) {
-    std::vector<MissingPart> obstacles;
-    if (filters.Filters().empty())
-        obstacles.push_back({_("There is no filter"), _("Install the program anew")});
-    for (const auto& part : {FindMissingOffice(), FindMissingPrinter()})
-        if (part)
-            obstacles.push_back(*part);
-    if (!obstacles.empty())
-        return obstacles;
-    for (const auto& filter : filters.Filters()) {
-        const wxString& name = filter->Info().identifier;
-        obstacles.push_back(
-            {filter->IsReady()
-                 ? wxString::Format(_("The filter %s has no use for what is installed"), name)
-                 : wxString::Format(_("The filter %s is not ready: %s"), name,
-                                    Unreadiness(*filter)),
-             {}});
-    }
-    return obstacles;
-}
-
-ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter) {
-    const wxArrayString convertible = ListConvertible(filters);
-    std::vector<MissingPart> missing;
-    if (convertible.empty())
-        missing = FindObstacles(filters);
-    if (const auto pdfMaker = FindMissingPdfMaker())
-        missing.push_back(*pdfMaker);
-    if (const auto isolation = FindMissingIsolation(); isolation && requireIsolation)
-        missing.push_back(*isolation);
-    for (const MissingPart& part : missing) {
-        reporter.Line(wxString::Format(_("Missing: %s"), part.Text()));
-        reporter.Record({{"type", "missing"},
-                         {"text", JsonText(part.what)},
-                         {"advice", JsonText(part.advice)}});
-    }
-    const ExitCode exitCode = missing.empty() ? ExitCode::Done : ExitCode::MachineAtFault;
-    if (missing.empty())
-        reporter.Line(wxString::Format(_("Ready to convert %s."), wxJoin(convertible, ' ', 0)));
-    reporter.Record({{"type", "summary"},
-                     {"convertible", ListOf(convertible)},
-                     {"exitCode", static_cast<int>(exitCode)}});
-    return exitCode;
+    reporter.Line("  " +
+                  (obstacle ? wxString::Format(_("disabled: %s"), reason) : _("can be used")));
+    reporter.Record({{"type", "panel"}, {"enabled", !obstacle}, {"reason", JsonText(reason)}});
 }
 
 ExitCode Run(const CommonOptions& options, Reporter& reporter) {

@@ -106,7 +106,7 @@ private:
 };
 
 ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& filtersFolder) {
-    wxString fault;
+    Fault fault;
     const std::optional<Settings> settings = Settings::FromXml(facts.settings, fault);
     const std::optional<OutputFolder> outputFolder = OutputFolder::Open(facts.outputFolder, fault);
     if (!settings || !outputFolder)

@@ -2,6 +2,7 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/Reasons.h"
+#include "host/program/machine/EngineFailure.h"
 #include "host/program/machine/FontStandIns.h"
 #include "plugin/ResultCodes.h"
 
@@ -19,7 +20,7 @@ FilterAnswer CallOnce(const std::function<int()>& work) {
 }
 
 bool WasEndedFromOutside(const FilterAnswer& answer) {
-    return answer.failure && answer.failure->fault == EngineFailure::Fault::Outside;
+    return answer.failure && answer.failure->blame == Blame::Outside;
 }
 
 } // namespace
@@ -29,13 +30,13 @@ FilterAnswer CallFilter(const wxString& document, const std::function<int()>& wo
     const bool isSecond = WasEndedFromOutside(answer);
     if (isSecond) {
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-            << document << " is tried once more, since " << answer.failure->reason;
+            << document << " is tried once more, since " << answer.failure->what;
         answer = CallOnce(work);
     }
     if (answer.failure)
-        answer.failure->reason = TranslateReason(answer.failure->reason);
+        answer.failure->what = TranslateReason(answer.failure->what);
     if (isSecond && WasEndedFromOutside(answer))
-        answer.failure->reason =
-            wxString::Format(_("%s, at the second try too"), answer.failure->reason);
+        answer.failure->what =
+            wxString::Format(_("%s, at the second try too"), answer.failure->what);
     return answer;
 }

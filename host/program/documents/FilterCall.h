@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/machine/EngineFailure.h"
+#include "host/program/base/Fault.h"
 
 #include <wx/string.h>
 
@@ -10,7 +10,7 @@
 /// What a filter has answered.
 struct FilterAnswer {
     int code = 0;
-    std::optional<EngineFailure> failure; ///< what is known beside the code when it is none of 0
+    std::optional<Fault> failure; ///< what its engine has told when the code is not 0
 };
 
 /// Has a filter work on a document: once more when somebody has ended its engine meanwhile, which

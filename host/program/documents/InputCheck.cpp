@@ -1,10 +1,8 @@
 #include "host/program/documents/InputCheck.h"
 
 #include "host/program/base/PathText.h"
-#include "host/program/documents/Outcome.h"
 #include "plugin/ResultCodes.h"
 
-#include <wx/filename.h>
 #include <wx/intl.h>
 
 #include <cerrno>
@@ -61,13 +59,17 @@ std::string FirstBytes(const fs::path& file) {
     return {bytes, static_cast<std::size_t>(stream.gcount())};
 }
 
-Refusal Unreadable(const std::error_code& error) {
+Fault Refusal(int code, const wxString& reason) {
+    return {reason, Blame::Document, code};
+}
+
+Fault Unreadable(const std::error_code& error) {
     const wxString reason = wxString::Format(_("it cannot be read: %s"), Because(error));
     if (error == std::errc::too_many_files_open ||
         error == std::errc::too_many_files_open_in_system ||
         error == std::errc::not_enough_memory || error == std::errc::io_error)
-        return {ConversionFailed, reason, true};
-    return {Result::InputFileNotFound, reason};
+        return {reason, Blame::Machine};
+    return Refusal(Result::InputFileNotFound, reason);
 }
 
 wxString CouldNotOpen(const wxString& extension, const wxString& toldByEngine) {
@@ -80,31 +82,32 @@ wxString CouldNotOpen(const wxString& extension, const wxString& toldByEngine) {
 
 } // namespace
 
-std::optional<Refusal> CheckInput(const fs::path& file) {
-    if (!ToText(file))
-        return Refusal{Result::InvalidInputFile, _("its name is not valid UTF-8 text; rename it")};
+std::optional<Fault> CheckInput(const Input& input) {
+    const fs::path& file = input.full;
+    if (!IsText(file))
+        return Refusal(Result::InvalidInputFile, _("its name is not valid UTF-8 text; rename it"));
     std::error_code error;
     const fs::file_status status = fs::status(file, error);
     if (status.type() == fs::file_type::not_found)
-        return Refusal{Result::InputFileNotFound, _("there is no such file")};
+        return Refusal(Result::InputFileNotFound, _("there is no such file"));
     if (!fs::status_known(status))
-        return Refusal{Result::InputFileNotFound,
-                       wxString::Format(_("it cannot be reached: %s"), Because(error))};
+        return Refusal(Result::InputFileNotFound,
+                       wxString::Format(_("it cannot be reached: %s"), Because(error)));
     if (!fs::is_regular_file(status))
-        return Refusal{fs::is_directory(status) ? Result::InputFileNotFound
+        return Refusal(fs::is_directory(status) ? Result::InputFileNotFound
                                                 : Result::InvalidInputFile,
-                       DescribeKind(status.type())};
+                       DescribeKind(status.type()));
     errno = 0;
     if (!std::ifstream(file, std::ios::binary).is_open())
         return Unreadable({errno, std::generic_category()});
     if (fs::file_size(file, error) == 0 && !error)
-        return Refusal{Result::InvalidInputFile, _("the file is empty")};
+        return Refusal(Result::InvalidInputFile, _("the file is empty"));
     return std::nullopt;
 }
 
-wxString DescribeInvalid(const fs::path& file, const wxString& toldByEngine) {
-    const std::string beginning = FirstBytes(file);
-    const wxString extension = wxFileName(ToText(file).value_or(wxString())).GetExt().Lower();
+wxString DescribeInvalid(const Input& input, const wxString& toldByEngine) {
+    const std::string beginning = FirstBytes(input.full);
+    const wxString extension = ExtensionOf(input).Lower();
     const bool openXml = extension.EndsWith("x");
     if (BeginsWith(beginning, Zip) && extension == "pub")
         return _("it is a ZIP package, not a publication");

@@ -63,6 +63,5 @@ std::vector<Input> ListInputs(const std::vector<std::string>& arguments) {
 }
 
 wxString ExtensionOf(const Input& input) {
-    const std::optional<wxString> text = ToText(input.full);
-    return text ? wxFileName(*text).GetExt() : wxString();
+    return wxFileName(ToText(input.full)).GetExt();
 }

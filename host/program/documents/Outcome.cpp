@@ -22,6 +22,14 @@ const char* NameOf(State state) {
     return "";
 }
 
+void Outcome::End(State how, Fault why, const wxString& message) {
+    if (IsMachineCode(why.code))
+        why.blame = Blame::Machine;
+    state = how;
+    fault = std::move(why);
+    text = message;
+}
+
 bool IsMachineCode(int code) {
     constexpr int FirstMissingOffice = 1011;
     return code == Result::NotInitialized || code == Result::DistillerNotInstalled ||

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "host/program/base/Fault.h"
 #include "host/program/machine/FontStandIns.h"
 
 #include <wx/string.h>
@@ -23,16 +24,15 @@ struct Outcome {
     std::filesystem::path input;
     std::filesystem::path output; ///< empty when there is none
     State state = State::Accepted;
-    int code = 0;
-    wxString text;               ///< the code's message
-    wxString reason;             ///< what the host can add for a person; may be empty
-    bool machineAtFault = false; ///< and not the document
+    std::optional<Fault> fault; ///< why it has come no further
+    wxString text;              ///< the result code's message
     std::vector<FontStandIn> fonts;
     std::optional<double> seconds; ///< of screening and conversion
-};
 
-/// The shared table's code for a failure that no filter is to blame for.
-constexpr int ConversionFailed = -1003;
+    /// Says that the file comes no further.
+    /// @param message of the fault's code
+    void End(State how, Fault why, const wxString& message);
+};
 
 /// The state's name, as records have it, and people in their language.
 const char* NameOf(State state);

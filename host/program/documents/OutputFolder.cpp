@@ -23,29 +23,36 @@ fs::path WithoutSeparatorAtEnd(const fs::path& path) {
     return path.has_filename() || path == path.root_path() ? path : path.parent_path();
 }
 
+/// @return why there is no such folder; empty when it has been made
+wxString Make(const fs::path& folder) {
+    std::error_code error;
+    if (fs::exists(folder, error))
+        return _("it is a file, not a folder");
+    if (!fs::is_directory(folder.parent_path(), error))
+        return _("the folder above it does not exist either; create that first");
+    if (!fs::create_directory(folder, error) ||
+        (error = SyncFolder(folder.parent_path()))) // or it is lost with what is in it
+        return wxString::Format(_("it cannot be created: %s"), Because(error));
+    return {};
+}
+
 } // namespace
 
-std::optional<OutputFolder> OutputFolder::Open(const fs::path& path, wxString& fault) {
+std::optional<OutputFolder> OutputFolder::Open(const fs::path& path, Fault& fault) {
     std::error_code error;
     const fs::path folder = WithoutSeparatorAtEnd(fs::absolute(path, error).lexically_normal());
-    if (error || !ToText(folder)) {
-        fault = _("its name is not valid UTF-8 text");
-        return std::nullopt;
+    wxString obstacle;
+    if (error || !IsText(folder)) {
+        obstacle = _("its name is not valid UTF-8 text");
+    } else if (!fs::is_directory(folder, error)) {
+        obstacle = Make(folder);
+    } else if (!wxFileName::IsDirWritable(ToText(folder))) {
+        obstacle = _("nothing can be written to it; choose another one or change its permissions");
     }
-    if (!fs::is_directory(folder, error)) {
-        if (fs::exists(folder, error))
-            fault = _("it is a file, not a folder");
-        else if (!fs::is_directory(folder.parent_path(), error))
-            fault = _("the folder above it does not exist either; create that first");
-        else if (!fs::create_directory(folder, error) ||
-                 (error = SyncFolder(folder.parent_path()))) // or it is lost with what is in it
-            fault = wxString::Format(_("it cannot be created: %s"), Because(error));
-    } else if (!wxFileName::IsDirWritable(*ToText(folder))) {
-        fault = _("nothing can be written to it; choose another one or change its permissions");
-    }
-    if (!fault.empty())
-        return std::nullopt;
-    return OutputFolder(folder);
+    if (obstacle.empty())
+        return OutputFolder(folder);
+    fault = {obstacle, Blame::Usage};
+    return std::nullopt;
 }
 
 wxString OutputFolder::Allot(const wxString& fileName) {

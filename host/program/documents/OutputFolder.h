@@ -1,6 +1,6 @@
 #pragma once
 
-#include <wx/string.h>
+#include "host/program/base/Fault.h"
 
 #include <filesystem>
 #include <optional>
@@ -10,8 +10,8 @@
 class OutputFolder {
 public:
     /// Takes a folder, creating it when only itself is missing.
-    /// @param fault receives why it cannot be used, for people
-    static std::optional<OutputFolder> Open(const std::filesystem::path& path, wxString& fault);
+    /// @param fault receives why it cannot be used
+    static std::optional<OutputFolder> Open(const std::filesystem::path& path, Fault& fault);
 
     /// Absolute, without a separator at its end.
     const std::filesystem::path& Path() const { return m_path; }

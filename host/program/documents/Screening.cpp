@@ -16,24 +16,22 @@ wxString UnclaimedReason(const wxString& extension) {
                : wxString::Format(_("no filter takes files ending in .%s"), extension);
 }
 
-void Refuse(const FilterSet& filters, const Refusal& refusal, Outcome& outcome) {
-    outcome.state = refusal.machineAtFault ? State::Failed : State::Refused;
-    outcome.code = refusal.code;
-    outcome.text = filters.ErrorText(refusal.code);
-    outcome.reason = refusal.reason;
-    outcome.machineAtFault = refusal.machineAtFault || IsMachineCode(refusal.code);
+void Refuse(const FilterSet& filters, const Fault& fault, Outcome& outcome) {
+    // Otherwise it has a code of filters, and they, or the host for them, have looked at the file.
+    const bool hasFailed = fault.code == ConversionFailed;
+    outcome.End(hasFailed ? State::Failed : State::Refused, fault, filters.ErrorText(fault.code));
 }
 
 /// Why the filter did not accept the file.
-Refusal RefusalFor(const FilterAnswer& answer, const Input& input) {
+Fault RefusalFor(const FilterAnswer& answer, const Input& input) {
     if (IsMachineCode(answer.code))
-        return {answer.code, MachineReason(ExtensionOf(input))};
-    const EngineFailure failure = answer.failure.value_or(EngineFailure());
-    if (failure.fault != EngineFailure::Fault::Document) // whatever the document is
-        return {ConversionFailed, failure.reason, true};
+        return {MachineReason(ExtensionOf(input)), Blame::Machine, answer.code};
+    const Fault failure = answer.failure.value_or(Fault());
+    if (failure.blame != Blame::Document) // whatever the document is
+        return failure;
     if (answer.code == Result::InvalidInputFile)
-        return {answer.code, DescribeInvalid(input.full, failure.reason)};
-    return {answer.code, failure.reason};
+        return {DescribeInvalid(input, failure.what), Blame::Document, answer.code};
+    return {failure.what, Blame::Document, answer.code};
 }
 
 } // namespace
@@ -43,19 +41,20 @@ ScreenedInput Screen(const FilterSet& filters, const Input& input) {
     screened.outcome.input = input.given;
     const wxString extension = ExtensionOf(input);
     Filter* const filter = filters.Claiming(extension);
-    const std::optional<Refusal> fault =
-        filter || input.named ? CheckInput(input.full) : std::nullopt;
+    const std::optional<Fault> fault = filter || input.named ? CheckInput(input) : std::nullopt;
     if (fault) {
         Refuse(filters, *fault, screened.outcome);
     } else if (!filter) {
-        Refuse(filters, {Result::InvalidInputFile, UnclaimedReason(extension)}, screened.outcome);
+        Refuse(filters, {UnclaimedReason(extension), Blame::Document, Result::InvalidInputFile},
+               screened.outcome);
         if (!input.named)
             screened.outcome.state = State::Skipped;
     } else if (!filter->IsReady()) { // which some of its screening does not look at
-        Refuse(filters, {Result::NotInitialized, MachineReason(extension)}, screened.outcome);
+        Refuse(filters, {MachineReason(extension), Blame::Machine, Result::NotInitialized},
+               screened.outcome);
     } else {
         const FilterAnswer answer = CallFilter(Shown(input.given.filename()), [&] {
-            Filter::Screened result = filter->Screen(*ToText(input.full));
+            Filter::Screened result = filter->Screen(ToText(input.full));
             screened.item = std::move(result.item);
             return result.code;
         });
@@ -71,25 +70,24 @@ ScreenedInput Screen(const FilterSet& filters, const Input& input) {
 
 Outcome ScreenOnly(const FilterSet& filters, const Input& input) {
     ScreenedInput screened = Screen(filters, input);
-    const std::optional<MissingPart> missing =
+    const std::optional<Fault> missing =
         screened.item ? FindMissingFor(ExtensionOf(input)) : std::nullopt;
     if (missing)
-        Refuse(filters, {missing->code, missing->Text()}, screened.outcome);
+        Refuse(filters, *missing, screened.outcome);
     return screened.outcome;
 }
 
 Outcome NotReached(const FilterSet& filters, const Input& input) {
     Outcome outcome;
     outcome.input = input.given;
-    outcome.state = State::NotConverted;
-    outcome.code = Result::Failure;
-    outcome.text = filters.ErrorText(Result::Failure);
-    outcome.reason = _("interrupted before its turn came");
+    outcome.End(State::NotConverted,
+                {_("interrupted before its turn came"), Blame::Outside, Result::Failure},
+                filters.ErrorText(Result::Failure));
     return outcome;
 }
 
 wxString MachineReason(const wxString& extension) {
-    const std::optional<MissingPart> missing = FindMissingFor(extension);
+    const std::optional<Fault> missing = FindMissingFor(extension);
     return missing ? missing->Text()
                    : _("see `quillon status`; if it finds nothing missing, repair the "
                        "installation of its application");

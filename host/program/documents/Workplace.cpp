@@ -26,7 +26,7 @@ constexpr std::chrono::hours LongestUnmarked = 1h;
 /// @param disposition CREATE_NEW for one's own, OPEN_EXISTING to see whether another is abandoned
 /// @return null when it cannot be opened; the file is closed with the last copy
 std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
-    const wxString path = ToText(workplace / MarkName).value_or(wxString());
+    const wxString path = ToText(workplace / MarkName);
     HANDLE file = CreateFileW(path.wc_str(), GENERIC_READ | GENERIC_WRITE, 0, nullptr, disposition,
                               FILE_ATTRIBUTE_NORMAL, nullptr);
     return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
@@ -36,7 +36,7 @@ std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
 bool IsWorkplace(const fs::directory_entry& entry) {
     static const wxRegEx s_names(R"(^\.quillon-[0-9]+-[0-9]+$)");
     std::error_code error;
-    return s_names.Matches(ToText(entry.path().filename()).value_or(wxString())) &&
+    return s_names.Matches(ToText(entry.path().filename())) &&
            fs::is_directory(entry.symlink_status(error));
 }
 
@@ -72,7 +72,7 @@ void Remove(const fs::path& workplace, std::shared_ptr<void> mark) {
 
 } // namespace
 
-std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxString& fault) {
+std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, Fault& fault) {
     const std::string prefix = ".quillon-" + std::to_string(wxGetProcessId()) + '-';
     std::error_code error;
     for (int number = 0; number < 1000; ++number) { // taken: by a process that was ended
@@ -85,9 +85,10 @@ std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, wxStrin
         if (error)
             break;
     }
-    fault = error ? wxString::Format(_("nothing can be written to the output folder: %s"),
-                                     Because(error))
-                  : _("nothing can be written to the output folder");
+    fault = {error ? wxString::Format(_("nothing can be written to the output folder: %s"),
+                                      Because(error))
+                   : _("nothing can be written to the output folder"),
+             Blame::Machine};
     return std::nullopt;
 }
 
@@ -124,21 +125,23 @@ Workplace::~Workplace() {
         Remove(m_path, std::move(m_mark));
 }
 
-bool Workplace::Deliver(const wxString& name, const wxString& newName, wxString& fault) const {
+std::optional<Fault> Workplace::Deliver(const wxString& name, const wxString& newName) const {
     const fs::path from = m_path / FromText(name);
     const fs::path to = m_path.parent_path() / FromText(newName);
     const std::error_code error = MoveDurably(from, to);
-    if (error)
-        fault = wxString::Format(_("the output could not be put in place as %s: %s"), Shown(to),
-                                 Because(error));
-    return !error;
+    if (!error)
+        return std::nullopt;
+    return Fault{wxString::Format(_("the output could not be put in place as %s: %s"), Shown(to),
+                                  Because(error)),
+                 Blame::Machine};
 }
 
-bool Workplace::ConfirmDelivery(wxString& fault) const {
+std::optional<Fault> Workplace::ConfirmDelivery() const {
     const fs::path outputFolder = m_path.parent_path();
     const std::error_code error = SyncFolder(outputFolder);
-    if (error)
-        fault = wxString::Format(_("the output is in %s, but may be lost if the power fails: %s"),
-                                 Shown(outputFolder), Because(error));
-    return !error;
+    if (!error)
+        return std::nullopt;
+    return Fault{wxString::Format(_("the output is in %s, but may be lost if the power fails: %s"),
+                                  Shown(outputFolder), Because(error)),
+                 Blame::Machine};
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <wx/string.h>
+#include "host/program/base/Fault.h"
 
 #include <filesystem>
 #include <memory>
@@ -10,9 +10,8 @@
 /// appears in the output folder whole or not at all. It goes with whatever is left in it.
 class Workplace {
 public:
-    /// @param fault receives why there is none, for people
-    static std::optional<Workplace> Create(const std::filesystem::path& outputFolder,
-                                           wxString& fault);
+    /// @param fault receives why there is none
+    static std::optional<Workplace> Create(const std::filesystem::path& outputFolder, Fault& fault);
 
     /// Removes the workplaces of programs that were ended before they could do it: those whose mark
     /// nobody has, and old ones that have none.
@@ -27,14 +26,12 @@ public:
     /// Moves a file to the output folder, in place of an older one, when its bytes are on the disk.
     /// @param name of the file here
     /// @param newName of the file there
-    /// @param fault receives why it is not there, for people
-    /// @return whether it is
-    bool Deliver(const wxString& name, const wxString& newName, wxString& fault) const;
+    /// @return why it is not there
+    std::optional<Fault> Deliver(const wxString& name, const wxString& newName) const;
 
     /// Waits until all that was delivered is on the disk under its names.
-    /// @param fault receives why that is not certain, for people
-    /// @return whether it is
-    bool ConfirmDelivery(wxString& fault) const;
+    /// @return why that is not certain
+    std::optional<Fault> ConfirmDelivery() const;
 
 private:
     explicit Workplace(std::filesystem::path path);

@@ -57,6 +57,10 @@ bool Filter::Claims(const wxString& extension) const {
     return Extensions().Index(extension, false) != wxNOT_FOUND;
 }
 
+wxString Filter::Unreadiness() const {
+    return IsReady() ? wxString() : ErrorText(Result::NotInitialized);
+}
+
 wxWindow* Filter::CreatePanel(wxWindow* parent, const wxXmlNode& settings) {
     m_plugin->LoadSettings(&settings);
     return m_plugin->CreateSettingsPanel(parent);

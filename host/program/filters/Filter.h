@@ -25,6 +25,8 @@ public:
     bool Claims(const wxString& extension) const;
 
     bool IsReady() const { return m_plugin->IsReady(); }
+    /// Why it is not ready, in its own words; empty when it is.
+    wxString Unreadiness() const;
 
     void ApplySettings(const wxXmlNode& settings) { m_plugin->ApplySettings(&settings); }
 

@@ -16,7 +16,7 @@ bool Find(HMODULE module, const char* name, Function& function) {
 } // namespace
 
 std::unique_ptr<FilterModule> FilterModule::Load(const std::filesystem::path& file) {
-    const HMODULE handle = LoadLibraryW(ToText(file).value_or(wxString()).wc_str());
+    const HMODULE handle = LoadLibraryW(ToText(file).wc_str());
     if (!handle) {
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "Cannot load the filter " << Shown(file);

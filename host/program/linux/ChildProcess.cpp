@@ -92,14 +92,14 @@ int Spawn(const std::vector<std::string>& arguments, int in, int out, pid_t& pro
 } // namespace
 
 std::unique_ptr<ChildProcess> ChildProcess::Start(const std::vector<std::string>& arguments,
-                                                  wxString& fault) {
+                                                  Fault& fault) {
     Pipe down;
     Pipe up;
     pid_t process = -1;
     const int error =
         down.Open() && up.Open() ? Spawn(arguments, down.from, up.to, process) : errno;
     if (error != 0) {
-        fault = Because({error, std::generic_category()});
+        fault = {Because({error, std::generic_category()}), Blame::Machine};
         return nullptr;
     }
     LineChannel channel(Pipe::Stream(up.from, "r"), Pipe::Stream(down.to, "w"));
@@ -116,7 +116,7 @@ void ChildProcess::Kill() const {
         kill(static_cast<pid_t>(m_process), SIGKILL);
 }
 
-ProcessEnd ChildProcess::Wait() {
+Fault ChildProcess::Wait() {
     int status = 0;
     pid_t waited = -1;
     while (m_process != None && waited < 0) {
@@ -129,7 +129,7 @@ ProcessEnd ChildProcess::Wait() {
         return {wxString::Format("ended with exit code %d", WEXITSTATUS(status))};
     const int signal = WTERMSIG(status);
     return {wxString::Format("ended by signal %d, %s", signal, strsignal(signal)),
-            signal == SIGKILL}; // it does not end by polite ones
+            signal == SIGKILL ? Blame::Outside : Blame::Document}; // it does not end by polite ones
 }
 
 LineChannel TakeStandardStreams() {

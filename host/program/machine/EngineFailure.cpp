@@ -14,10 +14,10 @@ wxString TextOf(const wxRegKey& key, const char* value) {
     return text;
 }
 
-EngineFailure::Fault FaultOf(const wxString& name) {
+Blame BlameOf(const wxString& name) {
     if (name == "machine")
-        return EngineFailure::Fault::Machine;
-    return name == "outside" ? EngineFailure::Fault::Outside : EngineFailure::Fault::Document;
+        return Blame::Machine;
+    return name == "outside" ? Blame::Outside : Blame::Document;
 }
 
 } // namespace
@@ -28,9 +28,9 @@ void ForgetEngineFailure() {
         key.DeleteSelf();
 }
 
-std::optional<EngineFailure> LastEngineFailure() {
+std::optional<Fault> LastEngineFailure() {
     const wxRegKey key(wxRegKey::HKCU, LastFailureKey);
     if (!key.Exists())
         return std::nullopt;
-    return EngineFailure{TextOf(key, FailureReasonValue), FaultOf(TextOf(key, FailureFaultValue))};
+    return Fault{TextOf(key, FailureReasonValue), BlameOf(TextOf(key, FailureFaultValue))};
 }

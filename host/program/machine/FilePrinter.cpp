@@ -70,7 +70,7 @@ void AddFilePrinter(const std::filesystem::path& ppd) {
             << "The description of the file printer is missing: " << Shown(ppd);
         return;
     }
-    if (!PutInDriver(ToText(ppd).value_or(wxString()).ToStdWstring()) || !PutInPrinter())
+    if (!PutInDriver(ToText(ppd).ToStdWstring()) || !PutInPrinter())
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "The file printer could not be added, error "
             << wxString::Format("%u", GetLastError());

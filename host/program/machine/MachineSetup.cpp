@@ -26,7 +26,7 @@ void Enter(wxRegKey::StdKey root, const char* keyName, const char* valueName, co
 using RegisterServer = HRESULT(STDMETHODCALLTYPE*)();
 
 void Register(const std::filesystem::path& file) {
-    const HMODULE module = LoadLibraryW(ToText(file).value_or(wxString()).wc_str());
+    const HMODULE module = LoadLibraryW(ToText(file).wc_str());
     const auto registerServer = reinterpret_cast<RegisterServer>(reinterpret_cast<void (*)()>(
         module ? GetProcAddress(module, "DllRegisterServer") : nullptr));
     const HRESULT result = registerServer ? registerServer() : E_FAIL;
@@ -79,7 +79,7 @@ void EnterLimits(const MachineSetup& setup) {
 } // namespace
 
 void SetUpMachine(const MachineSetup& setup) {
-    Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()).value_or(wxString()));
+    Enter(wxRegKey::HKLM, HostKey, InstallPathValue, ToText(ProgramFolder()));
     EnterLimits(setup);
     Enter(wxRegKey::HKCU, StandInsKey, ExamineValue, setup.examineEngine ? 1L : 0L);
     RegisterStandIns(setup.standInsFolder);

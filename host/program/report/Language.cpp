@@ -10,7 +10,7 @@ constexpr const char* English = "en"; // the texts themselves
 
 } // namespace
 
-bool UseLanguage(const std::optional<wxString>& wanted, wxString& fault) {
+std::optional<Fault> UseLanguage(const std::optional<wxString>& wanted) {
     auto* const translations = new wxTranslations;
     wxTranslations::Set(translations); // owns it
     translations->SetLoader(new CatalogueLoader(CatalogueLoader::ProgramFolder()));
@@ -22,11 +22,12 @@ bool UseLanguage(const std::optional<wxString>& wanted, wxString& fault) {
         if (languages.Index(language) == wxNOT_FOUND)
             language = language.BeforeFirst('_');
         if (languages.Index(language) == wxNOT_FOUND) {
-            fault = wxJoin(languages, ' ', 0);
-            return false;
+            return Fault{"there are no texts in the language " + *wanted +
+                             "; the languages are: " + wxJoin(languages, ' ', 0),
+                         Blame::Usage};
         }
         translations->SetLanguage(language);
     }
     translations->AddCatalog(CatalogueDomain);
-    return true;
+    return std::nullopt;
 }

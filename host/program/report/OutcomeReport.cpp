@@ -19,15 +19,23 @@ std::string HexOf(const std::string& bytes) {
     return hex;
 }
 
+int CodeOf(const Outcome& outcome) {
+    return outcome.fault ? outcome.fault->code : 0;
+}
+
+wxString ReasonOf(const Outcome& outcome) {
+    return outcome.fault ? outcome.fault->Text() : wxString();
+}
+
 /// The outcome as a line for people.
 wxString LineOf(const Outcome& outcome) {
     wxString line = Shown(outcome.input);
     if (!outcome.output.empty())
         line << " -> " << Shown(outcome.output);
-    line << ": " << wxGetTranslation(NameOf(outcome.state)) << ", " << outcome.code << ' '
+    line << ": " << wxGetTranslation(NameOf(outcome.state)) << ", " << CodeOf(outcome) << ' '
          << OneLine(outcome.text);
-    if (!outcome.reason.empty())
-        line << " (" << OneLine(outcome.reason) << ')';
+    if (const wxString reason = ReasonOf(outcome); !reason.empty())
+        line << " (" << OneLine(reason) << ')';
     if (outcome.seconds)
         line << wxString::Format(", %.2f s", *outcome.seconds);
     return line;
@@ -68,21 +76,21 @@ bool IsUnfortunate(const Outcome& outcome) {
 
 /// What is to blame; null when nothing is.
 Json FaultOf(const Outcome& outcome) {
-    if (outcome.machineAtFault)
-        return "machine";
-    return IsUnfortunate(outcome) ? Json("document") : Json();
+    if (!IsUnfortunate(outcome))
+        return {};
+    return outcome.fault->blame == Blame::Document ? "document" : "machine";
 }
 
 /// The outcome as a record of type "document".
 Json RecordOf(const Outcome& outcome) {
     Json record = {{"type", "document"}, {"input", outcome.input.u8string()}};
-    if (!ToText(outcome.input)) // JSON is text; this name is not, and must not be lost
+    if (!IsText(outcome.input)) // JSON is text; this name is not, and must not be lost
         record["inputBytes"] = HexOf(outcome.input.u8string());
     record["output"] = outcome.output.empty() ? Json() : Json(outcome.output.u8string());
     record["state"] = NameOf(outcome.state);
-    record["code"] = outcome.code;
+    record["code"] = CodeOf(outcome);
     record["text"] = JsonText(outcome.text);
-    record["reason"] = JsonText(outcome.reason);
+    record["reason"] = JsonText(ReasonOf(outcome));
     record["fault"] = FaultOf(outcome);
     record["fonts"] = RecordOf(outcome.fonts);
     record["seconds"] =
@@ -117,7 +125,9 @@ ExitCode Verdict(const std::vector<Outcome>& outcomes) {
     };
     if (any([](const Outcome& outcome) { return outcome.state == State::NotConverted; }))
         return ExitCode::Interrupted;
-    if (any([](const Outcome& outcome) { return outcome.machineAtFault; }))
+    if (any([](const Outcome& outcome) {
+            return IsUnfortunate(outcome) && outcome.fault->blame != Blame::Document;
+        }))
         return ExitCode::MachineAtFault;
     if (any(IsUnfortunate))
         return ExitCode::DocumentsAtFault;
@@ -153,11 +163,10 @@ ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
 
 std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
                                    Reporter& reporter) {
-    if (filters.Filters().empty()) {
-        reporter.Error(_("no filter could be loaded; `quillon status` shows where they are looked "
-                         "for. Install the program anew"));
-        return ExitCode::MachineAtFault;
-    }
+    if (filters.Filters().empty())
+        return reporter.Error({_("no filter could be loaded; `quillon status` shows where they are "
+                                 "looked for. Install the program anew"),
+                               Blame::Machine});
     if (inputs.empty()) {
         reporter.Line(_("Nothing to do: there are no files directly in what was named."));
         return ExitCode::Done;

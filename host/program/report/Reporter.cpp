@@ -40,10 +40,12 @@ void Reporter::Record(const Json& record) {
     Write(stdout, record.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n');
 }
 
-void Reporter::Error(const wxString& text) {
+ExitCode Reporter::Error(const Fault& fault) {
+    const wxString text = fault.Text();
     ClearPassing();
     Write(stderr, "quillon: " + OneLine(text).utf8_string() + '\n');
     Record({{"type", "error"}, {"text", JsonText(text)}});
+    return ExitCodeFor(fault);
 }
 
 std::string JsonText(const wxString& text) {

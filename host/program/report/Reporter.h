@@ -1,6 +1,6 @@
 #pragma once
 
-#include <wx/string.h>
+#include "host/program/base/Fault.h"
 
 #include <cstdio>
 #include <nlohmann/json.hpp>
@@ -27,7 +27,8 @@ public:
     void Record(const Json& record);
 
     /// Why the command ends early: for people on stderr in any case, and as a record.
-    void Error(const wxString& text);
+    /// @return the code to end with
+    ExitCode Error(const Fault& fault);
 
 private:
     void ClearPassing();
@@ -40,3 +41,12 @@ private:
 
 /// A text as JSON takes it.
 std::string JsonText(const wxString& text);
+
+/// @param texts of any container
+template <typename Texts>
+Json JsonTexts(const Texts& texts) {
+    Json list = Json::array();
+    for (const wxString& text : texts)
+        list.push_back(JsonText(text));
+    return list;
+}

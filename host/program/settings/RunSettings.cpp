@@ -17,18 +17,19 @@ bool IsKnown(const wxString& key) {
 }
 
 /// @return whether the text is a setting
-bool Apply(const std::string& assignment, Settings& settings, Obstacle& obstacle) {
-    const std::optional<wxString> text = ToText(FromArgument(assignment));
-    if (!text || text->find('=') == wxString::npos || text->StartsWith("=")) {
-        obstacle = {ExitCode::WrongUsage, wxString::Format(_("--set takes KEY=VALUE, not \"%s\""),
-                                                           Shown(FromArgument(assignment)))};
+bool Apply(const std::string& assignment, Settings& settings, Fault& fault) {
+    const wxString text = ToText(FromArgument(assignment));
+    if (text.find('=') == wxString::npos || text.StartsWith("=")) {
+        fault = {wxString::Format(_("--set takes KEY=VALUE, not \"%s\""),
+                                  Shown(FromArgument(assignment))),
+                 Blame::Usage};
         return false;
     }
-    const wxString key = text->BeforeFirst('=');
+    const wxString key = text.BeforeFirst('=');
     if (!IsKnown(key))
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "No filter is known to have a setting " << key << "; see quillon --help.";
-    settings.Set(key, text->AfterFirst('='));
+    settings.Set(key, text.AfterFirst('='));
     return true;
 }
 
@@ -40,7 +41,7 @@ wxString ListOf(const std::vector<wxString>& names) {
 }
 
 /// @return whether the settings name a printer that there is
-bool CheckPrinter(const Settings& settings, Obstacle& obstacle) {
+bool CheckPrinter(const Settings& settings, Fault& fault) {
     const wxString wanted = settings.Value("PRINTER");
     std::vector<wxString> names;
     for (const Printer& printer : ListPrinters())
@@ -48,12 +49,11 @@ bool CheckPrinter(const Settings& settings, Obstacle& obstacle) {
     if (std::find(names.begin(), names.end(), wanted) != names.end())
         return true;
     if (wanted.empty())
-        obstacle = {ExitCode::MachineAtFault,
-                    _("there is no PostScript printer; add one to the system")};
+        fault = {_("there is no PostScript printer; add one to the system"), Blame::Machine};
     else
-        obstacle = {ExitCode::WrongUsage,
-                    wxString::Format(_("there is no printer \"%s\"; the printers are: %s"), wanted,
-                                     ListOf(names))};
+        fault = {wxString::Format(_("there is no printer \"%s\"; the printers are: %s"), wanted,
+                                  ListOf(names)),
+                 Blame::Usage};
     return false;
 }
 
@@ -70,14 +70,14 @@ wxString FindProfile(const wxString& wanted, const std::vector<wxString>& names)
 }
 
 /// @return whether the settings name a profile that there is, or none
-bool CheckProfile(const Settings& settings, Obstacle& obstacle) {
+bool CheckProfile(const Settings& settings, Fault& fault) {
     const wxString wanted = settings.Value("SELECTEDDISTILLERPROFILE");
     const std::vector<wxString> names = ListDistillerProfiles();
     if (wanted.empty() || !FindProfile(wanted, names).empty())
         return true;
-    obstacle = {ExitCode::WrongUsage,
-                wxString::Format(_("there is no Distiller profile \"%s\"; the profiles are: %s"),
-                                 wanted, ListOf(names))};
+    fault = {wxString::Format(_("there is no Distiller profile \"%s\"; the profiles are: %s"),
+                              wanted, ListOf(names)),
+             Blame::Usage};
     return false;
 }
 
@@ -138,27 +138,28 @@ void FillIn(Settings& settings) {
         settings.Set("SELECTEDDISTILLERPROFILE", profile);
 }
 
-wxString UnusableSettings(const std::filesystem::path& file, const wxString& fault) {
-    return wxString::Format(_("the settings file %s cannot be used: %s"), Shown(file), fault);
+Fault UnusableSettings(const std::filesystem::path& file, const Fault& fault) {
+    return {
+        wxString::Format(_("the settings file %s cannot be used: %s"), Shown(file), fault.Text()),
+        Blame::Usage};
 }
 
-std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Obstacle& obstacle) {
+std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Fault& fault) {
     std::optional<Settings> settings = Settings();
     if (options.file) {
-        wxString fault;
         settings = Settings::Load(FromArgument(*options.file), fault);
         if (!settings)
-            obstacle = {ExitCode::WrongUsage, UnusableSettings(FromArgument(*options.file), fault)};
+            fault = UnusableSettings(FromArgument(*options.file), fault);
     }
     if (!settings)
         return std::nullopt;
     for (const std::string& assignment : options.assignments)
-        if (!Apply(assignment, *settings, obstacle))
+        if (!Apply(assignment, *settings, fault))
             return std::nullopt;
     ApplyOptions(options, *settings);
     FillIn(*settings);
     const bool takesProfile = options.profile || settings->Value("OUTPUTFILETYPEPS") != "1";
-    if (!CheckPrinter(*settings, obstacle) || (takesProfile && !CheckProfile(*settings, obstacle)))
+    if (!CheckPrinter(*settings, fault) || (takesProfile && !CheckProfile(*settings, fault)))
         return std::nullopt;
     return settings;
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/base/ExitCode.h"
+#include "host/program/base/Fault.h"
 #include "host/program/settings/Settings.h"
 
 #include <wx/string.h>
@@ -19,19 +19,13 @@ struct SettingsKey {
 
 const std::vector<SettingsKey>& KnownSettings();
 
-/// Why a run cannot begin.
-struct Obstacle {
-    ExitCode exitCode = ExitCode::WrongUsage;
-    wxString text;
-};
-
 /// Fills in what the settings do not say: PDF output on the preferred printer, if there is one,
 /// and the standard values. So a window shows what a conversion with these settings does. Completes
 /// the profile's name where a user has left out its ending.
 void FillIn(Settings& settings);
 
 /// What is said of a settings file that cannot be used.
-wxString UnusableSettings(const std::filesystem::path& file, const wxString& fault);
+Fault UnusableSettings(const std::filesystem::path& file, const Fault& fault);
 
 /// What a command line says of the settings. Texts and paths are as they were given.
 struct SettingsOptions {
@@ -44,5 +38,5 @@ struct SettingsOptions {
 
 /// Puts together the settings of a run: the file's, the command line's in their place, and what
 /// FillIn adds.
-/// @param obstacle receives why there is no result
-std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Obstacle& obstacle);
+/// @param fault receives why there is no result
+std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Fault& fault);

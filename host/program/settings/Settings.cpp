@@ -41,21 +41,25 @@ wxString FindFaultOf(const fs::file_status& status) {
     return fs::is_regular_file(status) ? wxString() : _("it is a device or a pipe, not a file");
 }
 
-std::optional<std::string> ReadBounded(const fs::path& file, wxString& fault) {
+Fault Unusable(const wxString& what) {
+    return {what, Blame::Usage};
+}
+
+std::optional<std::string> ReadBounded(const fs::path& file, Fault& fault) {
     std::error_code error;
-    fault = FindFaultOf(fs::status(file, error));
-    if (!fault.empty())
+    fault = Unusable(FindFaultOf(fs::status(file, error)));
+    if (!fault.what.empty())
         return std::nullopt;
     const std::uintmax_t size = fs::file_size(file, error);
     if (!error && size > LargestFile) {
-        fault = wxString::Format(_("it is larger than %ju KiB, too much for settings"),
-                                 LargestFile / 1024);
+        fault = Unusable(wxString::Format(_("it is larger than %ju KiB, too much for settings"),
+                                          LargestFile / 1024));
         return std::nullopt;
     }
     std::string bytes(error ? 0 : size, '\0');
     std::ifstream stream(file, std::ios::binary);
     if (!stream.read(bytes.data(), static_cast<std::streamsize>(bytes.size()))) {
-        fault = _("it cannot be read");
+        fault = Unusable(_("it cannot be read"));
         return std::nullopt;
     }
     return bytes;
@@ -101,42 +105,41 @@ Settings::Settings(std::unique_ptr<wxXmlDocument> document, bool keepsLayout)
     : m_document(std::move(document)), m_keepsLayout(keepsLayout),
       m_ui(FindUi(*m_document->GetDocumentNode())) {}
 
-std::optional<Settings> Settings::Parse(const std::string& bytes, bool keepLayout,
-                                        wxString& fault) {
-    fault = FindXmlFault(bytes, DeepestNesting);
-    if (!fault.empty())
+std::optional<Settings> Settings::Parse(const std::string& bytes, bool keepLayout, Fault& fault) {
+    fault = Unusable(FindXmlFault(bytes, DeepestNesting));
+    if (!fault.what.empty())
         return std::nullopt;
     const wxLogNull quiet; // the text has been checked, and the check's message is the better one
     wxMemoryInputStream stream(bytes.data(), bytes.size());
     auto document = std::make_unique<wxXmlDocument>();
     if (!document->Load(stream, "UTF-8",
                         keepLayout ? wxXMLDOC_KEEP_WHITESPACE_NODES : wxXMLDOC_NONE)) {
-        fault = _("its encoding is not known");
+        fault = Unusable(_("its encoding is not known"));
         return std::nullopt;
     }
     return Settings(std::move(document), keepLayout);
 }
 
-std::optional<Settings> Settings::FromXml(const std::string& bytes, wxString& fault) {
+std::optional<Settings> Settings::FromXml(const std::string& bytes, Fault& fault) {
     std::optional<Settings> settings = Parse(bytes, false, fault);
     if (settings && !settings->m_ui) {
-        fault = _("it has no element \"UI\" with settings in it");
+        fault = Unusable(_("it has no element \"UI\" with settings in it"));
         return std::nullopt;
     }
     return settings;
 }
 
-std::optional<Settings> Settings::Load(const fs::path& file, wxString& fault) {
+std::optional<Settings> Settings::Load(const fs::path& file, Fault& fault) {
     const std::optional<std::string> bytes = ReadBounded(file, fault);
     return bytes ? FromXml(*bytes, fault) : std::nullopt;
 }
 
-std::optional<Settings> Settings::LoadForEditing(const fs::path& file, wxString& fault) {
+std::optional<Settings> Settings::LoadForEditing(const fs::path& file, Fault& fault) {
     std::error_code ignored;
     if (!fs::exists(file, ignored)) {
         if (fs::is_directory(fs::absolute(file, ignored).parent_path(), ignored))
             return Settings();
-        fault = _("its folder does not exist; create that first");
+        fault = Unusable(_("its folder does not exist; create that first"));
         return std::nullopt;
     }
     const std::optional<std::string> bytes = ReadBounded(file, fault);

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "host/program/base/Fault.h"
+
 #include <wx/xml/xml.h>
 
 #include <filesystem>
@@ -14,17 +16,16 @@ public:
     Settings();
 
     /// Reads a settings file, which must hold an element "UI" anywhere.
-    /// @param fault receives why there is no result, for people, naming line numbers of the file
-    static std::optional<Settings> Load(const std::filesystem::path& file, wxString& fault);
+    /// @param fault receives why there is no result, naming line numbers of the file
+    static std::optional<Settings> Load(const std::filesystem::path& file, Fault& fault);
 
     /// Reads a settings file with its comments and its layout. Where the file, or the element "UI"
     /// in it, is missing, there are no settings yet; the folder must be there.
     /// @param fault receives why there is no result, as above
-    static std::optional<Settings> LoadForEditing(const std::filesystem::path& file,
-                                                  wxString& fault);
+    static std::optional<Settings> LoadForEditing(const std::filesystem::path& file, Fault& fault);
 
     /// Reads what Xml gave.
-    static std::optional<Settings> FromXml(const std::string& bytes, wxString& fault);
+    static std::optional<Settings> FromXml(const std::string& bytes, Fault& fault);
 
     /// The whole document in UTF-8.
     std::string Xml() const;
@@ -41,8 +42,7 @@ public:
 private:
     Settings(std::unique_ptr<wxXmlDocument> document, bool keepsLayout);
 
-    static std::optional<Settings> Parse(const std::string& bytes, bool keepLayout,
-                                         wxString& fault);
+    static std::optional<Settings> Parse(const std::string& bytes, bool keepLayout, Fault& fault);
     void MakeUi();
     void Append(wxXmlNode* setting);
 

@@ -14,53 +14,56 @@ namespace fs = std::filesystem;
 
 namespace {
 
-wxString LastFault() {
+wxString LastError() {
     return Because({errno, std::generic_category()});
 }
 
 /// Writes a new file, down to the disk.
+/// @return why it is not there; empty when it is
 wxString WriteNew(const fs::path& path, const std::string& bytes) {
     errno = 0;
     wxFile file;
-    if (!file.Create(ToText(path).value_or(wxString()), false) ||
+    if (!file.Create(ToText(path), false) ||
         file.Write(bytes.data(), bytes.size()) != bytes.size() || !file.Flush() || !file.Close())
-        return LastFault();
+        return LastError();
     return {};
 }
 
 wxString Replace(const fs::path& file, const std::string& bytes) {
     std::error_code error;
     const bool exists = fs::exists(file, error);
-    if (exists && !wxFileName::IsFileWritable(ToText(file).value_or(wxString())))
+    if (exists && !wxFileName::IsFileWritable(ToText(file)))
         return _("it is write-protected");
     const fs::path newFile =
         file.parent_path() / FromText(wxString::Format(".quillon-settings-%lu", wxGetProcessId()));
-    wxString fault = WriteNew(newFile, bytes);
-    if (fault.empty() && exists)
+    wxString obstacle = WriteNew(newFile, bytes);
+    if (obstacle.empty() && exists)
         fs::permissions(newFile, fs::status(file, error).permissions(), error);
-    if (fault.empty()) {
+    if (obstacle.empty()) {
         fs::rename(newFile, file, error);
         if (error)
-            fault = Because(error);
+            obstacle = Because(error);
     }
-    if (!fault.empty())
+    if (!obstacle.empty())
         fs::remove(newFile, error);
-    return fault;
+    return obstacle;
 }
 
 } // namespace
 
-wxString StoreSettings(const fs::path& file, const SettingsValues& values) {
+std::optional<Fault> StoreSettings(const fs::path& file, const SettingsValues& values) {
     // A link stays one: it is its file that is written.
     std::error_code error;
     const fs::path target = fs::weakly_canonical(fs::absolute(file, error), error);
-    wxString fault;
-    std::optional<Settings> settings =
-        error ? std::nullopt : Settings::LoadForEditing(target, fault);
+    if (error)
+        return Fault{Because(error), Blame::Machine};
+    Fault fault;
+    std::optional<Settings> settings = Settings::LoadForEditing(target, fault);
     if (!settings)
-        return error ? Because(error) : fault;
+        return fault;
     for (const auto& [key, value] : values)
         if (settings->Value(key) != value || value.empty())
             settings->Set(key, value);
-    return Replace(target, settings->Xml());
+    const wxString obstacle = Replace(target, settings->Xml());
+    return obstacle.empty() ? std::nullopt : std::optional(Fault{obstacle, Blame::Machine});
 }

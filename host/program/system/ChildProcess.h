@@ -1,28 +1,21 @@
 #pragma once
 
+#include "host/program/base/Fault.h"
 #include "host/program/system/LineChannel.h"
-
-#include <wx/string.h>
 
 #include <cstdint>
 #include <memory>
 #include <string>
 #include <vector>
 
-/// How a process came to its end.
-struct ProcessEnd {
-    wxString text;            ///< for people
-    bool fromOutside = false; ///< by somebody who wanted it to
-};
-
 /// Another process of this program, which is talked to by its stdin and stdout. It shares this
 /// one's stderr, and does not outlive this one.
 class ChildProcess {
 public:
     /// @param arguments UTF-8, without the program's name
-    /// @param fault receives why there is none, for people
+    /// @param fault receives why there is none
     static std::unique_ptr<ChildProcess> Start(const std::vector<std::string>& arguments,
-                                               wxString& fault);
+                                               Fault& fault);
 
     /// Ends the process, if it has not ended, and waits for it. Nobody may read any more.
     ~ChildProcess();
@@ -35,7 +28,8 @@ public:
     void Kill() const;
 
     /// Waits for the end.
-    ProcessEnd Wait();
+    /// @return what the process has done, as a fault of the document that it had
+    Fault Wait();
 
 private:
     ChildProcess(std::intptr_t process, LineChannel channel)

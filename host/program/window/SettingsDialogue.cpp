@@ -86,21 +86,21 @@ void SettingsDialogue::SizePanels() {
 
 /// Says why the panels, or controls of theirs, are greyed out for good, if they are.
 void SettingsDialogue::ExplainObstacle() {
-    const wxString obstacle = PanelObstacle();
+    const std::optional<Fault> obstacle = FindMissingForPanel();
     wxString text;
-    if (!obstacle.empty())
-        text = wxString::Format(_("These settings cannot be changed: %s."), obstacle);
+    if (obstacle)
+        text = wxString::Format(_("These settings cannot be changed: %s."), obstacle->Text());
     else
         text = Explain(ControlId::HighQuality, FindMissingFor("pptx")) +
                Explain(ControlId::OutputPDF, FindMissingPdfMaker());
     if (!text.empty())
         m_obstacle->Say(text.Trim(), m_area->GetMinWidth());
-    FindWindow(ButtonId::Restore)->Enable(obstacle.empty());
+    FindWindow(ButtonId::Restore)->Enable(!obstacle);
 }
 
 /// @param missing what a control needs
 /// @return a sentence and a space; nothing when the control can be used
-wxString SettingsDialogue::Explain(int id, const std::optional<MissingPart>& missing) const {
+wxString SettingsDialogue::Explain(int id, const std::optional<Fault>& missing) const {
     const auto* const control = dynamic_cast<const wxControl*>(m_area->FindWindow(id));
     return control && !control->IsEnabled() && missing
                ? wxString::Format(_("\"%s\" cannot be chosen: %s."), control->GetLabelText(),
@@ -146,11 +146,11 @@ void SettingsDialogue::OnSave(wxCommandEvent& /*event*/) {
         values.merge(filter->PanelValues());
     for (const PanelChoices& choices : m_choices)
         choices.Correct(values);
-    const wxString fault = StoreSettings(m_file, values);
-    if (fault.empty())
+    const std::optional<Fault> fault = StoreSettings(m_file, values);
+    if (!fault)
         return EndModal(wxID_SAVE);
     m_fault->Say(wxString::Format(_("The settings are not saved. %s cannot be written: %s."),
-                                  Shown(m_file), fault),
+                                  Shown(m_file), fault->Text()),
                  GetClientSize().x);
     FitToFault();
 }

@@ -36,7 +36,7 @@ private:
     void ShowPanels(const Settings& settings);
     void SizePanels();
     void ExplainObstacle();
-    wxString Explain(int id, const std::optional<MissingPart>& missing) const;
+    wxString Explain(int id, const std::optional<Fault>& missing) const;
     wxSizer* NewButtons();
     void FitToFault();
 

@@ -51,7 +51,7 @@ wxString Quoted(const wxString& word) {
 }
 
 wxString CommandLineFor(const std::vector<std::string>& arguments) {
-    wxString line = Quoted(ToText(ProgramFile()).value_or(wxString()));
+    wxString line = Quoted(ToText(ProgramFile()));
     for (const std::string& argument : arguments)
         line << ' ' << Quoted(wxString::FromUTF8(argument));
     return line;
@@ -128,13 +128,14 @@ HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
 } // namespace
 
 std::unique_ptr<ChildProcess> ChildProcess::Start(const std::vector<std::string>& arguments,
-                                                  wxString& fault) {
+                                                  Fault& fault) {
     Pipe down;
     Pipe up;
     HANDLE process =
         down.Open() && up.Open() ? Spawn(arguments, down.from.get(), up.to.get()) : nullptr;
     if (!process) {
-        fault = Because({static_cast<int>(GetLastError()), std::system_category()});
+        fault = {Because({static_cast<int>(GetLastError()), std::system_category()}),
+                 Blame::Machine};
         return nullptr;
     }
     LineChannel channel(Pipe::Stream(up.from, "rb"), Pipe::Stream(down.to, "wb"));
@@ -152,7 +153,7 @@ void ChildProcess::Kill() const {
         TerminateProcess(reinterpret_cast<HANDLE>(m_process), 1);
 }
 
-ProcessEnd ChildProcess::Wait() {
+Fault ChildProcess::Wait() {
     constexpr DWORD EndedByTaskManager = 1; // and by taskkill; this program never ends so itself
     DWORD code = 0;
     if (m_process != None) {
@@ -162,7 +163,8 @@ ProcessEnd ChildProcess::Wait() {
         CloseHandle(process);
         m_process = None;
     }
-    return {wxString::Format("ended with exit code %lu", code), code == EndedByTaskManager};
+    return {wxString::Format("ended with exit code %lu", code),
+            code == EndedByTaskManager ? Blame::Outside : Blame::Document};
 }
 
 LineChannel TakeStandardStreams() {

@@ -30,11 +30,13 @@ int NumberOf(const json& value) {
     return static_cast<int>(number);
 }
 
-State StateOf(const json& value) {
+/// @param last of the enumeration's values, which begin with 0
+template <typename Enumeration>
+Enumeration ValueOf(const json& value, Enumeration last) {
     const int number = NumberOf(value);
-    if (number < 0 || number > static_cast<int>(State::NotConverted))
-        throw std::invalid_argument("no state");
-    return static_cast<State>(number);
+    if (number < 0 || number > static_cast<int>(last))
+        throw std::invalid_argument("no such value");
+    return static_cast<Enumeration>(number);
 }
 
 wxString TextOf(const json& value) {
@@ -53,14 +55,19 @@ json ToJson(const std::vector<FontStandIn>& fonts) {
     return values;
 }
 
+json ToJson(const Fault& fault) {
+    return {{"what", fault.what.utf8_string()},
+            {"blame", static_cast<int>(fault.blame)},
+            {"code", fault.code},
+            {"advice", fault.advice.utf8_string()}};
+}
+
 json ToJson(const Outcome& outcome) {
     return {{"input", outcome.input.u8string()},
             {"output", outcome.output.u8string()},
             {"state", static_cast<int>(outcome.state)},
-            {"code", outcome.code},
+            {"fault", outcome.fault ? ToJson(*outcome.fault) : json()},
             {"text", outcome.text.utf8_string()},
-            {"reason", outcome.reason.utf8_string()},
-            {"machineAtFault", outcome.machineAtFault},
             {"seconds", outcome.seconds.value_or(0)},
             {"fonts", ToJson(outcome.fonts)}};
 }
@@ -72,15 +79,19 @@ std::vector<FontStandIn> FontsOf(const json& values) {
     return fonts;
 }
 
+Fault FaultOf(const json& value) {
+    return {TextOf(value.at("what")), ValueOf(value.at("blame"), Blame::Usage),
+            NumberOf(value.at("code")), TextOf(value.at("advice"))};
+}
+
 Outcome OutcomeOf(const json& value) {
     Outcome outcome;
     outcome.input = PathOf(value.at("input"));
     outcome.output = PathOf(value.at("output"));
-    outcome.state = StateOf(value.at("state"));
-    outcome.code = NumberOf(value.at("code"));
+    outcome.state = ValueOf(value.at("state"), State::NotConverted);
+    if (const json& fault = value.at("fault"); !fault.is_null())
+        outcome.fault = FaultOf(fault);
     outcome.text = TextOf(value.at("text"));
-    outcome.reason = TextOf(value.at("reason"));
-    outcome.machineAtFault = value.at("machineAtFault");
     outcome.seconds = value.at("seconds").get<double>();
     outcome.fonts = FontsOf(value.at("fonts"));
     return outcome;

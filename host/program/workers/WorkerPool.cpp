@@ -82,10 +82,11 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
     Worker& worker = m_workers[number];
     if (worker.process)
         return true;
-    wxString fault;
+    Fault fault;
     worker.process = ChildProcess::Start(m_arguments, fault);
     if (!worker.process) {
-        Fail(number, wxString::Format(_("no process could be started for it: %s"), fault), true);
+        fault.what = wxString::Format(_("no process could be started for it: %s"), fault.what);
+        Fail(number, fault);
         return false;
     }
     worker.proven = false;
@@ -125,26 +126,27 @@ void WorkerPool::OnEnd(std::size_t number) {
     Worker& worker = m_workers[number];
     worker.reader.join();
     worker.process->Kill(); // it may only have closed its side
-    const ProcessEnd end = worker.process->Wait();
+    Fault end = worker.process->Wait();
     worker.process.reset();
     SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-        << "A worker has " << end.text << (worker.assignment ? " with a document under way" : "");
+        << "A worker has " << end.what << (worker.assignment ? " with a document under way" : "");
     Workplace::RemoveAbandoned(m_facts.outputFolder);
     if (!worker.assignment)
         return;
-    const bool fromOutside = end.fromOutside && !worker.ending;
+    if (worker.ending)
+        end = {worker.ending};
+    const bool fromOutside = end.blame == Blame::Outside;
     if (worker.proven && !worker.begun) { // it ended before the document reached it
         Assign(number, *worker.assignment);
     } else if (fromOutside && !worker.triedAgain) {
         worker.triedAgain = true;
         Assign(number, *worker.assignment);
     } else {
-        const wxString reason =
-            wxString::Format(_("the process that converted it %s"),
-                             TranslateReason(worker.ending ? wxString(worker.ending) : end.text));
-        Fail(number,
-             fromOutside ? wxString::Format(_("%s, at the second try too"), reason) : reason,
-             fromOutside);
+        end.what =
+            wxString::Format(_("the process that converted it %s"), TranslateReason(end.what));
+        if (fromOutside)
+            end.what = wxString::Format(_("%s, at the second try too"), end.what);
+        Fail(number, end);
     }
     GiveWork(number);
 }
@@ -166,14 +168,10 @@ void WorkerPool::End(Worker& worker, const char* reason) {
     worker.process->Kill();
 }
 
-void WorkerPool::Fail(std::size_t number, const wxString& reason, bool machineAtFault) {
+void WorkerPool::Fail(std::size_t number, const Fault& fault) {
     Outcome outcome;
     outcome.input = (*m_assignments)[*m_workers[number].assignment].input.given;
-    outcome.state = State::Failed;
-    outcome.code = ConversionFailed;
-    outcome.text = m_filters.ErrorText(ConversionFailed);
-    outcome.reason = reason;
-    outcome.machineAtFault = machineAtFault;
+    outcome.End(State::Failed, fault, m_filters.ErrorText(fault.code));
     Finish(number, std::move(outcome));
 }
 

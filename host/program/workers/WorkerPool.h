@@ -60,7 +60,7 @@ private:
     void OnEnd(std::size_t number);
     void Finish(std::size_t number, Outcome outcome);
     static void End(Worker& worker, const char* reason);
-    void Fail(std::size_t number, const wxString& reason, bool machineAtFault);
+    void Fail(std::size_t number, const Fault& fault);
     void ShowProgress(Worker& worker, const News& news);
     void EndTheSilent();
     bool IsAnyBusy() const;

@@ -60,7 +60,7 @@ protected:
     /// Converts a document whose output has a companion.
     Outcome Convert() const {
         const fs::path document = m_folder.Write("a.doc", "companion=.log");
-        wxString fault;
+        Fault fault;
         const FilterSet filters(TEST_FILTERS);
         RecordingProgress progress;
         return ConvertInput({document, document}, "a", filters,
@@ -71,9 +71,9 @@ protected:
 };
 
 TEST_F(WorkplaceTest, OnesThatNobodyHasAreRemovedAndNothingElse) {
-    wxString fault;
+    Fault fault;
     const auto used = Workplace::Create(Out(), fault);
-    ASSERT_TRUE(used) << fault;
+    ASSERT_TRUE(used) << fault.what;
     const fs::path gone[] = {Make(".quillon-1-1", "in use", 0h), Make(".quillon-1-2", "", 2h)};
     const fs::path target = Make("target", "in use", 2h);
     fs::create_directory_symlink(target, Out() / ".quillon-1-4");
@@ -105,13 +105,13 @@ TEST_F(WorkplaceTest, AnOutputThatIsNotOnTheDiskIsAFailure) {
         g_disk = {error, 0};
         const Outcome notWritten = Convert();
         EXPECT_EQ(notWritten.state, State::Failed);
-        EXPECT_THAT(notWritten.reason.utf8_string(), EndsWith(strerror(error)));
+        EXPECT_THAT(notWritten.fault->what.utf8_string(), EndsWith(strerror(error)));
         EXPECT_TRUE(fs::is_empty(Out()));
     }
     g_disk = {0, EIO};
     const Outcome notListed = Convert();
     EXPECT_EQ(notListed.state, State::Failed);
-    EXPECT_THAT(notListed.reason.utf8_string(), HasSubstr("may be lost if the power fails"));
+    EXPECT_THAT(notListed.fault->what.utf8_string(), HasSubstr("may be lost if the power fails"));
 }
 
 TEST_F(WorkplaceTest, ADiskThatCannotBeAskedIsTakenAtItsWord) {

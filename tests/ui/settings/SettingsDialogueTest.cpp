@@ -14,9 +14,9 @@ class SettingsDialogueTest : public SettingsWindow {
 protected:
     /// The settings of the file by key.
     std::string Value(const wxString& key) const {
-        wxString fault;
+        Fault fault;
         const std::optional<Settings> settings = Settings::Load(m_file, fault);
-        EXPECT_TRUE(settings) << fault;
+        EXPECT_TRUE(settings) << fault.what;
         return settings ? settings->Value(key).utf8_string() : "";
     }
 
@@ -174,7 +174,7 @@ TEST_F(SettingsDialogueTest, SaysWhyItIsGreyedOutAsStatusDoes) {
     m_office.reset();
     Open([this] {
         EXPECT_FALSE(Find(ControlId::Printer)->IsEnabled());
-        EXPECT_TRUE(Said().Contains(WithoutSpaces(PanelObstacle()))) << Said();
+        EXPECT_TRUE(Said().Contains(WithoutSpaces(FindMissingForPanel()->Text()))) << Said();
         EXPECT_FALSE(Find(ButtonId::Restore)->IsEnabled());
     });
 }

@@ -14,7 +14,7 @@ const char* const Head = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n";
 class SettingsFileTest : public testing::Test {
 protected:
     std::string Store(const SettingsValues& values) const {
-        EXPECT_EQ(StoreSettings(m_file, values), "");
+        EXPECT_FALSE(StoreSettings(m_file, values));
         return ReadBytes(m_file);
     }
 
@@ -66,16 +66,17 @@ TEST_F(SettingsFileTest, AnyTextComesBack) {
 TEST_F(SettingsFileTest, AFileThatCannotBeReplacedStaysWhole) {
     const std::string broken = "<UI><COLOR>";
     m_folder.Write("job.xml", broken);
-    EXPECT_NE(StoreSettings(m_file, {{"COLOR", "new"}}), "") << "somebody may want to mend it";
+    EXPECT_TRUE(StoreSettings(m_file, {{"COLOR", "new"}})) << "somebody may want to mend it";
     EXPECT_EQ(ReadBytes(m_file), broken);
 
     fs::create_directory(m_folder / "folder");
     for (const auto& [name, reason] :
          {std::pair("none/job.xml", "its folder does not exist"), {"folder", "it is a folder"}}) {
-        EXPECT_TRUE(StoreSettings(m_folder / name, {{"COLOR", "new"}}).StartsWith(reason));
-        wxString fault; // and one is told before the work begins
+        const auto notStored = StoreSettings(m_folder / name, {{"COLOR", "new"}});
+        EXPECT_TRUE(notStored && notStored->what.StartsWith(reason));
+        Fault fault; // and one is told before the work begins
         EXPECT_FALSE(Settings::LoadForEditing(m_folder / name, fault));
-        EXPECT_TRUE(fault.StartsWith(reason)) << fault;
+        EXPECT_TRUE(fault.what.StartsWith(reason)) << fault.what;
     }
     EXPECT_EQ(FilesBeside(), 2U) << "no temporary file";
 }

@@ -47,9 +47,9 @@ void SettingsWindow::Speak(const wxString& language) {
 
 int SettingsWindow::Open(const std::function<void()>& user) {
     const FilterSet filters(QUILLON_FILTERS);
-    wxString fault;
+    Fault fault;
     std::optional<Settings> settings = Settings::LoadForEditing(m_file, fault);
-    EXPECT_TRUE(settings) << fault;
+    EXPECT_TRUE(settings) << fault.what;
     if (!settings)
         return wxID_NONE;
     FillIn(*settings);

@@ -1,4 +1,4 @@
-#include "tests/host/Process.h"
+#include "tests/host/Program.h"
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
@@ -9,8 +9,9 @@
 #include <csignal>
 #include <fstream>
 
-Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
-                 const std::filesystem::path& err) {
+RunningProgram::RunningProgram(const std::vector<std::string>& command) {
+    const std::filesystem::path out = m_folder / "out";
+    const std::filesystem::path err = m_folder / "err";
     std::vector<char*> arguments;
     arguments.reserve(command.size() + 1);
     for (const std::string& argument : command)
@@ -31,22 +32,22 @@ Process::Process(const std::vector<std::string>& command, const std::filesystem:
     m_process = error == 0 ? process : None;
 }
 
-Process::~Process() {
+RunningProgram::~RunningProgram() {
     if (m_process == None)
         return;
     kill(static_cast<pid_t>(m_process), SIGKILL);
     waitpid(static_cast<pid_t>(m_process), nullptr, 0);
 }
 
-void Process::Interrupt() const {
+void RunningProgram::Interrupt() const {
     kill(static_cast<pid_t>(m_process), SIGINT);
 }
 
-void Process::Terminate() const {
+void RunningProgram::Terminate() const {
     kill(static_cast<pid_t>(m_process), SIGTERM);
 }
 
-int Process::Wait() {
+int RunningProgram::ExitCode() {
     int status = 0;
     waitpid(static_cast<pid_t>(m_process), &status, 0);
     m_process = None;

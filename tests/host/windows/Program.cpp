@@ -1,4 +1,4 @@
-#include "tests/host/Process.h"
+#include "tests/host/Program.h"
 
 #include "tests/support/Wine.h"
 
@@ -59,8 +59,9 @@ void Send(DWORD event, std::intptr_t process) {
 
 } // namespace
 
-Process::Process(const std::vector<std::string>& command, const std::filesystem::path& out,
-                 const std::filesystem::path& err) {
+RunningProgram::RunningProgram(const std::vector<std::string>& command) {
+    const std::filesystem::path out = m_folder / "out";
+    const std::filesystem::path err = m_folder / "err";
     std::wstring commandLine;
     for (const std::string& argument : command)
         commandLine += Quoted(wxString::FromUTF8(argument).ToStdWstring()) + L' ';
@@ -82,7 +83,7 @@ Process::Process(const std::vector<std::string>& command, const std::filesystem:
         CloseHandle(file);
 }
 
-Process::~Process() {
+RunningProgram::~RunningProgram() {
     if (m_process == None)
         return;
     TerminateProcess(HandleOf(m_process), 1);
@@ -90,15 +91,15 @@ Process::~Process() {
     CloseHandle(HandleOf(m_process));
 }
 
-void Process::Interrupt() const {
+void RunningProgram::Interrupt() const {
     Send(CTRL_C_EVENT, m_process);
 }
 
-void Process::Terminate() const {
+void RunningProgram::Terminate() const {
     Send(RunsOnWine() ? CTRL_C_EVENT : CTRL_BREAK_EVENT, m_process); // Wine lacks the other
 }
 
-int Process::Wait() {
+int RunningProgram::ExitCode() {
     if (m_process == None)
         return -1;
     DWORD exitCode = 0;

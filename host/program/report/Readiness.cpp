@@ -1,0 +1,68 @@
+#include "host/program/report/Readiness.h"
+
+#include "host/program/machine/MissingParts.h"
+
+#include <wx/intl.h>
+
+namespace {
+
+Fault Obstacle(const wxString& what, const wxString& advice = {}) {
+    return {what, Blame::Machine, ConversionFailed, advice};
+}
+
+/// The extensions of the files that a filter is ready for and the machine can print.
+wxArrayString ListConvertible(const FilterSet& filters) {
+    wxArrayString extensions;
+    for (const auto& filter : filters.Filters())
+        for (const wxString& extension : filter->Extensions())
+            if (filter->IsReady() && !FindMissingFor(extension))
+                extensions.Add(extension);
+    return extensions;
+}
+
+/// Why there is nothing that could be converted.
+std::vector<Fault> FindObstacles(const FilterSet& filters) {
+    std::vector<Fault> obstacles;
+    if (filters.Filters().empty())
+        obstacles.push_back(Obstacle(_("There is no filter"), _("Install the program anew")));
+    for (const auto& part : {FindMissingOffice(), FindMissingPrinter()})
+        if (part)
+            obstacles.push_back(*part);
+    if (!obstacles.empty())
+        return obstacles;
+    for (const auto& filter : filters.Filters()) {
+        const wxString& name = filter->Info().identifier;
+        obstacles.push_back(Obstacle(
+            filter->IsReady()
+                ? wxString::Format(_("The filter %s has no use for what is installed"), name)
+                : wxString::Format(_("The filter %s is not ready: %s"), name,
+                                   filter->Unreadiness())));
+    }
+    return obstacles;
+}
+
+} // namespace
+
+ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter) {
+    const wxArrayString convertible = ListConvertible(filters);
+    std::vector<Fault> missing;
+    if (convertible.empty())
+        missing = FindObstacles(filters);
+    if (const auto pdfMaker = FindMissingPdfMaker())
+        missing.push_back(*pdfMaker);
+    if (const auto isolation = FindMissingIsolation(); isolation && requireIsolation)
+        missing.push_back(*isolation);
+    for (const Fault& part : missing) {
+        reporter.Line(wxString::Format(_("Missing: %s"), part.Text()));
+        reporter.Record({{"type", "missing"},
+                         {"text", JsonText(part.what)},
+                         {"advice", JsonText(part.advice)}});
+    }
+    const ExitCode exitCode = missing.empty() ? ExitCode::Done : ExitCode::MachineAtFault;
+    if (missing.empty())
+        reporter.Line(wxString::Format(_("Ready to convert %s."), wxJoin(convertible, ' ', 0)));
+    reporter.Record({{"type", "summary"},
+                     {"convertible", JsonTexts(convertible)},
+                     {"exitCode", static_cast<int>(exitCode)}});
+    return exitCode;
+}
