@@ -38,7 +38,7 @@ std::optional<Fault> StartLanguage(const CommonOptions& options) {
 /// @return why the command may open no documents
 std::optional<Fault> CheckIsolation(const CommonOptions& options) {
     if (options.requireIsolation)
-        if (const std::optional<Fault> missing = FindMissingIsolation())
+        if (std::optional<Fault> missing = FindMissingIsolation())
             return missing;
     const std::optional<EngineIsolation> isolation = IsolationOfEngines();
     if (isolation && !isolation->missing.empty())

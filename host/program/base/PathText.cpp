@@ -8,7 +8,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-bool IsSurrogate(wchar_t c) {
+bool IsSurrogate(wxUniChar c) {
     return c >= 0xD800 && c <= 0xDFFF;
 }
 
@@ -42,9 +42,8 @@ wxString ToText(const fs::path& path) {
     const wxString text = wxString::FromUTF8(path.u8string());
     // Three bytes can spell half a surrogate pair, which the conversion above lets through where
     // a wchar_t has 32 bits; UTF-8 has no such letters.
-    const std::wstring wide = text.ToStdWstring();
     const bool hasHalves =
-        sizeof(wchar_t) == 4 && std::any_of(wide.begin(), wide.end(), IsSurrogate);
+        sizeof(wchar_t) == 4 && std::any_of(text.begin(), text.end(), IsSurrogate);
     return hasHalves ? wxString() : text;
 }
 

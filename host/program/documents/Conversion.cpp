@@ -77,7 +77,7 @@ std::optional<Fault> Convert(const ScreenedInput& screened, const wxString& base
     std::error_code error;
     if (!fs::is_regular_file(workplace->Path() / FromText(outputName), error))
         return Fault{_("the filter reported success"), Blame::Document, Result::OutputFileNotFound};
-    if (const std::optional<Fault> lost = DeliverAll(*workplace, outputName, baseName))
+    if (std::optional<Fault> lost = DeliverAll(*workplace, outputName, baseName))
         return lost;
     outcome.state = State::Converted;
     outcome.output =

@@ -26,7 +26,7 @@ void Refuse(const FilterSet& filters, const Fault& fault, Outcome& outcome) {
 Fault RefusalFor(const FilterAnswer& answer, const Input& input) {
     if (IsMachineCode(answer.code))
         return {MachineReason(ExtensionOf(input)), Blame::Machine, answer.code};
-    const Fault failure = answer.failure.value_or(Fault());
+    Fault failure = answer.failure.value_or(Fault());
     if (failure.blame != Blame::Document) // whatever the document is
         return failure;
     if (answer.code == Result::InvalidInputFile)
