@@ -2,7 +2,7 @@
 
 #include "standins/confinement/CallFilter.h"
 #include "standins/confinement/FileRules.h"
-#include "standins/process/Isolation.h"
+#include "standins/shared/Isolation.h"
 
 #include <linux/capability.h>
 #include <sys/prctl.h>

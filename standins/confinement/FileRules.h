@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/process/Descriptor.h"
+#include "standins/shared/Descriptor.h"
 
 #include <cstdint>
 #include <string>

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "standins/process/Clocks.h"
+#include "standins/shared/Clocks.h"
 
 #include <cstdint>
 

@@ -1,4 +1,4 @@
-#include "standins/module/SupervisedRun.h"
+#include "standins/inprocess/SupervisedRun.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/Packages.h"
 #include "tests/standins/Viewers.h"

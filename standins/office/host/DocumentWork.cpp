@@ -1,10 +1,10 @@
 #include "standins/office/host/DocumentWork.h"
 
-#include "standins/office/FontUseFile.h"
 #include "standins/office/host/LoadedDocument.h"
+#include "standins/office/shared/TextLibraryNames.h"
 #include "standins/office/text/DocumentPath.h"
 #include "standins/office/text/FontUse.h"
-#include "standins/process/DefaultSignals.h"
+#include "standins/shared/DefaultSignals.h"
 
 #include <fcntl.h>
 #include <sys/prctl.h>

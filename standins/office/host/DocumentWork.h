@@ -1,8 +1,8 @@
 #pragma once
 
 #include "standins/confinement/Confinement.h"
-#include "standins/office/HostOrder.h"
-#include "standins/process/Descriptor.h"
+#include "standins/office/shared/HostOrder.h"
+#include "standins/shared/Descriptor.h"
 
 #include <sys/types.h>
 

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "standins/confinement/Confinement.h"
-#include "standins/office/HostOrder.h"
-#include "standins/process/Channel.h"
+#include "standins/office/shared/HostOrder.h"
+#include "standins/shared/Channel.h"
 
 #include <sys/types.h>
 

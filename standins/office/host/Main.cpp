@@ -2,9 +2,9 @@
 // fork a child for each. The supervisor gives it a channel as descriptor 3.
 //   office-host PROGRAM FONTS…    LibreOffice's program folder, folders of fonts
 
-#include "standins/office/OfficeReach.h"
 #include "standins/office/host/ForkServer.h"
 #include "standins/office/host/HostedOffice.h"
+#include "standins/office/shared/OfficeReach.h"
 
 #include <cstdlib>
 #include <exception>

@@ -1,11 +1,10 @@
 #include "standins/office/printer/DscText.h"
 
-#include <glib.h>
+#include "standins/shared/Text.h"
 
 #include <algorithm>
 #include <array>
 #include <cstdio>
-#include <memory>
 #include <vector>
 
 namespace standins {
@@ -36,11 +35,7 @@ std::vector<std::string> AsciiPieces(const std::string& text) {
 
 std::vector<std::string> Utf16Pieces(const std::string& text) {
     std::vector<std::string> pieces{Octal(0xFE) + Octal(0xFF)};
-    glong length = 0;
-    const std::unique_ptr<gunichar2, decltype(&g_free)> units(
-        g_utf8_to_utf16(text.c_str(), -1, nullptr, &length, nullptr), g_free);
-    for (glong i = 0; i < length; ++i) {
-        const gunichar2 unit = units.get()[i];
+    for (const char16_t unit : ToUtf16(text)) {
         const bool isLowSurrogate = unit >= 0xDC00 && unit < 0xE000;
         if (!isLowSurrogate)
             pieces.emplace_back();

@@ -1,6 +1,6 @@
 #include "standins/office/printer/Outline.h"
 
-#include "standins/office/GObjectReference.h"
+#include "standins/office/shared/GObjectReference.h"
 
 #include <glib.h>
 #include <gsf/gsf-infile-zip.h>

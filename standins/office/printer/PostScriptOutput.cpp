@@ -2,7 +2,7 @@
 
 #include "standins/office/printer/ColourProcedures.h"
 #include "standins/office/printer/DscText.h"
-#include "standins/process/FileBytes.h"
+#include "standins/shared/FileBytes.h"
 
 #include <cairo-ps.h>
 

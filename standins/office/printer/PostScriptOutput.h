@@ -1,7 +1,7 @@
 #pragma once
 
 #include "standins/office/printer/PrintJob.h"
-#include "standins/process/Failure.h"
+#include "standins/shared/Failure.h"
 
 #include <cairo.h>
 

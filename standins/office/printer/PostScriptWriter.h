@@ -2,7 +2,7 @@
 
 #include "standins/office/printer/PostScriptOutput.h"
 #include "standins/office/printer/PrintJob.h"
-#include "standins/process/Failure.h"
+#include "standins/shared/Failure.h"
 
 namespace standins {
 

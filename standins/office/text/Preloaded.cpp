@@ -1,8 +1,7 @@
 // Makes of the files here a library that is loaded in front of those of a LibreOffice started for
 // one document.
 
-#include "standins/office/FontUseFile.h"
-#include "standins/office/KnownPath.h"
+#include "standins/office/shared/TextLibraryNames.h"
 #include "standins/office/text/DocumentPath.h"
 #include "standins/office/text/FontUse.h"
 

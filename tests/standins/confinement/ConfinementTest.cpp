@@ -1,7 +1,7 @@
 #include "standins/confinement/Confinement.h"
 
-#include "standins/module/SupervisedRun.h"
-#include "standins/process/WorkFolder.h"
+#include "standins/inprocess/SupervisedRun.h"
+#include "standins/shared/WorkFolder.h"
 #include "tests/standins/LoopbackListener.h"
 #include "tests/standins/confinement/Attempts.h"
 #include "tests/support/TemporaryFolder.h"
