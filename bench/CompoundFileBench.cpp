@@ -1,5 +1,5 @@
 #include "office/CompoundFileCheck.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
 

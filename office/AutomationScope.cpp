@@ -1,6 +1,6 @@
 #include "office/AutomationScope.h"
 
-#include "office/RunAutomation.h"
+#include "common/CatchAll.h"
 
 #include <afxwin.h>
 #include <objbase.h>
@@ -8,7 +8,7 @@
 #include <cstdio>
 
 bool InitializeMfcAndCom() {
-    const bool isMfcInitialised = RunAutomation(false, [] {
+    const bool isMfcInitialised = CatchAll(false, [] {
         return AfxWinInit(GetModuleHandleW(nullptr), nullptr, GetCommandLineW(), 0) != FALSE;
     });
     if (!isMfcInitialised) {

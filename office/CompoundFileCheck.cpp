@@ -2,7 +2,7 @@
 
 #include "office/AutomationScope.h"
 #include "office/ComPointer.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <ole2.h>
 

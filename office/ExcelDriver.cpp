@@ -1,11 +1,11 @@
 #include "office/ExcelDriver.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/InstalledApplications.h"
 #include "office/OutputWait.h"
 #include "office/PrintJob.h"
-#include "office/RunAutomation.h"
 #include "office/StandardArguments.h"
 #include "office/dispatch/ExcelObjects.h"
 
@@ -95,11 +95,11 @@ ResultCode PrintExcelWorkbook(const wxString& inputPath, const wxString& outputF
     // An Excel that fails is told to quit while the workbook is still held, and then released.
     ExcelObjects objects;
     StandardArguments arg;
-    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+    const ResultCode printed = CatchAll(Result::PrintFailed, [&] {
         return PrintThroughExcel(objects, inputPath, output, chosenPrinter, arg, report);
     });
     if (printed == Result::PrintFailed)
-        QuitAfterFailure(objects.application);
+        CatchAll([&] { objects.application.Quit(); }); // it may be past listening
     if (printed != Result::Success)
         return printed;
 

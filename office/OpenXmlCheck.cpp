@@ -1,13 +1,13 @@
 #include "office/OpenXmlCheck.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
-#include "office/RunAutomation.h"
 #include "office/StandardArguments.h"
 #include "office/dispatch/ExcelObjects.h"
 #include "office/dispatch/PowerPointObjects.h"
 #include "office/dispatch/WordObjects.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 namespace {
 
@@ -23,7 +23,7 @@ int CheckBy(bool (*tryOpen)(wxString), const wxString& path) {
 // be asked of one that may be in any state.
 
 bool TryOpenInWord(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    return RunAutomation(false, [&] {
+    return CatchAll(false, [&] {
         const AutomationScope scope;
         StandardArguments arg;
         word::Application application;
@@ -41,7 +41,7 @@ bool TryOpenInWord(wxString path) { // NOLINT(performance-unnecessary-value-para
 }
 
 bool TryOpenInExcel(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    return RunAutomation(false, [&] {
+    return CatchAll(false, [&] {
         const AutomationScope scope;
         StandardArguments arg;
         excel::Application application;
@@ -57,7 +57,7 @@ bool TryOpenInExcel(wxString path) { // NOLINT(performance-unnecessary-value-par
 }
 
 bool TryOpenInPowerPoint(wxString path) { // NOLINT(performance-unnecessary-value-param)
-    return RunAutomation(false, [&] {
+    return CatchAll(false, [&] {
         const AutomationScope scope;
         powerpoint::Application application;
         if (!application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint)))

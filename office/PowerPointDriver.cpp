@@ -1,5 +1,6 @@
 #include "office/PowerPointDriver.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/HighQualityDefault.h"
@@ -7,7 +8,6 @@
 #include "office/OutputWait.h"
 #include "office/PowerPointPrintOptions.h"
 #include "office/PrintJob.h"
-#include "office/RunAutomation.h"
 #include "office/dispatch/PowerPointObjects.h"
 
 namespace {
@@ -79,7 +79,7 @@ ResultCode PrintPowerPointPresentation(const wxString& inputPath, const wxString
     // PowerPoint is one process for all its users, and never told to quit: the user may be working
     // in it. Where it fails, the high-quality default stays with it as it was installed.
     powerpoint::Application application;
-    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+    const ResultCode printed = CatchAll(Result::PrintFailed, [&] {
         return PrintThroughPowerPoint(application, inputPath, output, chosenPrinter, *options,
                                       report);
     });

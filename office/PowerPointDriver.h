@@ -1,8 +1,8 @@
 #pragma once
 
-#include "plugin/PowerPointOptions.h"
-#include "plugin/ProgressSink.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ProgressSink.h"
+#include "plugin/interface/ResultCodes.h"
+#include "plugin/settings/PowerPointOptions.h"
 
 #include <wx/string.h>
 

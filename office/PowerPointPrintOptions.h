@@ -1,7 +1,7 @@
 #pragma once
 
 #include "office/dispatch/PowerPointObjects.h"
-#include "plugin/PowerPointOptions.h"
+#include "plugin/settings/PowerPointOptions.h"
 
 // The user's options in PowerPoint's numbers. The texts among them are the settings panel's, in
 // whatever language it had; a text that is none of the panel's leaves PowerPoint's own choice.

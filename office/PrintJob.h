@@ -1,7 +1,7 @@
 #pragma once
 
-#include "plugin/ProgressSink.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ProgressSink.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/filename.h>
 #include <wx/string.h>

@@ -1,11 +1,11 @@
 #include "office/PublisherDriver.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/InstalledApplications.h"
 #include "office/OutputWait.h"
 #include "office/PrintJob.h"
-#include "office/RunAutomation.h"
 #include "office/dispatch/PublisherObjects.h"
 #include "pstools/DistillerDevModeGuard.h"
 
@@ -86,11 +86,11 @@ ResultCode PrintPublisherDocument(const wxString& inputPath, const wxString& out
     // that fails is told to quit while the publication is still held.
     const DistillerDevModeGuard guard;
     PublisherObjects objects;
-    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+    const ResultCode printed = CatchAll(Result::PrintFailed, [&] {
         return PrintThroughPublisher(objects, inputPath, output, chosenPrinter, report);
     });
     if (printed == Result::PrintFailed)
-        QuitAfterFailure(objects.application);
+        CatchAll([&] { objects.application.Quit(); }); // it may be past listening
     if (printed != Result::Success)
         return printed;
 

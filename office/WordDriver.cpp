@@ -1,11 +1,11 @@
 #include "office/WordDriver.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/InstalledApplications.h"
 #include "office/OutputWait.h"
 #include "office/PrintJob.h"
-#include "office/RunAutomation.h"
 #include "office/StandardArguments.h"
 #include "office/dispatch/WordObjects.h"
 #include "pstools/DistillerDevModeGuard.h"
@@ -125,7 +125,7 @@ ResultCode PrintWordDocument(const wxString& inputPath, const wxString& outputFo
     WordObjects objects;
     StandardArguments arg;
     const DistillerDevModeGuard guard;
-    const ResultCode printed = RunAutomation(Result::PrintFailed, [&] {
+    const ResultCode printed = CatchAll(Result::PrintFailed, [&] {
         return PrintThroughWord(objects, inputPath, output, chosenPrinter, arg, report);
     });
     if (printed != Result::Success)

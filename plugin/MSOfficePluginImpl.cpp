@@ -37,7 +37,7 @@ void MSOfficePluginImpl::FindPrinter() {
 }
 
 bool MSOfficePluginImpl::IsReady() {
-    return AtBoundary(false, [&] { return IsOfficeInstalled() && m_printerAvailable; });
+    return CatchAll(false, [&] { return IsOfficeInstalled() && m_printerAvailable; });
 }
 
 bool MSOfficePluginImpl::CanConvert() {
@@ -45,19 +45,19 @@ bool MSOfficePluginImpl::CanConvert() {
 }
 
 void MSOfficePluginImpl::GetVersion(wxString& text) {
-    AtBoundary([&] { text = PluginIdentity::Version; });
+    CatchAll([&] { text = PluginIdentity::Version; });
 }
 
 void MSOfficePluginImpl::GetVendor(wxString& text) {
-    AtBoundary([&] { text = PluginIdentity::Vendor; });
+    CatchAll([&] { text = PluginIdentity::Vendor; });
 }
 
 void MSOfficePluginImpl::GetIdentifier(wxString& text) {
-    AtBoundary([&] { text = PluginIdentity::Identifier; });
+    CatchAll([&] { text = PluginIdentity::Identifier; });
 }
 
 void MSOfficePluginImpl::GetFlagLists(wxArrayString& first, wxArrayString& second) {
-    AtBoundary([&] {
+    CatchAll([&] {
         first.Insert("1", 0);
         second.Insert("0", 0);
     });
@@ -72,12 +72,12 @@ int MSOfficePluginImpl::GetAuxiliaryCode() {
 }
 
 bool MSOfficePluginImpl::GetErrorText(int code, wxString& text) {
-    AtBoundary([&] { text = GetResultText(code); });
+    CatchAll([&] { text = GetResultText(code); });
     return true;
 }
 
 wxWindow* MSOfficePluginImpl::CreateSettingsPanel(wxWindow* parent) {
-    return AtBoundary<wxWindow*>(nullptr, [&] {
+    return CatchAll<wxWindow*>(nullptr, [&] {
         const bool officeInstalled = IsOfficeInstalled();
         const bool enabled = officeInstalled && (m_currentServer || m_printerAvailable);
         m_panel = BuildMSOfficePanel(parent, PluginIdentity::Vendor, InputTypes, enabled,

@@ -1,10 +1,10 @@
 #pragma once
 
-#include "plugin/Boundary.h"
-#include "plugin/PowerPointOptions.h"
-#include "plugin/ResultCodes.h"
-#include "plugin/SettingsMap.h"
-#include "plugin/WQPlugin.h"
+#include "common/CatchAll.h"
+#include "plugin/interface/ResultCodes.h"
+#include "plugin/interface/WQPlugin.h"
+#include "plugin/settings/PowerPointOptions.h"
+#include "plugin/settings/SettingsMap.h"
 
 #include <wx/weakref.h>
 
@@ -54,7 +54,7 @@ private:
     /// result from then on, also where the body throws.
     template <typename Body>
     int RunOperation(ResultCode codeOfException, Body&& body) noexcept {
-        return m_lastResult = AtBoundary(codeOfException, std::forward<Body>(body));
+        return m_lastResult = CatchAll(codeOfException, std::forward<Body>(body));
     }
 
     void FindPrinter();

@@ -90,7 +90,7 @@ MSOfficePluginImpl::ScreenFile(const wxString& path, wxArrayString& refused, Job
 
 /// Where memory runs out this file gets no item; the others need not suffer for it.
 void MSOfficePluginImpl::Accept(const wxFileName& document, JobItemArray& items) {
-    AtBoundary([&] {
+    CatchAll([&] {
         auto item = std::make_unique<JobItem>();
         GetIdentifier(item->pluginIdentifier);
         item->fileName = document.GetFullName();

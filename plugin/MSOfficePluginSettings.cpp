@@ -1,5 +1,5 @@
 #include "plugin/MSOfficePluginImpl.h"
-#include "plugin/SettingsXml.h"
+#include "plugin/settings/SettingsXml.h"
 #include "ui/MSOfficePanel.h"
 
 int MSOfficePluginImpl::ApplySettings(const wxXmlNode* settings) {

@@ -1,8 +1,8 @@
+#include "common/CatchAll.h"
 #include "office/AutomationScope.h"
-#include "plugin/Boundary.h"
 #include "plugin/MSOfficePluginImpl.h"
 #include "plugin/PluginIdentity.h"
-#include "plugin/WQPlugin.h"
+#include "plugin/interface/WQPlugin.h"
 
 #include <objbase.h>
 
@@ -18,7 +18,7 @@ bool g_comInitialised = false;
 } // namespace
 
 void InitializePlugin() {
-    AtBoundary([] {
+    CatchAll([] {
         if (g_moduleToken)
             return;
         auto token = std::make_unique<char>();
@@ -28,7 +28,7 @@ void InitializePlugin() {
 }
 
 void UninitializePlugin() {
-    AtBoundary([] {
+    CatchAll([] {
         const std::unique_ptr<char> token = std::move(g_moduleToken);
         if (token && g_comInitialised)
             CoUninitialize();
@@ -36,7 +36,7 @@ void UninitializePlugin() {
 }
 
 void GetPluginInfo(PluginInfo* info) {
-    AtBoundary([info] {
+    CatchAll([info] {
         info->kind = PluginIdentity::Kind;
         info->version = PluginIdentity::Version;
         info->identifier = PluginIdentity::Identifier;
@@ -48,10 +48,10 @@ void GetPluginInfo(PluginInfo* info) {
 }
 
 WQPlugin* GetPluginInstance(void* /*context*/) {
-    return AtBoundary<WQPlugin*>(nullptr,
-                                 [] { return std::make_unique<MSOfficePluginImpl>().release(); });
+    return CatchAll<WQPlugin*>(nullptr,
+                               [] { return std::make_unique<MSOfficePluginImpl>().release(); });
 }
 
 void ReleasePluginInstance(WQPlugin* plugin) {
-    AtBoundary([plugin] { const std::unique_ptr<WQPlugin> released(plugin); });
+    CatchAll([plugin] { const std::unique_ptr<WQPlugin> released(plugin); });
 }

@@ -1,6 +1,6 @@
 #include "ui/InputFileType.h"
 
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 #include "ui/Controls.h"
 
 #include <wx/sizer.h>

@@ -3,7 +3,7 @@
 #include "common/Themer.h"
 #include "common/Translated.h"
 #include "office/InstalledApplications.h"
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 #include "ui/Controls.h"
 #include "ui/PanelSettings.h"
 

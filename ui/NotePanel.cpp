@@ -1,7 +1,7 @@
 #include "ui/NotePanel.h"
 
 #include "common/Themer.h"
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 #include "ui/Controls.h"
 
 #include <wx/panel.h>

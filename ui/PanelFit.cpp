@@ -1,6 +1,6 @@
 #include "ui/PanelFit.h"
 
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 
 #include <wx/choice.h>
 #include <wx/sizer.h>

@@ -1,7 +1,7 @@
 #include "ui/PowerPointSettings.h"
 
 #include "common/Translated.h"
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 #include "ui/Controls.h"
 #include "ui/SeparatorLine.h"
 

@@ -1,8 +1,8 @@
 #include "office/AutomationScope.h"
 
 #include "office/CompoundFileCheck.h"
-#include "plugin/ResultCodes.h"
-#include "plugin/WQPlugin.h"
+#include "plugin/interface/ResultCodes.h"
+#include "plugin/interface/WQPlugin.h"
 #include "tests/filter/ComOnThisThread.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"

@@ -1,6 +1,6 @@
 #include "office/CompoundFileCheck.h"
 
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/Wine.h"

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "office/OutputWait.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 #include "tests/support/RecordingOffice.h"
 #include "tests/support/RecordingProgress.h"
 #include "tests/support/TemporaryFolder.h"

@@ -1,6 +1,6 @@
 #include "office/OpenXmlCheck.h"
 
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 #include "tests/filter/JournalCalls.h"
 
 #include <gtest/gtest.h>

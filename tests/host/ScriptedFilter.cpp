@@ -3,7 +3,7 @@
 // is noted in the host's log.
 
 #include "common/WQServices.h"
-#include "plugin/WQPlugin.h"
+#include "plugin/interface/WQPlugin.h"
 #include "tests/host/System.h"
 
 #include <windows.h>

@@ -1,5 +1,6 @@
 #include "tests/standins/OfficeTest.h"
 
+#include "common/CatchAll.h"
 #include "machine/OfficeApplication.h"
 #include "office/AutomationScope.h"
 #include "office/ExcelDriver.h"
@@ -8,7 +9,6 @@
 #include "office/PowerPointDriver.h"
 #include "office/PowerPointPrintOptions.h"
 #include "office/PublisherDriver.h"
-#include "office/RunAutomation.h"
 #include "office/WordDriver.h"
 #include "tests/standins/Processes.h"
 
@@ -40,7 +40,7 @@ ResultCode PrintByDriver(const wxString& document, const wxString& folder,
 bool PrintPresentation(const wxString& document, const wxString& output,
                        const PowerPointOptions& options) {
     const AutomationScope scope;
-    return RunAutomation(false, [&] {
+    return CatchAll(false, [&] {
         powerpoint::Application application;
         application.CreateDispatch(ProgIdOf(OfficeApplication::PowerPoint));
         powerpoint::Presentation presentation =

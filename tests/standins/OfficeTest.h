@@ -1,6 +1,6 @@
 #pragma once
 
-#include "plugin/PowerPointOptions.h"
+#include "plugin/settings/PowerPointOptions.h"
 #include "tests/standins/StandInTest.h"
 #include "tests/support/TestPrinter.h"
 

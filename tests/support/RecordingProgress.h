@@ -1,6 +1,6 @@
 #pragma once
 
-#include "plugin/ProgressSink.h"
+#include "plugin/interface/ProgressSink.h"
 
 #include <vector>
 

@@ -1,6 +1,6 @@
+#include "plugin/interface/ControlIds.h"
 #include "tests/support/Wine.h"
 #include "tests/ui/PanelFixture.h"
-#include "ui/ControlIds.h"
 
 #include <wx/app.h>
 #include <wx/uiaction.h>

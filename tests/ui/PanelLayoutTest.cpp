@@ -1,7 +1,7 @@
 #include "common/Themer.h"
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/ControlTree.h"
 #include "tests/ui/PanelFixture.h"
-#include "ui/ControlIds.h"
 #include "ui/OutputFileType.h"
 
 #include <wx/sizer.h>

@@ -1,5 +1,5 @@
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/PanelFixture.h"
-#include "ui/ControlIds.h"
 
 namespace {
 

@@ -6,7 +6,7 @@
 #include "host/program/documents/Workplace.h"
 #include "host/program/machine/MissingParts.h"
 #include "host/program/system/ConversionTurn.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>

@@ -4,7 +4,7 @@
 #include "host/program/documents/Outcome.h"
 #include "host/program/documents/OutputFolder.h"
 #include "host/program/filters/FilterSet.h"
-#include "plugin/ProgressSink.h"
+#include "plugin/interface/ProgressSink.h"
 
 /// Screens a file and, if a filter accepts it, converts it into the output folder.
 /// @param baseName the output's name there, without ending

@@ -4,7 +4,7 @@
 #include "host/program/base/Reasons.h"
 #include "host/program/machine/EngineFailure.h"
 #include "host/program/machine/FontStandIns.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 

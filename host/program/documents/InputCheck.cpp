@@ -1,7 +1,7 @@
 #include "host/program/documents/InputCheck.h"
 
 #include "host/program/base/PathText.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 

@@ -1,6 +1,6 @@
 #include "host/program/documents/Outcome.h"
 
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/translation.h>
 
@@ -28,11 +28,4 @@ void Outcome::End(State how, Fault why, const wxString& message) {
     state = how;
     fault = std::move(why);
     text = message;
-}
-
-bool IsMachineCode(int code) {
-    constexpr int FirstMissingOffice = 1011;
-    return code == Result::NotInitialized || code == Result::DistillerNotInstalled ||
-           (code >= FirstMissingOffice && code <= Result::PublisherStartFailed) ||
-           code == Result::PublisherTooOld;
 }

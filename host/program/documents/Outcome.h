@@ -36,6 +36,3 @@ struct Outcome {
 
 /// The state's name, as records have it, and people in their language.
 const char* NameOf(State state);
-
-/// Whether a result code says that something is missing on the machine.
-bool IsMachineCode(int code);

@@ -4,7 +4,7 @@
 #include "host/program/documents/FilterCall.h"
 #include "host/program/documents/InputCheck.h"
 #include "host/program/machine/MissingParts.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 

@@ -2,7 +2,7 @@
 
 #include "common/WQServices.h"
 #include "machine/OfficeApplication.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/xml/xml.h>
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "plugin/WQPlugin.h"
+#include "plugin/interface/WQPlugin.h"
 
 #include <wx/msw/wrapwin.h>
 

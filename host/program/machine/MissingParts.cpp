@@ -7,7 +7,7 @@
 #include "host/program/system/InstallAdvice.h"
 #include "machine/FiltersFolder.h"
 #include "machine/InstalledOffice.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/report/Reporter.h"
-#include "plugin/ProgressSink.h"
+#include "plugin/interface/ProgressSink.h"
 
 /// A bar with a text behind it, for one line of a terminal.
 wxString ProgressLine(int percent, const wxString& text);

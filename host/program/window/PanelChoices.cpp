@@ -2,7 +2,7 @@
 
 #include "host/program/settings/Settings.h"
 #include "machine/Printers.h"
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 
 #include <wx/choice.h>
 #include <wx/intl.h>

@@ -1,6 +1,6 @@
 #include "host/program/window/PanelHints.h"
 
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 
 #include <wx/intl.h>
 #include <wx/window.h>

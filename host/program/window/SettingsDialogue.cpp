@@ -7,7 +7,7 @@
 #include "host/program/window/MessageBar.h"
 #include "host/program/window/PanelHints.h"
 #include "host/program/window/ScrolledArea.h"
-#include "ui/ControlIds.h"
+#include "plugin/interface/ControlIds.h"
 
 #include <wx/button.h>
 #include <wx/display.h>

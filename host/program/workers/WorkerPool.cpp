@@ -6,7 +6,7 @@
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
 #include "host/program/system/Interruption.h"
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "common/LoadedModule.h"
-#include "plugin/WQPlugin.h"
+#include "plugin/interface/WQPlugin.h"
 
 #include <wx/xml/xml.h>
 

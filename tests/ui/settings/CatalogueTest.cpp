@@ -1,7 +1,7 @@
 #include "host/program/window/MessageBar.h"
 #include "host/services/CatalogueLoader.h"
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/settings/SettingsWindow.h"
-#include "ui/ControlIds.h"
 
 #include <wx/button.h>
 #include <wx/choice.h>

@@ -1,6 +1,6 @@
 #include "common/Themer.h"
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/settings/SettingsWindow.h"
-#include "ui/ControlIds.h"
 
 #include <wx/bitmap.h>
 #include <wx/button.h>

@@ -1,8 +1,8 @@
 #include "host/program/machine/MissingParts.h"
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/settings/SettingsWindow.h"
-#include "ui/ControlIds.h"
 
 #include <wx/button.h>
 #include <wx/checkbox.h>

@@ -1,7 +1,7 @@
 #include "tests/host/Program.h"
 
+#include "plugin/interface/ControlIds.h"
 #include "tests/ui/settings/SettingsWindow.h"
-#include "ui/ControlIds.h"
 
 #include <wx/frame.h>
 #include <wx/utils.h>

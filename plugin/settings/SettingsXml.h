@@ -1,6 +1,6 @@
 #pragma once
 
-#include "plugin/SettingsMap.h"
+#include "plugin/settings/SettingsMap.h"
 
 class wxXmlNode;
 

@@ -1,4 +1,4 @@
-#include "plugin/ResultCodes.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include "common/Translated.h"
 

@@ -1,8 +1,8 @@
 #pragma once
 
-#include "plugin/JobItem.h"
-#include "plugin/PluginInfo.h"
-#include "plugin/ProgressSink.h"
+#include "plugin/interface/JobItem.h"
+#include "plugin/interface/PluginInfo.h"
+#include "plugin/interface/ProgressSink.h"
 
 #include <wx/arrstr.h>
 #include <wx/string.h>

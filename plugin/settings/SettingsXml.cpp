@@ -1,4 +1,4 @@
-#include "plugin/SettingsXml.h"
+#include "plugin/settings/SettingsXml.h"
 
 #include "core/xml/XmlHelper.h"
 

@@ -35,6 +35,14 @@ constexpr ResultCode PublisherTooOld = 1023;
 
 } // namespace Result
 
+/// Whether a result code says that something is missing on the machine; no document is to blame.
+constexpr bool IsMachineCode(ResultCode code) {
+    constexpr ResultCode OfficeNotInstalled = 1011; // the first of those on missing applications
+    return code == Result::NotInitialized || code == Result::DistillerNotInstalled ||
+           (code >= OfficeNotInstalled && code <= Result::PublisherStartFailed) ||
+           code == Result::PublisherTooOld;
+}
+
 /// The message of a result code in the host's language, one line without a full stop.
 /// @param code any number; one that is no result code has the message of success
 wxString GetResultText(ResultCode code);
