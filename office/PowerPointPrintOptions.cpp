@@ -1,64 +1,44 @@
 #include "office/PowerPointPrintOptions.h"
 
 #include "common/WQServices.h"
+#include "plugin/settings/FilterSettings.h"
 
+#include <algorithm>
 #include <optional>
 
 namespace {
-
-struct TextValue {
-    const char* text;
-    LONG value;
-};
-
-// PpPrintColorType
-const TextValue ColourTypes[] = {{"Color", 1}, {"Grayscale", 2}, {"Pure Black and White", 3}};
-
-// PpPrintOutputType
-const TextValue OutputTypes[] = {
-    {"Slides", 1}, {"Handouts", 2}, {"Notes Pages", 5}, {"Outline View", 6}};
-
-// PpPrintOutputType too: one slide a page is printed as a full slide, not as a handout of one.
-const TextValue HandoutTypes[] = {{"1", 1}, {"2", 2}, {"3", 3}, {"4", 8}, {"6", 4}, {"9", 9}};
-
-// PpPrintHandoutOrder, as the settings have it: 1 for the horizontal order, 2 for the vertical one
-const TextValue HandoutOrders[] = {{"1", 1}, {"2", 2}};
 
 bool IsTranslationOf(const wxString& text, const char* english) {
     return WQTranslations::GetInstance().GetTranslations(english).Index(text) != wxNOT_FOUND;
 }
 
-template <std::size_t Count>
-std::optional<LONG> ByTranslation(const TextValue (&values)[Count], const wxString& text) {
-    for (const TextValue& value : values)
-        if (IsTranslationOf(text, value.text))
-            return value.value;
-    return std::nullopt;
-}
-
-template <std::size_t Count>
-std::optional<LONG> ByText(const TextValue (&values)[Count], const wxString& text) {
-    for (const TextValue& value : values)
-        if (text == value.text)
-            return value.value;
-    return std::nullopt;
+/// @return the number of the choice that the text is; of its translations where it has any
+std::optional<LONG> NumberOf(const Setting& setting, const wxString& text) {
+    const auto* const choice = std::find_if(
+        setting.choices.begin(), setting.choices.end(), [&](const SettingChoice& each) {
+            return setting.kind == Setting::Text ? IsTranslationOf(text, each.text)
+                                                 : text == each.text;
+        });
+    return choice == setting.choices.end() ? std::nullopt : std::optional<LONG>(choice->number);
 }
 
 } // namespace
 
 void PutColour(powerpoint::PrintOptions& target, const PowerPointOptions& options) {
-    if (const auto type = ByTranslation(ColourTypes, options.colour))
+    if (const auto type = NumberOf(FilterSettings::Colour, options.colour))
         target.PutPrintColorType(*type);
 }
 
 void PutContents(powerpoint::PrintOptions& target, const PowerPointOptions& options) {
-    if (const auto type = ByTranslation(OutputTypes, options.outputType))
+    if (const auto type = NumberOf(FilterSettings::OutputType, options.outputType))
         target.PutOutputType(*type);
-    if (IsTranslationOf(options.outputType, "Handouts"))
-        if (const auto type = ByText(HandoutTypes, options.slidesPerPage))
+    if (IsTranslationOf(options.outputType, FilterSettings::Handouts))
+        if (const auto type = NumberOf(FilterSettings::SlidesPerPage, options.slidesPerPage))
             target.PutOutputType(*type);
-    if (const auto order = ByText(HandoutOrders, options.handoutOrder))
-        target.PutHandoutOrder(*order);
+    if (options.handoutOrder == "1") // PpPrintHandoutOrder
+        target.PutHandoutOrder(1);
+    else if (options.handoutOrder == "2")
+        target.PutHandoutOrder(2);
 }
 
 void PutSwitches(powerpoint::PrintOptions& target, const PowerPointOptions& options) {

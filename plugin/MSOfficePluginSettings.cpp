@@ -1,4 +1,5 @@
 #include "plugin/MSOfficePluginImpl.h"
+#include "plugin/settings/FilterSettings.h"
 #include "plugin/settings/SettingsXml.h"
 #include "ui/MSOfficePanel.h"
 
@@ -8,25 +9,26 @@ int MSOfficePluginImpl::ApplySettings(const wxXmlNode* settings) {
 
         // Asking for a missing key enters it with an empty value: from here on the map, and what
         // is saved of it, holds every key that was asked for here. The panel has keys of its own.
-        const auto isOn = [this](const char* key) { return m_settings[key] == "1"; };
+        const auto text = [this](const Setting& setting) { return m_settings[setting.key]; };
+        const auto isOn = [&text](const Setting& setting) { return text(setting) == "1"; };
 
-        m_printerName = m_settings["PRINTER"];
-        m_psOutput = isOn("OUTPUTFILETYPEPS");
-        m_distillerProfile = m_settings["SELECTEDDISTILLERPROFILE"];
+        m_printerName = text(FilterSettings::Printer);
+        m_psOutput = isOn(FilterSettings::OutputPS);
+        m_distillerProfile = text(FilterSettings::DistillerProfile);
 
         PowerPointOptions& options = m_powerPointOptions;
-        options.outputType = m_settings["PRINTOUTPUTTYPE"];
-        options.colour = m_settings["COLOR"];
-        options.slidesPerPage = m_settings["SLIDESPERPAGE"];
-        if (isOn("HANDOUTSHORIZONTAL"))
+        options.outputType = text(FilterSettings::OutputType);
+        options.colour = text(FilterSettings::Colour);
+        options.slidesPerPage = text(FilterSettings::SlidesPerPage);
+        if (isOn(FilterSettings::HandoutsHorizontal))
             options.handoutOrder = "1";
-        else if (isOn("HANDOUTSVERTICAL"))
+        else if (isOn(FilterSettings::HandoutsVertical))
             options.handoutOrder = "2";
-        options.scaleToFit = isOn("SCALETOFITPAGE");
-        options.frameSlides = isOn("FRAMESLIDES");
-        options.printHiddenSlides = isOn("PRINTHIDDENSLIDES");
-        options.printCommentsAndInkMarkup = isOn("PRINTCOMMENTSANDINKMARKUP");
-        options.highQuality = isOn("HIGHQUALITY");
+        options.scaleToFit = isOn(FilterSettings::ScaleToFitPage);
+        options.frameSlides = isOn(FilterSettings::FrameSlides);
+        options.printHiddenSlides = isOn(FilterSettings::PrintHiddenSlides);
+        options.printCommentsAndInkMarkup = isOn(FilterSettings::PrintCommentsAndInkMarkup);
+        options.highQuality = isOn(FilterSettings::HighQuality);
         return Result::Success;
     });
 }

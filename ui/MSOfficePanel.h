@@ -18,19 +18,13 @@ public:
 private:
     bool IsHandouts() const;
     void EnableHandouts(bool enable);
-    wxString Selected(int choice) const;
+    PanelValues Values();
 
-    void OnHorizontalOrder(wxCommandEvent& event);
-    void OnVerticalOrder(wxCommandEvent& event);
-    void OnScaleToFitPage(wxCommandEvent& event);
-    void OnPrintHiddenSlides(wxCommandEvent& event);
-    void OnFrameSlides(wxCommandEvent& event);
-    void OnPrintCommentsAndInkMarkup(wxCommandEvent& event);
-    void OnHighQuality(wxCommandEvent& event);
+    void OnOrder(wxCommandEvent& event);
+    void OnFlag(wxCommandEvent& event);
+    void OnChoice(wxCommandEvent& event);
     void OnPrinter(wxCommandEvent& event);
     void OnPrintOutputType(wxCommandEvent& event);
-    void OnColor(wxCommandEvent& event);
-    void OnSlidesPerPage(wxCommandEvent& event);
 
     bool m_handoutsHorizontal = false;
     bool m_handoutsVertical = false;

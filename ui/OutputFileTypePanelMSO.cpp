@@ -3,7 +3,6 @@
 #include "common/Themer.h"
 #include "plugin/interface/ControlIds.h"
 #include "ui/Controls.h"
-#include "ui/PanelSettings.h"
 
 #include <wx/choice.h>
 #include <wx/radiobut.h>
@@ -41,9 +40,16 @@ void OutputFileTypePanelMSO::SetDistillerProfiles(const wxArrayString& profiles)
     m_distillerProfiles = profiles;
 }
 
+/// The values that are read and written like others; the profile is not.
+PanelValues OutputFileTypePanelMSO::Values() {
+    return {
+        {ControlId::OutputPS, FilterSettings::OutputPS, &m_outputPS},
+        {ControlId::OutputPDF, FilterSettings::OutputPDF, &m_outputPDF},
+    };
+}
+
 bool OutputFileTypePanelMSO::SetupControls() {
-    FindWindow(ControlId::OutputPS)->SetValidator(wxGenericValidator(&m_outputPS));
-    FindWindow(ControlId::OutputPDF)->SetValidator(wxGenericValidator(&m_outputPDF));
+    Values().Bind(*this);
     auto* profile = dynamic_cast<wxChoice*>(FindWindow(ControlId::DistillerProfile));
     profile->Append(m_distillerProfiles);
     profile->SetValidator(wxGenericValidator(&m_selectedProfile));
@@ -51,9 +57,8 @@ bool OutputFileTypePanelMSO::SetupControls() {
 }
 
 bool OutputFileTypePanelMSO::ReadSettings(SettingsMap& settings) {
-    m_outputPS = ReadFlag(settings, "OUTPUTFILETYPEPS", true);
-    m_outputPDF = ReadFlag(settings, "OUTPUTFILETYPEPDF", false);
-    const wxString stored = ReadText(settings, "SELECTEDDISTILLERPROFILE", wxEmptyString);
+    Values().Read(settings);
+    const wxString& stored = settings[FilterSettings::DistillerProfile.key];
     if (!stored.empty())
         m_selectedProfile = stored;
     else if (!m_distillerProfiles.empty())
@@ -70,8 +75,7 @@ bool OutputFileTypePanelMSO::ReadSettings(SettingsMap& settings) {
 }
 
 bool OutputFileTypePanelMSO::WriteSettings(SettingsMap& settings) {
-    WriteFlag(settings, "OUTPUTFILETYPEPS", m_outputPS);
-    WriteFlag(settings, "OUTPUTFILETYPEPDF", m_outputPDF);
+    Values().Write(settings);
     if (!m_outputPDF)
         return true;
     const auto* profile = dynamic_cast<const wxChoice*>(FindWindow(ControlId::DistillerProfile));
@@ -79,7 +83,7 @@ bool OutputFileTypePanelMSO::WriteSettings(SettingsMap& settings) {
     // is one that is not installed now; it stays.
     const int selected = profile->GetCurrentSelection();
     if (selected >= 0 && static_cast<std::size_t>(selected) < m_distillerProfiles.size())
-        settings["SELECTEDDISTILLERPROFILE"] = m_distillerProfiles[selected];
+        settings[FilterSettings::DistillerProfile.key] = m_distillerProfiles[selected];
     return true;
 }
 

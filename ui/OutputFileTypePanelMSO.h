@@ -1,6 +1,6 @@
 #pragma once
 
-#include "plugin/settings/SettingsMap.h"
+#include "ui/PanelSettings.h"
 
 #include <wx/arrstr.h>
 #include <wx/panel.h>
@@ -26,6 +26,7 @@ public:
     virtual bool ReadSettings(SettingsMap& settings);
 
 private:
+    PanelValues Values();
     void OnPSChosen(wxCommandEvent& event);
     void OnPDFChosen(wxCommandEvent& event);
 

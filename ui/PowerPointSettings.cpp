@@ -2,6 +2,7 @@
 
 #include "common/Translated.h"
 #include "plugin/interface/ControlIds.h"
+#include "plugin/settings/FilterSettings.h"
 #include "ui/Controls.h"
 #include "ui/SeparatorLine.h"
 
@@ -11,8 +12,6 @@
 #include <wx/radiobut.h>
 #include <wx/sizer.h>
 #include <wx/stattext.h>
-
-#include <initializer_list>
 
 namespace {
 
@@ -37,10 +36,10 @@ public:
     }
     void Space(int flags) { m_sizer->Add(SpacerSize, SpacerSize, 0, flags, 5); }
     void Line() { m_sizer->Add(new SeparatorLine(m_parent, ControlId::Separator), 0, wxEXPAND, 0); }
-    void Choice(int id, int width, std::initializer_list<const char*> entries, int flags) {
+    void Choice(int id, int width, const Setting& setting, int flags) {
         wxArrayString shown;
-        for (const char* entry : entries)
-            shown.Add(Translated(entry));
+        for (const SettingChoice& choice : setting.choices)
+            shown.Add(Translated(choice.text));
         m_sizer->Add(
             new wxChoice(m_parent, id, wxDefaultPosition, wxSize(width, wxDefaultCoord), shown), 0,
             flags, 5);
@@ -50,10 +49,9 @@ public:
                                        wxDefaultSize, style),
                      0, flags, 5);
     }
-    void CheckBox(int id, const char* english, bool ticked, int flags, int border) {
+    void CheckBox(int id, const char* english, const Setting& setting, int flags, int border) {
         auto* box = new wxCheckBox(m_parent, id, Translated(english));
-        if (ticked)
-            box->SetValue(true);
+        box->SetValue(*setting.panelStandard == '1');
         m_sizer->Add(box, 0, flags, border);
     }
 
@@ -77,12 +75,10 @@ wxSizer* NewOutputRow(wxWindow* content) {
     CellRow row(content, 3);
     row.Label(ControlId::PrintLabel, "Print:", Middle | wxRIGHT, 75);
     row.Space(Centred | wxALL);
-    row.Choice(ControlId::Print, OptionWidth, {"Slides", "Handouts", "Notes Pages", "Outline View"},
-               Centred | wxALL);
+    row.Choice(ControlId::Print, OptionWidth, FilterSettings::OutputType, Centred | wxALL);
     row.Label(ControlId::ColourLabel, "Color/grayscale:", Middle | wxRIGHT, 5);
     row.Space(Centred | wxALL);
-    row.Choice(ControlId::Colour, OptionWidth, {"Color", "Grayscale", "Pure Black and White"},
-               Centred | wxALL);
+    row.Choice(ControlId::Colour, OptionWidth, FilterSettings::Colour, Centred | wxALL);
     return row.Sizer();
 }
 
@@ -97,8 +93,7 @@ wxSizer* NewHandoutsRow(wxWindow* content) {
     CellRow row(content, 4);
     row.Label(ControlId::SlidesPerPageLabel, "Slides per page:", Middle | wxRIGHT, 25);
     row.Space(Centred | wxALL);
-    row.Choice(ControlId::SlidesPerPage, CountWidth, {"1", "2", "3", "4", "6", "9"},
-               Middle | Sides);
+    row.Choice(ControlId::SlidesPerPage, CountWidth, FilterSettings::SlidesPerPage, Middle | Sides);
     row.Label(ControlId::NoImage, "No image", Centred | wxLEFT, 15);
     EnableControls(content, {ControlId::NoImage}, false);
 
@@ -116,16 +111,20 @@ wxSizer* NewHandoutsRow(wxWindow* content) {
 
 wxSizer* NewAdvancedRow(wxWindow* content) {
     CellRow row(content, 3);
-    row.CheckBox(ControlId::ScaleToFitPaper, "Scale to fit paper", false, Middle | wxRIGHT, 115);
+    row.CheckBox(ControlId::ScaleToFitPaper, "Scale to fit paper", FilterSettings::ScaleToFitPage,
+                 Middle | wxRIGHT, 115);
     row.Space(Centred | Sides);
-    row.CheckBox(ControlId::PrintHiddenSlides, "Print hidden slides", true, Centred | wxALL, 5);
+    row.CheckBox(ControlId::PrintHiddenSlides, "Print hidden slides",
+                 FilterSettings::PrintHiddenSlides, Centred | wxALL, 5);
 
-    row.CheckBox(ControlId::FrameSlides, "Frame slides", false, Middle | wxRIGHT, 5);
+    row.CheckBox(ControlId::FrameSlides, "Frame slides", FilterSettings::FrameSlides,
+                 Middle | wxRIGHT, 5);
     row.Space(Centred | Sides);
-    row.CheckBox(ControlId::HighQuality, "High quality", false, Middle | wxALL, 5);
+    row.CheckBox(ControlId::HighQuality, "High quality", FilterSettings::HighQuality,
+                 Middle | wxALL, 5);
 
-    row.CheckBox(ControlId::PrintCommentsAndInkMarkup, "Print comments and ink markup", true,
-                 Middle, 5);
+    row.CheckBox(ControlId::PrintCommentsAndInkMarkup, "Print comments and ink markup",
+                 FilterSettings::PrintCommentsAndInkMarkup, Middle, 5);
     row.Space(Centred | Sides);
     row.Space(Middle | Sides);
     return row.Sizer();

@@ -1,8 +1,8 @@
-#include "plugin/interface/ControlIds.h"
 #include "tests/support/Wine.h"
 #include "tests/ui/PanelFixture.h"
 
 #include <wx/app.h>
+#include <wx/checkbox.h>
 #include <wx/uiaction.h>
 
 namespace {
@@ -10,7 +10,7 @@ namespace {
 class PanelEventsTest : public PanelFixture {
 protected:
     /// Clicks into a control with a real mouse pointer, and waits for its setting to be on.
-    bool ClickUntil(int id, const char* key) {
+    bool ClickUntil(int id, const Setting& setting) {
         wxUIActionSimulator mouse;
         const wxWindow* control = Find(id);
         const wxSize size = control->GetSize();
@@ -18,9 +18,9 @@ protected:
         wxYield();
         mouse.MouseClick();
         const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(10);
-        while (Saved()[key] != "1" && std::chrono::steady_clock::now() < end)
+        while (Saved()[setting.key] != "1" && std::chrono::steady_clock::now() < end)
             wxYield();
-        return Saved()[key] == "1";
+        return Saved()[setting.key] == "1";
     }
 
     bool HandoutsEnabled(bool enabled) const {
@@ -74,24 +74,20 @@ TEST_F(PanelEventsTest, ThePrinterDecidesWhetherTheNoteIsShown) {
 TEST_F(PanelEventsTest, EachControlSetsItsOwnSetting) {
     BuildPanel();
     Settings expected = Saved();
-    for (const auto& [box, key] :
-         {std::pair<int, const char*>{ControlId::ScaleToFitPaper, "SCALETOFITPAGE"},
-          {ControlId::PrintHiddenSlides, "PRINTHIDDENSLIDES"},
-          {ControlId::FrameSlides, "FRAMESLIDES"},
-          {ControlId::HighQuality, "HIGHQUALITY"},
-          {ControlId::PrintCommentsAndInkMarkup, "PRINTCOMMENTSANDINKMARKUP"}}) {
+    for (const auto& [id, setting] : SettingControls) {
+        for (const SettingChoice& choice : setting.choices) {
+            expected[setting.key] = choice.text;
+            Choose(id, choice.text);
+            EXPECT_EQ(expected, Saved());
+        }
         for (const bool ticked : {true, false}) {
-            expected[key] = ticked ? "1" : "0";
-            Tick(box, ticked);
-            EXPECT_EQ(expected, Saved()) << key;
+            if (!dynamic_cast<wxCheckBox*>(Find(id)))
+                continue;
+            expected[setting.key] = ticked ? "1" : "0";
+            Tick(id, ticked);
+            EXPECT_EQ(expected, Saved());
         }
     }
-    expected["COLOR"] = "Grayscale";
-    Choose(ControlId::Colour, "Grayscale");
-    EXPECT_EQ(expected, Saved());
-    expected["SLIDESPERPAGE"] = "3";
-    Choose(ControlId::SlidesPerPage, "3");
-    EXPECT_EQ(expected, Saved());
     for (const bool vertical : {true, false}) {
         expected["HANDOUTSVERTICAL"] = vertical ? "1" : "0";
         expected["HANDOUTSHORIZONTAL"] = vertical ? "0" : "1";
@@ -107,9 +103,9 @@ TEST_F(PanelEventsTest, AnswersARealMouse) {
     m_host->Show();
     m_host->Raise();
     wxYield();
-    EXPECT_TRUE(ClickUntil(ControlId::FrameSlides, "FRAMESLIDES"));
-    EXPECT_TRUE(ClickUntil(ControlId::OrderVertical, "HANDOUTSVERTICAL"));
-    EXPECT_TRUE(ClickUntil(ControlId::OutputPDF, "OUTPUTFILETYPEPDF"));
+    EXPECT_TRUE(ClickUntil(ControlId::FrameSlides, FilterSettings::FrameSlides));
+    EXPECT_TRUE(ClickUntil(ControlId::OrderVertical, FilterSettings::HandoutsVertical));
+    EXPECT_TRUE(ClickUntil(ControlId::OutputPDF, FilterSettings::OutputPDF));
     EXPECT_TRUE(Find(ControlId::DistillerProfile)->IsEnabled());
     EXPECT_EQ("0", Saved()["HANDOUTSHORIZONTAL"]);
 }

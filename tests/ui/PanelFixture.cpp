@@ -71,6 +71,15 @@ Settings PanelFixture::Saved() {
     return settings;
 }
 
+Settings PanelFixture::Shown() const {
+    Settings settings;
+    for (const auto& [id, setting] : SettingControls)
+        settings[setting.key] = setting.kind != Setting::Flag ? Selection(id)
+                                : IsTicked(id)                ? "1"
+                                                              : "0";
+    return settings;
+}
+
 wxWindow* PanelFixture::Find(int id) const {
     wxWindow* window = m_panel->FindWindow(id);
     EXPECT_TRUE(window) << id;

@@ -1,6 +1,8 @@
 #pragma once
 
 #include "plugin/MSOfficePluginImpl.h"
+#include "plugin/interface/ControlIds.h"
+#include "plugin/settings/FilterSettings.h"
 #include "tests/support/RecordingOffice.h"
 #include "tests/support/TemporaryFolder.h"
 #include "tests/support/TestPrinter.h"
@@ -17,6 +19,28 @@
 #include <vector>
 
 using Settings = std::map<std::string, std::string>;
+
+/// Which control shows which setting.
+struct SettingControl {
+    int id;
+    const Setting& setting;
+};
+const SettingControl SettingControls[] = {
+    {ControlId::Printer, FilterSettings::Printer},
+    {ControlId::OutputPS, FilterSettings::OutputPS},
+    {ControlId::OutputPDF, FilterSettings::OutputPDF},
+    {ControlId::DistillerProfile, FilterSettings::DistillerProfile},
+    {ControlId::Print, FilterSettings::OutputType},
+    {ControlId::Colour, FilterSettings::Colour},
+    {ControlId::SlidesPerPage, FilterSettings::SlidesPerPage},
+    {ControlId::OrderHorizontal, FilterSettings::HandoutsHorizontal},
+    {ControlId::OrderVertical, FilterSettings::HandoutsVertical},
+    {ControlId::ScaleToFitPaper, FilterSettings::ScaleToFitPage},
+    {ControlId::PrintHiddenSlides, FilterSettings::PrintHiddenSlides},
+    {ControlId::FrameSlides, FilterSettings::FrameSlides},
+    {ControlId::HighQuality, FilterSettings::HighQuality},
+    {ControlId::PrintCommentsAndInkMarkup, FilterSettings::PrintCommentsAndInkMarkup},
+};
 
 /// A panel in a host's window, on a machine that the test describes.
 class PanelFixture : public testing::Test {
@@ -39,6 +63,9 @@ protected:
 
     /// What SaveSettings writes.
     Settings Saved();
+
+    /// What the controls show, by setting.
+    Settings Shown() const;
 
     wxWindow* Find(int id) const;
     wxChoice* Choice(int id) const;

@@ -1,4 +1,3 @@
-#include "plugin/interface/ControlIds.h"
 #include "tests/ui/PanelFixture.h"
 
 namespace {

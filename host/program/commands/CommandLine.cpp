@@ -1,6 +1,7 @@
 #include "host/program/commands/CommandLine.h"
 
-#include "host/program/settings/RunSettings.h"
+#include "host/program/base/ExitCode.h"
+#include "plugin/settings/FilterSettings.h"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
@@ -60,13 +61,41 @@ Output
   and whether both have the "sameMetrics", so that lines break alike.
 )";
 
+/// The choices in a row, as "1 2 3" or as "this, that or another".
+std::string ListOf(const SettingChoices& choices, const char* between, const char* beforeLast) {
+    std::string list;
+    for (const SettingChoice& choice : choices) {
+        if (&choice != choices.begin())
+            list += &choice + 1 == choices.end() ? beforeLast : between;
+        list += choice.text;
+    }
+    return list;
+}
+
+std::string ValuesOf(const Setting& setting) {
+    switch (setting.kind) {
+    case Setting::Flag:
+        return "1 0";
+    case Setting::Text:
+        return "text";
+    case Setting::Number:
+        return ListOf(setting.choices, " ", " ");
+    case Setting::Printer:
+        return "name";
+    case Setting::Profile:
+        return "file name";
+    }
+    return {};
+}
+
 std::string SettingsTable() {
     std::ostringstream table;
-    for (const SettingsKey& key : KnownSettings()) {
-        table << "  " << std::left << std::setw(27) << key.name << std::setw(13) << key.values
-              << key.meaning;
-        if (*key.standard)
-            table << " (" << key.standard << ')';
+    for (const Setting* const setting : FilterSettings::All) {
+        table << "  " << std::left << std::setw(27) << setting->key << std::setw(13)
+              << ValuesOf(*setting)
+              << (setting->meaning ? setting->meaning : ListOf(setting->choices, ", ", " or "));
+        if (*setting->standard)
+            table << " (" << setting->standard << ')';
         table << '\n';
     }
     return table.str();

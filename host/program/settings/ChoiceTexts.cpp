@@ -2,34 +2,20 @@
 
 #include "common/WQServices.h"
 #include "host/program/settings/Settings.h"
+#include "plugin/settings/FilterSettings.h"
 
 #include <wx/translation.h>
 
-#include <initializer_list>
-
-namespace {
-
-struct TextSetting {
-    const char* key;
-    std::initializer_list<const char*> choices; ///< in English
-};
-
-constexpr std::initializer_list<const char*> OutputTypes = {"Slides", "Handouts", "Notes Pages",
-                                                            "Outline View"};
-constexpr std::initializer_list<const char*> Colours = {"Color", "Grayscale",
-                                                        "Pure Black and White"};
-
-constexpr TextSetting TextSettings[] = {{"PRINTOUTPUTTYPE", OutputTypes}, {"COLOR", Colours}};
-
-} // namespace
-
 void TranslateChoices(Settings& settings) {
     const WQTranslations& catalogue = WQTranslations::GetInstance();
-    for (const TextSetting& setting : TextSettings)
-        for (const char* const choice : setting.choices)
-            if (catalogue.GetTranslations(choice).Index(settings.Value(setting.key)) !=
-                wxNOT_FOUND) {
-                settings.Set(setting.key, wxGetTranslation(choice));
+    for (const Setting* const setting : FilterSettings::All) {
+        if (setting->kind != Setting::Text)
+            continue;
+        const wxString value = settings.Value(setting->key);
+        for (const SettingChoice& choice : setting->choices)
+            if (catalogue.GetTranslations(choice.text).Index(value) != wxNOT_FOUND) {
+                settings.Set(setting->key, wxGetTranslation(choice.text));
                 break;
             }
+    }
 }

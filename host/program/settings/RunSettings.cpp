@@ -4,6 +4,7 @@
 #include "host/program/base/PathText.h"
 #include "host/program/machine/FilePrinter.h"
 #include "machine/Distiller.h"
+#include "plugin/settings/FilterSettings.h"
 
 #include <wx/intl.h>
 
@@ -12,8 +13,8 @@
 namespace {
 
 bool IsKnown(const wxString& key) {
-    return std::any_of(KnownSettings().begin(), KnownSettings().end(),
-                       [&key](const SettingsKey& known) { return key == known.name; });
+    return std::any_of(std::begin(FilterSettings::All), std::end(FilterSettings::All),
+                       [&key](const Setting* setting) { return key == setting->key; });
 }
 
 /// @return whether the text is a setting
@@ -42,7 +43,7 @@ wxString ListOf(const std::vector<wxString>& names) {
 
 /// @return whether the settings name a printer that there is
 bool CheckPrinter(const Settings& settings, Fault& fault) {
-    const wxString wanted = settings.Value("PRINTER");
+    const wxString wanted = settings.Value(FilterSettings::Printer.key);
     std::vector<wxString> names;
     for (const Printer& printer : ListPrinters())
         names.push_back(printer.name);
@@ -71,7 +72,7 @@ wxString FindProfile(const wxString& wanted, const std::vector<wxString>& names)
 
 /// @return whether the settings name a profile that there is, or none
 bool CheckProfile(const Settings& settings, Fault& fault) {
-    const wxString wanted = settings.Value("SELECTEDDISTILLERPROFILE");
+    const wxString wanted = settings.Value(FilterSettings::DistillerProfile.key);
     const std::vector<wxString> names = ListDistillerProfiles();
     if (wanted.empty() || !FindProfile(wanted, names).empty())
         return true;
@@ -86,56 +87,37 @@ void ApplyOptions(const SettingsOptions& options, Settings& settings) {
         return Shown(FromArgument(argument)); // what is no text is no name either
     };
     if (options.printer)
-        settings.Set("PRINTER", text(*options.printer));
+        settings.Set(FilterSettings::Printer.key, text(*options.printer));
     if (options.profile)
-        settings.Set("SELECTEDDISTILLERPROFILE", text(*options.profile));
+        settings.Set(FilterSettings::DistillerProfile.key, text(*options.profile));
     if (options.pdf) {
-        settings.Set("OUTPUTFILETYPEPS", *options.pdf ? "0" : "1");
-        settings.Set("OUTPUTFILETYPEPDF", *options.pdf ? "1" : "0");
+        settings.Set(FilterSettings::OutputPS.key, *options.pdf ? "0" : "1");
+        settings.Set(FilterSettings::OutputPDF.key, *options.pdf ? "1" : "0");
     }
 }
 
 } // namespace
 
-const std::vector<SettingsKey>& KnownSettings() {
-    static const std::vector<SettingsKey> s_settings = {
-        {"PRINTER", "name", "", "the printer to print on, as `quillon status` lists it"},
-        {"OUTPUTFILETYPEPS", "1 0", "0", "1: PostScript files only; 0: PDF files too"},
-        {"OUTPUTFILETYPEPDF", "1 0", "", "the opposite; counts where that is not set"},
-        {"SELECTEDDISTILLERPROFILE", "file name", "",
-         "the Distiller profile, as `quillon status` lists it"},
-        {"PRINTOUTPUTTYPE", "text", "Slides", "Slides, Handouts, Notes Pages or Outline View"},
-        {"COLOR", "text", "Color", "Color, Grayscale or Pure Black and White"},
-        {"SLIDESPERPAGE", "1 2 3 4 6 9", "6", "slides on a page of handouts"},
-        {"HANDOUTSHORIZONTAL", "1 0", "1", "1: slides of a handout run across the page"},
-        {"HANDOUTSVERTICAL", "1 0", "0", "1: slides of a handout run down the page"},
-        {"SCALETOFITPAGE", "1 0", "0", "1: slides are scaled to fit the page"},
-        {"FRAMESLIDES", "1 0", "0", "1: slides have a frame"},
-        {"PRINTHIDDENSLIDES", "1 0", "0", "1: hidden slides are printed"},
-        {"PRINTCOMMENTSANDINKMARKUP", "1 0", "0", "1: comments and ink are printed"},
-        {"HIGHQUALITY", "1 0", "0", "1: slides are printed in high quality"},
-    };
-    return s_settings;
-}
-
 void FillIn(Settings& settings) {
-    const auto fill = [&settings](const char* key, const wxString& value) {
-        if (settings.Value(key).empty() && !value.empty())
-            settings.Set(key, value);
+    const auto fill = [&settings](const Setting& setting, const wxString& value) {
+        if (settings.Value(setting.key).empty() && !value.empty())
+            settings.Set(setting.key, value);
     };
     const std::vector<Printer> printers = ListPrinters();
     if (const Printer* const preferred = PreferredPrinter(printers))
-        fill("PRINTER", preferred->name);
-    const wxString pdf = settings.Value("OUTPUTFILETYPEPDF");
-    fill("OUTPUTFILETYPEPS", pdf.empty() || pdf == "1" ? "0" : "1");
-    fill("OUTPUTFILETYPEPDF", settings.Value("OUTPUTFILETYPEPS") == "1" ? "0" : "1");
-    fill("HANDOUTSHORIZONTAL", settings.Value("HANDOUTSVERTICAL") == "1" ? "0" : "1");
-    for (const SettingsKey& key : KnownSettings())
-        fill(key.name, key.standard);
+        fill(FilterSettings::Printer, preferred->name);
+    const wxString pdf = settings.Value(FilterSettings::OutputPDF.key);
+    fill(FilterSettings::OutputPS, pdf.empty() || pdf == "1" ? "0" : "1");
+    fill(FilterSettings::OutputPDF,
+         settings.Value(FilterSettings::OutputPS.key) == "1" ? "0" : "1");
+    fill(FilterSettings::HandoutsHorizontal,
+         settings.Value(FilterSettings::HandoutsVertical.key) == "1" ? "0" : "1");
+    for (const Setting* const setting : FilterSettings::All)
+        fill(*setting, setting->standard);
     const wxString profile =
-        FindProfile(settings.Value("SELECTEDDISTILLERPROFILE"), ListDistillerProfiles());
+        FindProfile(settings.Value(FilterSettings::DistillerProfile.key), ListDistillerProfiles());
     if (!profile.empty())
-        settings.Set("SELECTEDDISTILLERPROFILE", profile);
+        settings.Set(FilterSettings::DistillerProfile.key, profile);
 }
 
 Fault UnusableSettings(const std::filesystem::path& file, const Fault& fault) {
@@ -158,7 +140,8 @@ std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Fault& f
             return std::nullopt;
     ApplyOptions(options, *settings);
     FillIn(*settings);
-    const bool takesProfile = options.profile || settings->Value("OUTPUTFILETYPEPS") != "1";
+    const bool takesProfile =
+        options.profile || settings->Value(FilterSettings::OutputPS.key) != "1";
     if (!CheckPrinter(*settings, fault) || (takesProfile && !CheckProfile(*settings, fault)))
         return std::nullopt;
     return settings;

@@ -9,16 +9,6 @@
 #include <string>
 #include <vector>
 
-/// A setting that filters know.
-struct SettingsKey {
-    const char* name;
-    const char* values;
-    const char* standard; ///< the value that holds without another; empty when it depends
-    const char* meaning;
-};
-
-const std::vector<SettingsKey>& KnownSettings();
-
 /// Fills in what the settings do not say: PDF output on the preferred printer, if there is one,
 /// and the standard values. So a window shows what a conversion with these settings does. Completes
 /// the profile's name where a user has left out its ending.

@@ -3,6 +3,7 @@
 #include "host/program/settings/Settings.h"
 #include "machine/Printers.h"
 #include "plugin/interface/ControlIds.h"
+#include "plugin/settings/FilterSettings.h"
 
 #include <wx/choice.h>
 #include <wx/intl.h>
@@ -12,8 +13,8 @@
 
 namespace {
 
-constexpr const char* PrinterKey = "PRINTER";
-constexpr const char* ProfileKey = "SELECTEDDISTILLERPROFILE";
+constexpr const char* PrinterKey = FilterSettings::Printer.key;
+constexpr const char* ProfileKey = FilterSettings::DistillerProfile.key;
 constexpr std::size_t LongestName = 40; // letters; what follows a name is to be seen
 
 wxString Shortened(const wxString& name) {

@@ -1,6 +1,7 @@
 #include "host/program/window/MessageBar.h"
 #include "host/services/CatalogueLoader.h"
 #include "plugin/interface/ControlIds.h"
+#include "plugin/settings/FilterSettings.h"
 #include "tests/ui/settings/SettingsWindow.h"
 
 #include <wx/button.h>
@@ -66,9 +67,9 @@ TEST_F(CatalogueTest, HasEveryTextThatTheProgramShows) {
         for (const wxString& key : m_keys)
             EXPECT_TRUE(wxTranslations::Get()->GetTranslatedString(key)) << language << ": " << key;
         std::set<wxString> entries;
-        for (const char* entry : {"Slides", "Handouts", "Notes Pages", "Outline View", "Color",
-                                  "Grayscale", "Pure Black and White"})
-            entries.insert(wxGetTranslation(entry));
+        for (const Setting* const setting : {&FilterSettings::OutputType, &FilterSettings::Colour})
+            for (const SettingChoice& choice : setting->choices)
+                entries.insert(wxGetTranslation(choice.text));
         EXPECT_EQ(entries.size(), 7U) << language << ": a stored entry must say which it is";
     }
 }

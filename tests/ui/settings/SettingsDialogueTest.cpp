@@ -2,6 +2,7 @@
 #include "host/program/settings/RunSettings.h"
 #include "host/program/window/MessageBar.h"
 #include "plugin/interface/ControlIds.h"
+#include "plugin/settings/FilterSettings.h"
 #include "tests/ui/settings/SettingsWindow.h"
 
 #include <wx/button.h>
@@ -108,8 +109,9 @@ TEST_F(SettingsDialogueTest, ANewFileAndRestoredDefaultsSayWhatHoldsWithoutAFile
     Settings none;
     FillIn(none);
     const auto expectSame = [&](const char* when) {
-        for (const SettingsKey& key : KnownSettings())
-            EXPECT_EQ(Value(key.name), none.Value(key.name).utf8_string()) << when << key.name;
+        for (const Setting* const setting : FilterSettings::All)
+            EXPECT_EQ(Value(setting->key), none.Value(setting->key).utf8_string())
+                << when << setting->key;
     };
     Open([this] { Save(); });
     expectSame("a new file ");
