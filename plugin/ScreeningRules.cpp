@@ -1,28 +1,37 @@
 #include "plugin/ScreeningRules.h"
 
+#include "machine/OfficeApplication.h"
 #include "office/CompoundFileCheck.h"
 #include "office/InstalledApplications.h"
 #include "office/OpenXmlCheck.h"
 
 namespace {
 
-const ScreeningRule Rules[] = {
-    {"doc", nullptr, CheckWordCompoundFile},
-    {"docx", IsWord12OrLater, CheckWordOpenXmlFile},
-    {"xls", nullptr, CheckExcelCompoundFile},
-    {"xlsx", IsExcel12OrLater, CheckExcelOpenXmlFile},
-    {"ppt", nullptr, CheckPowerPointCompoundFile},
-    {"pps", nullptr, CheckPowerPointCompoundFile},
-    {"pptx", IsPowerPoint12OrLater, CheckPowerPointOpenXmlFile},
-    {"ppsx", IsPowerPoint12OrLater, CheckPowerPointOpenXmlFile},
-    {"pub", nullptr, CheckPublisherFile},
+struct ApplicationRules {
+    OfficeApplication application;
+    ScreeningRule legacy;
+    ScreeningRule openXml;
+};
+
+const ApplicationRules Rules[] = {
+    {OfficeApplication::Word,
+     {nullptr, CheckWordCompoundFile},
+     {IsWord12OrLater, CheckWordOpenXmlFile}},
+    {OfficeApplication::Excel,
+     {nullptr, CheckExcelCompoundFile},
+     {IsExcel12OrLater, CheckExcelOpenXmlFile}},
+    {OfficeApplication::PowerPoint,
+     {nullptr, CheckPowerPointCompoundFile},
+     {IsPowerPoint12OrLater, CheckPowerPointOpenXmlFile}},
+    {OfficeApplication::Publisher, {nullptr, CheckPublisherFile}, {}}, // it has no such format
 };
 
 } // namespace
 
 const ScreeningRule* FindScreeningRule(const wxString& extension) {
-    for (const ScreeningRule& rule : Rules)
-        if (extension.IsSameAs(rule.extension, false))
-            return &rule;
+    const std::optional<OfficeApplication> application = ApplicationForExtension(extension);
+    for (const ApplicationRules& rules : Rules)
+        if (rules.application == application)
+            return IsOpenXmlExtension(extension) ? &rules.openXml : &rules.legacy;
     return nullptr;
 }

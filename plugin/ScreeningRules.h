@@ -2,9 +2,8 @@
 
 #include <wx/string.h>
 
-/// What a document of one extension must pass to be accepted.
+/// What a document of one format must pass to be accepted.
 struct ScreeningRule {
-    const char* extension;
     /// Whether the application is new enough; null for the legacy formats, which each version
     /// reads and which are admitted when the filter is ready at all.
     bool (*isVersionSufficient)();
