@@ -10,7 +10,6 @@
 #include <fstream>
 #include <string>
 #include <thread>
-#include <vector>
 
 namespace fs = std::filesystem;
 
@@ -36,10 +35,6 @@ libreofficekit_hook_2(const char* installation, const char* profile) {
         pause();
     if (fault == "threads")
         std::thread([] { pause(); }).detach();
-    if (fault == "grows") {
-        static std::vector<char> memory;
-        memory.assign(std::size_t{600} << 20, 'x');
-    }
     void* const real = dlopen((OwnFolder() / "real").c_str(), RTLD_LAZY);
     const auto start =
         reinterpret_cast<decltype(&libreofficekit_hook_2)>(dlsym(real, "libreofficekit_hook_2"));
