@@ -96,6 +96,20 @@ std::vector<std::string> OptionsForWorkers(const CommonOptions& options) {
     return arguments;
 }
 
+CLI::App& AddSubcommand(CLI::App& program, const std::string& name, const std::string& description,
+                        std::function<void()> choose) {
+    CLI::App* const command = program.add_subcommand(name, description);
+    if (description.empty())
+        command->group("");
+    command->final_callback(std::move(choose));
+    return *command;
+}
+
+void AddRequired(CLI::App& command, const std::string& name, const std::string& type,
+                 const std::string& description, std::string& value) {
+    command.add_option(name, value, description)->required()->type_name(type);
+}
+
 void AddPaths(CLI::App& command, std::vector<std::string>& paths) {
     command.add_option("PATH", paths, "Files, or folders of files")->required();
 }

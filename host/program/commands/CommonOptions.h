@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
@@ -33,6 +34,21 @@ void AddCommonOptions(CLI::App& program, CommonOptions& options);
 
 /// The options that a run hands on to its workers.
 std::vector<std::string> OptionsForWorkers(const CommonOptions& options);
+
+// By these, most commands do without the headers of the command line's library, which take long.
+
+/// Adds a command to the program's.
+/// @param description for the help, which does not show the command when it is empty
+/// @param choose is called when it is asked for
+/// @return the command; the program's
+CLI::App& AddSubcommand(CLI::App& program, const std::string& name, const std::string& description,
+                        std::function<void()> choose);
+
+/// Adds an option that has to be given.
+/// @param type what its value is called in the help
+/// @param value receives it, and outlives the parsing
+void AddRequired(CLI::App& command, const std::string& name, const std::string& type,
+                 const std::string& description, std::string& value);
 
 /// Adds the files that a command works on.
 /// @param paths receives what is given, and outlives the parsing

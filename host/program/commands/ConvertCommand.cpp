@@ -175,9 +175,7 @@ void AddConvert(CLI::App& program, Command& chosen) {
         program.add_subcommand("convert", "Convert documents: quillon convert PATH… --out DIR");
     const auto given = std::make_shared<ConvertOptions>();
     AddPaths(*convert, given->paths);
-    convert->add_option("-o,--out", given->out, "The folder for the output")
-        ->required()
-        ->type_name("DIR");
+    AddRequired(*convert, "-o,--out", "DIR", "The folder for the output", given->out);
     AddSettingsOptions(*convert, given->settings);
     convert
         ->add_option("-j,--jobs", given->jobs,

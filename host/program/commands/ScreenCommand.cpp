@@ -6,8 +6,6 @@
 #include "host/program/system/Interruption.h"
 #include "host/program/workers/WorkerCount.h"
 
-#include <CLI/CLI.hpp>
-
 namespace {
 
 using Paths = std::vector<std::string>;
@@ -31,14 +29,15 @@ ExitCode Run(const Paths& paths, const CommonOptions& options, Reporter& reporte
 } // namespace
 
 void AddScreen(CLI::App& program, Command& chosen) {
-    CLI::App* const screen = program.add_subcommand(
-        "screen", "Show which files can be converted, converting none: quillon screen PATH…");
     const auto paths = std::make_shared<Paths>();
-    AddPaths(*screen, *paths);
-    screen->final_callback([&chosen, paths] {
-        chosen.opensDocuments = true;
-        chosen.run = [paths](const CommonOptions& options, Reporter& reporter) {
-            return Run(*paths, options, reporter);
-        };
-    });
+    CLI::App& screen =
+        AddSubcommand(program, "screen",
+                      "Show which files can be converted, converting none: quillon screen PATH…",
+                      [&chosen, paths] {
+                          chosen.opensDocuments = true;
+                          chosen.run = [paths](const CommonOptions& options, Reporter& reporter) {
+                              return Run(*paths, options, reporter);
+                          };
+                      });
+    AddPaths(screen, *paths);
 }

@@ -6,8 +6,6 @@
 
 #include <wx/intl.h>
 
-#include <CLI/CLI.hpp>
-
 namespace {
 
 ExitCode Run(const std::filesystem::path& file, const CommonOptions& options, Reporter& reporter) {
@@ -34,17 +32,17 @@ ExitCode Run(const std::filesystem::path& file, const CommonOptions& options, Re
 } // namespace
 
 void AddSettings(CLI::App& program, Command& chosen) {
-    CLI::App* const settings = program.add_subcommand(
-        "settings", "Show the filters' settings in a window and change them:\n"
-                    "quillon settings --settings FILE.xml");
     const auto file = std::make_shared<std::string>();
-    settings->add_option("--settings", *file, "The file; if there is none, it is made")
-        ->required()
-        ->type_name("FILE.xml");
-    settings->final_callback([&chosen, file] {
-        chosen.showsWindows = true;
-        chosen.run = [file](const CommonOptions& options, Reporter& reporter) {
-            return Run(FromArgument(*file), options, reporter);
-        };
-    });
+    CLI::App& settings =
+        AddSubcommand(program, "settings",
+                      "Show the filters' settings in a window and change them:\n"
+                      "quillon settings --settings FILE.xml",
+                      [&chosen, file] {
+                          chosen.showsWindows = true;
+                          chosen.run = [file](const CommonOptions& options, Reporter& reporter) {
+                              return Run(FromArgument(*file), options, reporter);
+                          };
+                      });
+    AddRequired(settings, "--settings", "FILE.xml", "The file; if there is none, it is made",
+                *file);
 }

@@ -11,8 +11,6 @@
 
 #include <wx/intl.h>
 
-#include <CLI/CLI.hpp>
-
 namespace {
 
 constexpr std::size_t NameColumn = 14;
@@ -195,9 +193,9 @@ ExitCode Run(const CommonOptions& options, Reporter& reporter) {
 } // namespace
 
 void AddStatus(CLI::App& program, Command& chosen) {
-    program.add_subcommand("status", "Show what there is to convert with, and what is missing")
-        ->final_callback([&chosen] {
-            chosen.examinesEngine = true;
-            chosen.run = Run;
-        });
+    AddSubcommand(program, "status", "Show what there is to convert with, and what is missing",
+                  [&chosen] {
+                      chosen.examinesEngine = true;
+                      chosen.run = Run;
+                  });
 }

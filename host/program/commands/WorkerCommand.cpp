@@ -5,7 +5,6 @@
 #include "host/program/system/ChildProcess.h"
 #include "host/program/workers/Messages.h"
 
-#include <CLI/CLI.hpp>
 #include <condition_variable>
 #include <deque>
 #include <mutex>
@@ -134,7 +133,7 @@ ExitCode RunWorker(const CommonOptions& options, Reporter& /*reporter*/) {
 } // namespace
 
 void AddWorker(CLI::App& program, Command& chosen) {
-    program.add_subcommand("worker")->group("")->final_callback([&chosen] {
+    AddSubcommand(program, "worker", "", [&chosen] {
         chosen.isWorker = true;
         chosen.run = RunWorker;
     });
