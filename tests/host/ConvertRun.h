@@ -3,7 +3,7 @@
 #include "tests/host/Program.h"
 #include "tests/support/TemporaryFolder.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 using Arguments = std::vector<std::string>;
 using Names = std::vector<std::string>;

@@ -20,8 +20,8 @@ TEST_F(ConvertTest, DrivesTheFilterInItsOrderAndReportsTheOutput) {
     EXPECT_EQ(document["output"], OutputPath("a.ps"));
     EXPECT_EQ(document["code"], 0);
     EXPECT_TRUE(document["seconds"].is_number());
-    EXPECT_NE(run.err.find("a.doc: 50 %  Printing"), std::string::npos) << run.err;
-    EXPECT_NE(Output("a.ps").find("<ServerVersion>16</ServerVersion>"), std::string::npos);
+    EXPECT_THAT(run.err, HasSubstr("a.doc: 50 %  Printing"));
+    EXPECT_THAT(Output("a.ps"), HasSubstr("<ServerVersion>16</ServerVersion>"));
 
     const std::string records = ReadBytes(log);
     std::size_t at = 0;
@@ -75,10 +75,9 @@ TEST_F(ConvertTest, FontsThatAreNotThereAreToldOfTheDocumentThatAsksForThem) {
                   R"([{"asked":"Calibri","sameMetrics":true,"used":"Carlito"},)"
                   R"({"asked":"Futura","sameMetrics":false,"used":"DejaVu Sans"}])");
         EXPECT_EQ(documents.at(1)["fonts"].dump(), "[]");
-        EXPECT_NE(run.err.find("fonts not installed: Calibri (set in Carlito, of the same widths), "
-                               "Futura (set in DejaVu Sans)"),
-                  std::string::npos)
-            << run.err;
+        EXPECT_THAT(run.err,
+                    HasSubstr("fonts not installed: Calibri (set in Carlito, of the same widths), "
+                              "Futura (set in DejaVu Sans)"));
     }
 }
 

@@ -12,10 +12,21 @@ namespace {
 /// Distiller's bridge that makes files.
 class EndToEndTest : public ConvertRun {
 protected:
+    void SetUp() override { Change(""); }
+
     void TearDown() override {
-        for (const char* module : {"PrintingWord", "PrintingDistiller", "ScriptedMachine"})
+        for (const char* module : {"PrintingWord", "ScriptedMachine"})
             UnregisterStandIn(TEST_OFFICE "/" + std::string(module));
         wxUnsetEnv("SCRIPTED_MACHINE");
+    }
+
+    /// @param more changes of the machine that has Word and Distiller
+    static void Change(const std::string& more) {
+        const std::string machine =
+            "text HKLM\\SOFTWARE\\Orvanta\\Marlo Quillon|InstallPath|" TEST_INSTALLATION
+            "\ntext HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\9.0|JobOptionsFolder|" TEST_PROFILES
+            "\nflag HKCU\\Software\\Scripted Bridge|MakesPdf\n";
+        wxSetEnv("SCRIPTED_MACHINE", wxString::FromUTF8(machine + more));
     }
 
     static RunResult Run(const Arguments& arguments) {
@@ -57,11 +68,10 @@ TEST_F(EndToEndTest, TheBridgeFindsTheProfilesThatTheFilterLists) {
     if (!fs::exists(bin / "Filters/orv_dist.dll"))
         GTEST_SKIP() << "there is no stand-in for Distiller on this system";
     m_folder.Write("Old.joboptions", "<< /CompatibilityLevel 1.3 >> setdistillerparams");
-    wxSetEnv("SCRIPTED_MACHINE",
-             "text HKLM\\SOFTWARE\\Orvanta\\Marlo Quillon|InstallPath|" + bin.string() +
-                 "\ntext HKLM\\SOFTWARE\\Orvanta\\Distiller Stand-In|Engine|Ghostscript" +
-                 "\ntext HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\9.0|JobOptionsFolder|" +
-                 m_folder.Path().string());
+    Change("text HKLM\\SOFTWARE\\Orvanta\\Marlo Quillon|InstallPath|" + bin.string() +
+           "\ntext HKLM\\SOFTWARE\\Orvanta\\Distiller Stand-In|Engine|Ghostscript" +
+           "\ntext HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\9.0|JobOptionsFolder|" +
+           m_folder.Path().string());
     const RunResult run = ConvertByFilter(TEST_SAMPLES "/letter.docx", {"--profile", "old"});
     EXPECT_EQ(run.exitCode, 0) << run.err;
     EXPECT_EQ(Output("letter.pdf").substr(0, 8), "%PDF-1.3");
@@ -96,11 +106,11 @@ TEST_F(EndToEndTest, NothingContradictsWhatStatusSays) {
         {"", true, 0, "Ready to convert doc docx.", "book.xls", 1014, 2},
     };
     for (const auto& each : cases) {
-        wxSetEnv("SCRIPTED_MACHINE", wxString::FromUTF8(noExcel + each.machine));
+        Change(noExcel + each.machine);
         const RunResult status = Run({"status"});
         EXPECT_EQ(status.exitCode, each.statusCode) << status.err;
         EXPECT_EQ(status.Records("filter").at(0)["ready"], each.isReady) << status.err;
-        EXPECT_NE(status.err.find(each.told), std::string::npos) << status.err;
+        EXPECT_THAT(status.err, HasSubstr(each.told));
         const fs::path document = fs::u8path(TEST_SAMPLES) / each.document;
         const RunResult screen = Run({"screen", document.u8string()});
         const RunResult convert = ConvertByFilter(document, {});

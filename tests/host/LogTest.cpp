@@ -6,7 +6,7 @@
 
 #include <wx/regex.h>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 #include <memory>
 #include <set>
@@ -54,10 +54,8 @@ TEST(Log, APieceOfAnyKindMakesOneLineWithItsPlace) {
         << static_cast<const char*>(nullptr);
     const std::vector<std::string> lines = LinesOf(folder / "log");
     ASSERT_EQ(lines.size(), 1U);
-    EXPECT_NE(lines[0].find("ERROR ["), std::string::npos) << lines[0];
-    EXPECT_NE(lines[0].find("] Some.cpp:7 Do: two\\nlines, \xD0\x96 \xC3\xBF not UTF-8"),
-              std::string::npos)
-        << lines[0];
+    EXPECT_THAT(lines[0], HasSubstr("ERROR ["));
+    EXPECT_THAT(lines[0], HasSubstr("] Some.cpp:7 Do: two\\nlines, \xD0\x96 \xC3\xBF not UTF-8"));
 }
 
 TEST(Log, AFileThatCannotBeOpenedChangesNothing) {

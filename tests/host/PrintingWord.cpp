@@ -1,8 +1,8 @@
 // A stand-in for tests of the host: a Word that opens anything and prints one line of PostScript,
 // as an in-process server. All of its objects are one.
 
-#include <objbase.h>
-#include <oleauto.h>
+#include "tests/support/CountedObject.h"
+
 #include <windows.h>
 
 #include <wx/file.h>
@@ -34,30 +34,8 @@ const wchar_t* FirstText(const DISPPARAMS& arguments) {
     return nullptr;
 }
 
-/// Lives as long as the module.
-template <typename Interface, const IID& Id>
-class Lasting : public Interface {
+class Word : public CountedDispatch {
 public:
-    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID iid, void** object) override {
-        *object = iid == IID_IUnknown || iid == Id ? this : nullptr;
-        return *object ? S_OK : E_NOINTERFACE;
-    }
-    ULONG STDMETHODCALLTYPE AddRef() override { return 2; }
-    ULONG STDMETHODCALLTYPE Release() override { return 1; }
-
-    virtual ~Lasting() = default;
-};
-
-class Word : public Lasting<IDispatch, IID_IDispatch> {
-public:
-    HRESULT STDMETHODCALLTYPE GetTypeInfoCount(UINT* count) override {
-        *count = 0;
-        return S_OK;
-    }
-    HRESULT STDMETHODCALLTYPE GetTypeInfo(UINT, LCID, ITypeInfo**) override { return E_NOTIMPL; }
-    HRESULT STDMETHODCALLTYPE GetIDsOfNames(REFIID, LPOLESTR*, UINT, LCID, DISPID*) override {
-        return DISP_E_UNKNOWNNAME;
-    }
     HRESULT STDMETHODCALLTYPE Invoke(DISPID member, REFIID, LCID, WORD flags, DISPPARAMS* arguments,
                                      VARIANT* result, EXCEPINFO*, UINT*) override {
         if (member == PrintOut && !Print(FirstText(*arguments)))
@@ -67,6 +45,7 @@ public:
                 if (each == member) {
                     result->vt = VT_DISPATCH;
                     result->pdispVal = this;
+                    AddRef();
                 }
         return S_OK;
     }
@@ -78,19 +57,6 @@ private:
     }
 };
 
-Word& TheWord() {
-    static Word word;
-    return word;
-}
-
-class WordClass : public Lasting<IClassFactory, IID_IClassFactory> {
-public:
-    HRESULT STDMETHODCALLTYPE CreateInstance(IUnknown*, REFIID iid, void** object) override {
-        return TheWord().QueryInterface(iid, object);
-    }
-    HRESULT STDMETHODCALLTYPE LockServer(BOOL) override { return S_OK; }
-};
-
 void Enter(const wxString& keyName, const char* valueName, const wxString& text) {
     wxRegKey key(wxRegKey::HKCR, keyName);
     key.Create();
@@ -100,7 +66,7 @@ void Enter(const wxString& keyName, const char* valueName, const wxString& text)
 } // namespace
 
 STDAPI DllGetClassObject(REFCLSID clsid, REFIID iid, LPVOID* object) {
-    static WordClass wordClass;
+    static CountedFactory<Word> wordClass;
     *object = nullptr;
     return clsid == PrintingClass ? wordClass.QueryInterface(iid, object)
                                   : CLASS_E_CLASSNOTAVAILABLE;

@@ -2,12 +2,16 @@
 
 #include "tests/support/TemporaryFolder.h"
 
+#include <gmock/gmock.h>
+
 #include <cstdint>
 #include <filesystem>
 #include <functional>
 #include <nlohmann/json.hpp>
 #include <string>
 #include <vector>
+
+using testing::HasSubstr;
 
 /// What a program's run came to.
 struct RunResult {

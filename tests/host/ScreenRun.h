@@ -3,7 +3,7 @@
 #include "tests/host/Program.h"
 #include "tests/support/TemporaryFolder.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 /// Screens files with the scripted filter.
 class ScreenTest : public testing::Test {
@@ -22,8 +22,7 @@ protected:
         EXPECT_EQ(document["state"], "refused") << path;
         EXPECT_EQ(document["code"], code) << path;
         EXPECT_EQ(document["text"], "text of " + std::to_string(code)) << path;
-        EXPECT_NE(document["reason"].get<std::string>().find(reason), std::string::npos)
-            << path << document;
+        EXPECT_THAT(document["reason"].get<std::string>(), HasSubstr(reason)) << path << document;
     }
 
     /// @param name of a file, UTF-8
@@ -34,7 +33,7 @@ protected:
         ASSERT_EQ(run.Records("document").size(), 1U) << run.err;
         EXPECT_EQ(run.Records("document")[0]["input"], path.u8string());
         const auto separator = static_cast<char>(std::filesystem::path::preferred_separator);
-        EXPECT_NE(run.err.find(separator + shown + ": accepted"), std::string::npos) << run.err;
+        EXPECT_THAT(run.err, HasSubstr(separator + shown + ": accepted"));
     }
 
     TemporaryFolder m_folder;

@@ -2,7 +2,7 @@
 
 #include <wx/utils.h>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 namespace fs = std::filesystem;
 
@@ -97,7 +97,7 @@ TEST_F(ScreenTest, EachFileCountsOnceAndAnEmptyFolderIsDone) {
     fs::create_directory(m_folder / "empty");
     const RunResult idle = RunQuillon({"screen", (m_folder / "empty").string()});
     EXPECT_EQ(idle.exitCode, 0);
-    EXPECT_NE(idle.out.find("Nothing to do"), std::string::npos);
+    EXPECT_THAT(idle.out, HasSubstr("Nothing to do"));
 }
 
 } // namespace

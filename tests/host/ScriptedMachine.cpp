@@ -1,6 +1,6 @@
 // A stand-in for tests of the host: changes the registry of the machine that the other stand-ins of
 // its folder have made, as the environment says, in lines "delete KEY", "key KEY" and
-// "text KEY|VALUE|TEXT". A key begins with HKCR, HKCU or HKLM.
+// "text KEY|VALUE|TEXT", "flag KEY|VALUE". A key begins with HKCR, HKCU or HKLM.
 
 #include <objbase.h>
 #include <windows.h>
@@ -40,6 +40,8 @@ STDAPI DllRegisterServer() {
                 key.Create();
             if (verb == "text")
                 key.SetValue(name, text);
+            if (verb == "flag")
+                key.SetValue(name, 1L);
         });
     return S_OK;
 }

@@ -4,15 +4,13 @@
 
 #include <wx/utils.h>
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 namespace {
 
 using nlohmann::json;
-
-bool Contains(const std::string& text, const std::string& part) {
-    return text.find(part) != std::string::npos;
-}
+using testing::AllOf;
+using testing::Not;
 
 TEST(Status, TellsWhatThereIs) {
     const RunResult run = RunQuillon({"status", "--json"});
@@ -31,7 +29,7 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(applications[0]["version"], "16");
     EXPECT_EQ(applications[0]["usable"], true);
     EXPECT_EQ(applications[2]["installed"], false);
-    EXPECT_TRUE(Contains(applications[2]["advice"], System::PowerPointAdvice));
+    EXPECT_THAT(applications[2]["advice"].get<std::string>(), HasSubstr(System::PowerPointAdvice));
 
     std::vector<json> preferred;
     for (const json& printer : run.Records("printer"))
@@ -43,22 +41,21 @@ TEST(Status, TellsWhatThereIs) {
     EXPECT_EQ(run.Records("distiller").at(0)["profiles"], json{"Press.joboptions"});
     EXPECT_EQ(run.Records("panel").at(0)["enabled"], true);
     EXPECT_TRUE(run.Records("missing").empty()) << run.out;
-    EXPECT_TRUE(Contains(run.err, "Ready to convert doc docx xls xlsx.")) << run.err;
+    EXPECT_THAT(run.err, HasSubstr("Ready to convert doc docx xls xlsx."));
     EXPECT_EQ(run.Records("summary").at(0)["convertible"], (json{"doc", "docx", "xls", "xlsx"}));
 }
 
 TEST(Status, HandsTheLimitsToTheEnginesAndTheFilters) {
     const RunResult run = RunQuillon(
         {"status", "--engine-stall", "5", "--engine-limit", "60", "--memory-limit", "512"});
-    EXPECT_TRUE(Contains(run.out, "Scripted engine, 5 of 60 s, 512 MB, output 5 of 60 s"))
-        << run.out;
-    EXPECT_TRUE(Contains(RunQuillon({"status"}).out,
-                         "Scripted engine, 0 of 0 s, 3584 MB, output 0 of 0 s"));
+    EXPECT_THAT(run.out, HasSubstr("Scripted engine, 5 of 60 s, 512 MB, output 5 of 60 s"));
+    EXPECT_THAT(RunQuillon({"status"}).out,
+                HasSubstr("Scripted engine, 0 of 0 s, 3584 MB, output 0 of 0 s"));
 }
 
 TEST(Status, TellsWhatDocumentsAreNotKeptFrom) {
-    EXPECT_TRUE(
-        Contains(RunQuillon({"status", "--require-isolation"}).out, "full (Scripted walls)"));
+    EXPECT_THAT(RunQuillon({"status", "--require-isolation"}).out,
+                HasSubstr("full (Scripted walls)"));
     const TemporaryFolder folder;
     const std::string document = folder.Write("letter.docx", "PK\x03\x04\n").u8string();
     const std::string gap = "network and processes are not kept from documents";
@@ -73,16 +70,14 @@ TEST(Status, TellsWhatDocumentsAreNotKeptFrom) {
     wxUnsetEnv("SCRIPTED_GAP");
 
     EXPECT_EQ(status.exitCode, 0) << status.out;
-    EXPECT_TRUE(Contains(status.out, "incomplete: " + gap)) << status.out;
+    EXPECT_THAT(status.out, HasSubstr("incomplete: " + gap));
     EXPECT_EQ(warned.exitCode, 0) << warned.err;
-    EXPECT_TRUE(Contains(warned.err, "WARN") && Contains(warned.err, gap)) << warned.err;
+    EXPECT_THAT(warned.err, AllOf(HasSubstr("WARN"), HasSubstr(gap)));
     EXPECT_EQ(refused.exitCode, 2);
-    EXPECT_TRUE(Contains(refused.err, gap) && Contains(refused.err, "or without --require"))
-        << refused.err;
+    EXPECT_THAT(refused.err, AllOf(HasSubstr(gap), HasSubstr("or without --require")));
     EXPECT_EQ(refused.out, "");
     EXPECT_EQ(incomplete.exitCode, 2);
-    EXPECT_TRUE(Contains(incomplete.out, "Es fehlt: Dokumente sind nicht von Netzwerk"))
-        << incomplete.out;
+    EXPECT_THAT(incomplete.out, HasSubstr("Es fehlt: Dokumente sind nicht von Netzwerk"));
 }
 
 TEST(Status, TellsWhatIsMissingAndWhatToDo) {
@@ -92,15 +87,15 @@ TEST(Status, TellsWhatIsMissingAndWhatToDo) {
     const RunResult noOffice =
         RunProgram({QUILLON_PROGRAM, "status", "--filters", TEST_FILTERS, "--stand-ins", folder});
     EXPECT_EQ(noOffice.exitCode, 2);
-    EXPECT_TRUE(Contains(noOffice.out, "No Office application is installed")) << noOffice.out;
-    EXPECT_TRUE(Contains(noOffice.out, System::OfficeAdvice)) << noOffice.out;
-    EXPECT_TRUE(Contains(noOffice.out, "disabled: no Office application is installed"));
-    EXPECT_TRUE(Contains(noOffice.out, "ask for PostScript with --ps")) << noOffice.out;
+    EXPECT_THAT(noOffice.out, HasSubstr("No Office application is installed"));
+    EXPECT_THAT(noOffice.out, HasSubstr(System::OfficeAdvice));
+    EXPECT_THAT(noOffice.out, HasSubstr("disabled: no Office application is installed"));
+    EXPECT_THAT(noOffice.out, HasSubstr("ask for PostScript with --ps"));
 
     const RunResult noFilter =
         RunProgram({QUILLON_PROGRAM, "status", "--filters", folder, "--stand-ins", TEST_STAND_INS});
     EXPECT_EQ(noFilter.exitCode, 2);
-    EXPECT_TRUE(Contains(noFilter.out, "There is no filter")) << noFilter.out;
+    EXPECT_THAT(noFilter.out, HasSubstr("There is no filter"));
 }
 
 TEST(Status, TakesTheFiltersWordForIt) {
@@ -108,9 +103,9 @@ TEST(Status, TakesTheFiltersWordForIt) {
     const RunResult run = RunQuillon({"status"});
     wxUnsetEnv("SCRIPTED_FILTER_UNREADY");
     EXPECT_EQ(run.exitCode, 2);
-    EXPECT_TRUE(Contains(run.out, "not ready, text of -1006")) << run.out;
-    EXPECT_TRUE(Contains(run.out, "Missing: The filter Scripted is not ready")) << run.out;
-    EXPECT_FALSE(Contains(run.out, "Ready to convert")) << run.out;
+    EXPECT_THAT(run.out, HasSubstr("not ready, text of -1006"));
+    EXPECT_THAT(run.out, HasSubstr("Missing: The filter Scripted is not ready"));
+    EXPECT_THAT(run.out, Not(HasSubstr("Ready to convert")));
 }
 
 TEST(Status, PassesOverWhatIsNoFilter) {
@@ -126,9 +121,9 @@ TEST(Status, PassesOverWhatIsNoFilter) {
                     TEST_STAND_INS, "--log", log});
     EXPECT_EQ(run.exitCode, 2);
     const std::string records = ReadBytes(log);
-    EXPECT_TRUE(Contains(records, "INFO ") && Contains(records, "Other" + suffix)) << records;
-    EXPECT_TRUE(Contains(records, "WARN ") && Contains(records, "Broken" + suffix)) << records;
-    EXPECT_FALSE(Contains(records, "readme.txt")) << records;
+    EXPECT_THAT(records, AllOf(HasSubstr("INFO "), HasSubstr("Other" + suffix)));
+    EXPECT_THAT(records, AllOf(HasSubstr("WARN "), HasSubstr("Broken" + suffix)));
+    EXPECT_THAT(records, Not(HasSubstr("readme.txt")));
 }
 
 } // namespace

@@ -1,7 +1,7 @@
 #include "tests/host/Program.h"
 #include "tests/support/TemporaryFolder.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 #include <algorithm>
 
@@ -24,7 +24,7 @@ protected:
     void ExpectRefusal(const Arguments& arguments, const std::string& reason) const {
         const RunResult run = RunQuillon(arguments);
         EXPECT_EQ(run.exitCode, 3) << testing::PrintToString(arguments);
-        EXPECT_NE(run.err.find(reason), std::string::npos) << run.err;
+        EXPECT_THAT(run.err, HasSubstr(reason));
         EXPECT_EQ(run.out, "") << testing::PrintToString(arguments);
         EXPECT_TRUE(fs::is_empty(m_folder / "out"));
     }
@@ -97,8 +97,7 @@ TEST_F(UsageTest, OfARecordReader) {
     const RunResult run = RunQuillon(Convert({"--json", "--printer", "Nobody's"}));
     EXPECT_EQ(run.exitCode, 3);
     ASSERT_EQ(run.Records("error").size(), 1U);
-    EXPECT_NE(run.Records("error")[0]["text"].get<std::string>().find("Nobody's"),
-              std::string::npos);
+    EXPECT_THAT(run.Records("error")[0]["text"].get<std::string>(), HasSubstr("Nobody's"));
 }
 
 TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
@@ -106,7 +105,7 @@ TEST_F(UsageTest, HelpSaysItAllFromEveryCommand) {
     for (const char* word :
          {"status", "screen", "convert", "--settings", "--engine-stall", "SLIDESPERPAGE",
           "Exit codes", "budget.xls.pdf", "--lang", "--profile", "settings"})
-        EXPECT_NE(help.find(word), std::string::npos) << word;
+        EXPECT_THAT(help, HasSubstr(word)) << word;
     const RunResult ofCommand = RunQuillon({"convert", "--help"});
     EXPECT_EQ(ofCommand.exitCode, 0);
     EXPECT_EQ(ofCommand.out, help);
@@ -118,7 +117,7 @@ TEST_F(UsageTest, NothingAskedForShowsOneScreenOfHelp) {
     EXPECT_EQ(bare.out, "");
     EXPECT_LE(std::count(bare.err.begin(), bare.err.end(), '\n'), ScreenLines) << bare.err;
     for (const char* word : {"status", "screen", "convert", "settings", "quillon --help"})
-        EXPECT_NE(bare.err.find(word), std::string::npos) << word;
+        EXPECT_THAT(bare.err, HasSubstr(word)) << word;
 }
 
 TEST_F(UsageTest, TellsTheVersion) {

@@ -76,8 +76,7 @@ TEST_F(WorkersTest, OneThatEndsOrStopsFailsItsDocumentOnly) {
                   (Names{"converted", "failed", "converted", "converted", "converted"}));
         const json failed = run.Records("document").at(1);
         EXPECT_EQ(failed["code"], -1003);
-        EXPECT_NE(failed["reason"].get<std::string>().find(each.reason), std::string::npos)
-            << failed;
+        EXPECT_THAT(failed["reason"].get<std::string>(), HasSubstr(each.reason)) << failed;
         EXPECT_EQ(Outputs(), (Names{"a.ps", "c.ps", "d.ps", "e.ps"}));
         ExpectNoneLeft(log);
     }
@@ -92,7 +91,7 @@ TEST_F(WorkersTest, OneThatSomebodyEndsHasItsDocumentTriedOnceMore) {
     EXPECT_EQ(States(run), (Names{"converted", "failed", "converted"}));
     const json failed = run.Records("document").at(1);
     EXPECT_EQ(failed["fault"], "machine");
-    EXPECT_NE(failed["reason"].get<std::string>().find("second try"), std::string::npos) << failed;
+    EXPECT_THAT(failed["reason"].get<std::string>(), HasSubstr("second try")) << failed;
     EXPECT_EQ(Outputs(), (Names{"a.ps", "c.ps"}));
 }
 

@@ -1,5 +1,5 @@
-#include "tests/platform/CountedFactory.h"
 #include "tests/platform/TestServer.h"
+#include "tests/support/CountedObject.h"
 #include "tests/support/RegistryText.h"
 #include "tests/support/Wine.h"
 
@@ -73,7 +73,7 @@ TEST_F(Com, AProgIdLeadsToTheClassIdThatIsEnteredForIt) {
 }
 
 TEST_F(Com, AClassObjectServesUntilItIsRevoked) {
-    CountedFactory factory;
+    CountedFactory<Counted<IUnknown>> factory;
     DWORD cookie = 0;
     ASSERT_EQ(S_OK, CoRegisterClassObject(RegisteredClass, &factory, CLSCTX_INPROC_SERVER,
                                           REGCLS_MULTIPLEUSE, &cookie));

@@ -2,12 +2,12 @@
 
 #include "tests/platform/TestServer.h"
 
-#include "tests/platform/CountedFactory.h"
+#include "tests/support/CountedObject.h"
 
 namespace {
 
-CountedFactory& Factory() {
-    static CountedFactory factory;
+CountedFactory<Counted<IUnknown>>& Factory() {
+    static CountedFactory<Counted<IUnknown>> factory;
     return factory;
 }
 

@@ -4,13 +4,10 @@
 #include "tests/standins/Viewers.h"
 #include "tests/support/CompoundFile.h"
 
-#include <wx/string.h>
-
 #include <fcntl.h>
 #include <gmock/gmock.h>
 
 #include <cstdlib>
-#include <string_view>
 
 namespace fs = std::filesystem;
 using namespace std::chrono_literals;
@@ -23,24 +20,6 @@ namespace {
 // Each document has a cell with a function of its own macros in it, which is run when the document
 // is opened, and shows this word.
 constexpr const char* Shown = "macro42";
-
-constexpr std::string_view SpreadsheetWithBasic = R"--(<?xml version="1.0" encoding="UTF-8"?>
-<office:document xmlns:office="urn:oasis:names:tc:opendocument:xmlns:office:1.0"
-    xmlns:table="urn:oasis:names:tc:opendocument:xmlns:table:1.0"
-    xmlns:of="urn:oasis:names:tc:opendocument:xmlns:of:1.2"
-    xmlns:script="urn:oasis:names:tc:opendocument:xmlns:script:1.0"
-    xmlns:ooo="http://openoffice.org/2004/office" office:version="1.3"
-    office:mimetype="application/vnd.oasis.opendocument.spreadsheet">
-<office:scripts><office:script script:language="ooo:Basic"><ooo:libraries>
-<ooo:library-embedded ooo:name="Standard"><ooo:module ooo:name="Module1"><ooo:source-code>
-Function Answer
-    Answer = "macro" &amp; 6 * 7
-End Function
-</ooo:source-code></ooo:module></ooo:library-embedded></ooo:libraries></office:script>
-</office:scripts>
-<office:body><office:spreadsheet><table:table table:name="A"><table:table-row>
-<table:table-cell table:formula="of:=ANSWER()"/></table:table-row></table:table>
-</office:spreadsheet></office:body></office:document>)--";
 
 std::string Number(unsigned value, int bytes) {
     std::string number;
@@ -86,45 +65,13 @@ std::string VbaProject() {
     return file.Bytes();
 }
 
-/// A workbook with a place for the project.
-std::string Workbook() {
-    return Package({
-        {"[Content_Types].xml", R"(
-<Types xmlns="$/package/2006/content-types">
-  <Default Extension="rels"
-           ContentType="application/vnd.openxmlformats-package.relationships+xml"/>
-  <Default Extension="bin" ContentType="application/vnd.ms-office.vbaProject"/>
-  <Override PartName="/workbook.xml"
-            ContentType="application/vnd.ms-excel.sheet.macroEnabled.main+xml"/>
-  <Override PartName="/sheet.xml" ContentType=
-            "application/vnd.openxmlformats-officedocument.spreadsheetml.worksheet+xml"/>
-</Types>)"},
-        {"_rels/.rels", R"(<Relationships xmlns="$/package/2006/relationships"><Relationship
-    Id="rId1" Target="workbook.xml"
-    Type="$/officeDocument/2006/relationships/officeDocument"/></Relationships>)"},
-        {"_rels/workbook.xml.rels", R"(<Relationships xmlns="$/package/2006/relationships">
-  <Relationship Id="rId1" Target="sheet.xml" Type="$/officeDocument/2006/relationships/worksheet"/>
-  <Relationship Id="rId2" Target="vbaProject.bin"
-                Type="http://schemas.microsoft.com/office/2006/relationships/vbaProject"/>
-</Relationships>)"},
-        {"workbook.xml", R"(
-<workbook xmlns="$/spreadsheetml/2006/main" xmlns:r="$/officeDocument/2006/relationships">
-  <sheets><sheet name="A" sheetId="1" r:id="rId1"/></sheets>
-</workbook>)"},
-        {"sheet.xml", R"(
-<worksheet xmlns="$/spreadsheetml/2006/main"><sheetData><row r="1">
-  <c r="A1"><f>Answer()</f></c></row></sheetData></worksheet>)"},
-        {"vbaProject.bin", ""},
-    });
-}
-
 class MacroTest : public OfficeTest {
 protected:
     MacroTest() {
-        m_files.Write("plain.xlsx", Workbook());
+        m_files.Write("plain.xlsx", Package("macro-workbook"));
         m_vba = m_files.Write("vba.xlsx",
                               WithPart(m_files / "plain.xlsx", "vbaProject.bin", VbaProject()));
-        m_basic = m_files.Write("basic.fods", SpreadsheetWithBasic);
+        m_basic = m_files.Write("basic.fods", TestText("basic.fods"));
     }
 
     fs::path m_vba;
@@ -140,30 +87,10 @@ public:
 
     /// The words of a spreadsheet.
     std::string TextOf(const fs::path& document) const {
-        const fs::path pdf = m_files / "control.pdf";
         m_files.Write("profile/user/basic/Standard/Module1.xba",
-                      R"--(<?xml version="1.0" encoding="UTF-8"?>
-<script:module xmlns:script="http://openoffice.org/2000/script" script:name="Module1"
-               script:language="StarBasic">Sub Main
-Dim load(1) As New com.sun.star.beans.PropertyValue
-load(0).Name = "Hidden"
-load(0).Value = True
-load(1).Name = "MacroExecutionMode"
-load(1).Value = com.sun.star.document.MacroExecMode.ALWAYS_EXECUTE_NO_WARN
-document = StarDesktop.loadComponentFromURL("file://)--" +
-                          document.string() + R"--(", "_blank", 0, load())
-Dim store(0) As New com.sun.star.beans.PropertyValue
-store(0).Name = "FilterName"
-store(0).Value = "calc_pdf_Export"
-document.storeToURL("file://)--" +
-                          pdf.string() +
-                          R"--(", store())
-document.close(True)
-StarDesktop.terminate()
-End Sub
-</script:module>)--");
+                      TestText("export-with-macros.xba", document.string()));
         Run("macro:///Standard.Module1.Main");
-        return PdfText(pdf);
+        return PdfText(document.string() + ".pdf");
     }
 
 private:

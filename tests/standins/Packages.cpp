@@ -6,7 +6,9 @@
 #include <wx/wfstream.h>
 #include <wx/zipstrm.h>
 
+#include <algorithm>
 #include <memory>
+#include <string_view>
 
 namespace {
 
@@ -35,13 +37,24 @@ std::string WithPart(const std::string& sample, const wxString& part, const std:
     return BytesOf(bytes);
 }
 
-std::string Package(std::initializer_list<std::pair<const char*, wxString>> parts) {
+std::string TestText(const std::string& name, const std::string& value) {
+    wxString text = wxString::FromUTF8(ReadBytes(DOCUMENTS_FOLDER "/" + name));
+    text.Replace("{}", wxString::FromUTF8(value));
+    return text.utf8_string();
+}
+
+std::string Package(const std::string& name, const std::string& value) {
+    constexpr std::string_view Begin = "\n-- ";
+    constexpr std::string_view End = " --\n";
     wxMemoryOutputStream bytes;
     wxZipOutputStream archive(bytes);
-    for (auto [name, content] : parts) {
-        content.Replace("$", "http://schemas.openxmlformats.org");
-        archive.PutNextEntry(name);
-        archive.WriteAll(content.utf8_str(), content.utf8_str().length());
+    const std::string text = TestText(name + ".txtar", value);
+    for (std::size_t at = text.find(Begin); at != std::string::npos;) {
+        const std::size_t part = at + Begin.size();
+        const std::size_t content = text.find(End, part) + End.size();
+        at = text.find(Begin, content - 1);
+        archive.PutNextEntry(wxString::FromUTF8(text.substr(part, content - End.size() - part)));
+        archive.WriteAll(text.data() + content, std::min(at, text.size()) - content);
     }
     archive.Close();
     return BytesOf(bytes);

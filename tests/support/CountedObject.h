@@ -7,7 +7,7 @@
 template <typename Interface>
 class Counted : public Interface {
 public:
-    explicit Counted(REFIID iid) : m_iid(iid) {}
+    explicit Counted(REFIID iid = IID_IUnknown) : m_iid(iid) {}
     virtual ~Counted() = default;
     Counted(const Counted&) = delete;
     Counted& operator=(const Counted&) = delete;
@@ -53,4 +53,19 @@ public:
                                             DISPID* /*ids*/) override {
         return E_NOTIMPL;
     }
+};
+
+/// A class object whose only object lives in it.
+template <typename Product>
+class CountedFactory : public Counted<IClassFactory> {
+public:
+    CountedFactory() : Counted(IID_IClassFactory) {}
+
+    HRESULT STDMETHODCALLTYPE CreateInstance(IUnknown* /*outer*/, REFIID iid,
+                                             void** object) override {
+        return product.QueryInterface(iid, object);
+    }
+    HRESULT STDMETHODCALLTYPE LockServer(BOOL /*lock*/) override { return S_OK; }
+
+    Product product;
 };

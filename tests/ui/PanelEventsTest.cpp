@@ -17,10 +17,7 @@ protected:
         mouse.MouseMove(control->ClientToScreen(wxPoint(size.x / 4, size.y / 2)));
         wxYield();
         mouse.MouseClick();
-        const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(10);
-        while (Saved()[setting.key] != "1" && std::chrono::steady_clock::now() < end)
-            wxYield();
-        return Saved()[setting.key] == "1";
+        return Until([&] { return Saved()[setting.key] == "1"; });
     }
 
     bool HandoutsEnabled(bool enabled) const {

@@ -1,27 +1,12 @@
 #include "tests/ui/PanelFixture.h"
 
-#include "tests/support/RegistryText.h"
+#include "plugin/settings/SettingsXml.h"
 
 #include <wx/app.h>
 #include <wx/checkbox.h>
 #include <wx/radiobut.h>
 #include <wx/sizer.h>
 #include <wx/xml/xml.h>
-
-namespace {
-
-constexpr wchar_t DistillerKey[] = L"SOFTWARE\\Adobe\\Acrobat Distiller\\9.0";
-
-} // namespace
-
-PanelFixture::PanelFixture() {
-    RegDeleteTreeW(HKEY_LOCAL_MACHINE, DistillerKey);
-}
-
-PanelFixture::~PanelFixture() {
-    CloseHost();
-    RegDeleteTreeW(HKEY_LOCAL_MACHINE, DistillerKey);
-}
 
 void PanelFixture::CloseHost() {
     if (m_host)
@@ -33,24 +18,13 @@ void PanelFixture::CloseHost() {
 void PanelFixture::BuildPanel(const Settings& settings) {
     CloseHost();
     m_plugin.emplace();
-    m_office.emplace(m_machine.applications, m_machine.officeVersion);
-    m_testPrinters.clear();
-    const std::wstring ppd = m_folder.Write("a.ppd", "x").wstring();
-    for (const std::wstring& printer : m_machine.printers)
-        m_testPrinters.push_back(std::make_unique<TestPrinter>(printer, L"Test driver", ppd));
-    std::filesystem::create_directories(m_folder / "profiles");
-    for (const char* profile : m_machine.profiles)
-        m_folder.Write(std::filesystem::path("profiles") / profile, "x");
-    WriteRegistryText(HKEY_LOCAL_MACHINE, DistillerKey, L"JobOptionsFolder",
-                      (m_folder / "profiles").wstring());
-
-    wxXmlNode document(wxXML_ELEMENT_NODE, "settings");
-    auto* element = new wxXmlNode(&document, wxXML_ELEMENT_NODE, "UI");
+    Install(m_machine);
+    SettingsMap stored;
     for (const auto& [key, value] : settings)
-        new wxXmlNode(new wxXmlNode(element, wxXML_ELEMENT_NODE, key), wxXML_TEXT_NODE, "text",
-                      wxString::FromUTF8(value));
-    m_plugin->Initialize(wxString("<s><ServerVersion>") + m_machine.serverVersion +
-                         "</ServerVersion></s>");
+        stored[key] = wxString::FromUTF8(value);
+    wxXmlNode document(wxXML_ELEMENT_NODE, "settings");
+    AppendSettingsXml(&document, stored);
+    m_plugin->Initialize(wxString("<s><ServerVersion>") + m_serverVersion + "</ServerVersion></s>");
     m_plugin->LoadSettings(&document);
 
     m_host = new wxFrame(nullptr, wxID_ANY, "Host");
@@ -64,10 +38,11 @@ void PanelFixture::BuildPanel(const Settings& settings) {
 Settings PanelFixture::Saved() {
     wxXmlNode document(wxXML_ELEMENT_NODE, "settings");
     m_plugin->SaveSettings(&document);
+    SettingsMap saved;
+    ReadSettingsXml(&document, saved);
     Settings settings;
-    for (const wxXmlNode* setting = document.GetChildren()->GetChildren(); setting;
-         setting = setting->GetNext())
-        settings[setting->GetName().utf8_string()] = setting->GetNodeContent().utf8_string();
+    for (const auto& [key, value] : saved)
+        settings[key.utf8_string()] = value.utf8_string();
     return settings;
 }
 
@@ -80,36 +55,11 @@ Settings PanelFixture::Shown() const {
     return settings;
 }
 
-wxWindow* PanelFixture::Find(int id) const {
-    wxWindow* window = m_panel->FindWindow(id);
-    EXPECT_TRUE(window) << id;
-    return window;
-}
-
-wxChoice* PanelFixture::Choice(int id) const {
-    return dynamic_cast<wxChoice*>(Find(id));
-}
-
-bool PanelFixture::IsTicked(int id) const {
-    if (const auto* box = dynamic_cast<const wxCheckBox*>(Find(id)))
-        return box->GetValue();
-    return dynamic_cast<wxRadioButton*>(Find(id))->GetValue();
-}
-
-std::string PanelFixture::Selection(int id) const {
-    return Choice(id)->GetStringSelection().utf8_string();
-}
-
 bool PanelFixture::AreEnabled(std::initializer_list<int> ids, bool enabled) const {
     bool all = true;
     for (const int id : ids)
         all = all && Find(id)->IsThisEnabled() == enabled;
     return all;
-}
-
-void PanelFixture::Choose(int id, const char* entry) {
-    ASSERT_TRUE(Choice(id)->SetStringSelection(wxString::FromUTF8(entry))) << entry;
-    Tell(wxEVT_CHOICE, id, Choice(id)->GetSelection());
 }
 
 void PanelFixture::Tick(int id, bool ticked) {
@@ -120,11 +70,4 @@ void PanelFixture::Tick(int id, bool ticked) {
 void PanelFixture::Press(int id) {
     dynamic_cast<wxRadioButton*>(Find(id))->SetValue(true);
     Tell(wxEVT_RADIOBUTTON, id, 1);
-}
-
-void PanelFixture::Tell(wxEventType type, int id, int value) {
-    wxCommandEvent event(type, id);
-    event.SetEventObject(Find(id));
-    event.SetInt(value);
-    Find(id)->ProcessWindowEvent(event);
 }

@@ -3,24 +3,15 @@
 #include "plugin/MSOfficePluginImpl.h"
 #include "plugin/interface/ControlIds.h"
 #include "plugin/settings/FilterSettings.h"
-#include "tests/support/RecordingOffice.h"
-#include "tests/support/TemporaryFolder.h"
-#include "tests/support/TestPrinter.h"
+#include "tests/ui/UiTest.h"
 
-#include <wx/choice.h>
 #include <wx/frame.h>
-#include <wx/window.h>
-
-#include <gtest/gtest.h>
 
 #include <map>
-#include <memory>
-#include <optional>
-#include <vector>
 
 using Settings = std::map<std::string, std::string>;
 
-/// Which control shows which setting.
+/// Which control shows which setting: the word of the tests against the panel's own.
 struct SettingControl {
     int id;
     const Setting& setting;
@@ -42,22 +33,12 @@ const SettingControl SettingControls[] = {
     {ControlId::PrintCommentsAndInkMarkup, FilterSettings::PrintCommentsAndInkMarkup},
 };
 
-/// A panel in a host's window, on a machine that the test describes.
-class PanelFixture : public testing::Test {
+/// A panel in a host's window.
+class PanelFixture : public UiTest {
 protected:
-    struct Machine {
-        std::vector<std::wstring> applications = {L"Word.Application", L"PowerPoint.Application"};
-        int officeVersion = 16;
-        std::vector<std::wstring> printers = {L"Adobe PDF", L"Proofer"};
-        std::vector<const char*> profiles = {"Press.joboptions", "Print.joboptions"};
-        const char* serverVersion = "16";
-    };
+    ~PanelFixture() override { CloseHost(); }
 
-    PanelFixture();
-    ~PanelFixture() override;
-
-    /// Makes the machine as described, in place of an earlier one, and the panel on it, loaded from
-    /// the settings.
+    /// Installs m_machine, and makes the panel on it, loaded from the settings.
     void BuildPanel(const Settings& settings = {});
     void CloseHost();
 
@@ -67,25 +48,16 @@ protected:
     /// What the controls show, by setting.
     Settings Shown() const;
 
-    wxWindow* Find(int id) const;
-    wxChoice* Choice(int id) const;
-    bool IsTicked(int id) const; ///< of a check box or a radio button
-    std::string Selection(int id) const;
+    const wxWindow* Window() const override { return m_panel; }
     bool AreEnabled(std::initializer_list<int> ids, bool enabled) const;
 
-    /// Sends the command event that the user's choice would cause, after making the choice.
-    void Choose(int id, const char* entry);
+    // Each makes a choice and tells of it.
     void Tick(int id, bool ticked);
     void Press(int id);
 
     Machine m_machine;
-    TemporaryFolder m_folder;
-    std::optional<RecordingOffice> m_office;
-    std::vector<std::unique_ptr<TestPrinter>> m_testPrinters;
+    const char* m_serverVersion = "16";
     std::optional<MSOfficePluginImpl> m_plugin;
     wxFrame* m_host = nullptr;
     wxWindow* m_panel = nullptr;
-
-private:
-    void Tell(wxEventType type, int id, int value);
 };

@@ -1,9 +1,11 @@
 #include "common/Themer.h"
 #include "plugin/interface/ControlIds.h"
-#include "tests/ui/ControlTree.h"
 #include "tests/ui/PanelFixture.h"
 #include "ui/OutputFileType.h"
 
+#include <wx/checkbox.h>
+#include <wx/panel.h>
+#include <wx/radiobut.h>
 #include <wx/sizer.h>
 
 #include <gmock/gmock.h>
@@ -11,6 +13,41 @@
 namespace {
 
 class PanelLayoutTest : public PanelFixture {};
+
+bool ShowsTick(const wxWindow* window) {
+    if (const auto* box = dynamic_cast<const wxCheckBox*>(window))
+        return box->GetValue();
+    if (const auto* button = dynamic_cast<const wxRadioButton*>(window))
+        return button->GetValue();
+    return false;
+}
+
+wxString Described(const wxWindow* window) {
+    wxString line(window->GetClassInfo()->GetClassName());
+    if (window->GetId() > 0)
+        line << ' ' << window->GetId();
+    if (const auto* choice = dynamic_cast<const wxChoice*>(window))
+        line << " [" << wxJoin(choice->GetStrings(), '|', '\0') << ']';
+    else if (!window->GetLabel().empty() && !dynamic_cast<const wxPanel*>(window))
+        line << " \"" << window->GetLabel() << '"';
+    if (!window->IsThisEnabled())
+        line << " disabled";
+    if (!window->IsShown())
+        line << " hidden";
+    if (ShowsTick(window))
+        line << " ticked";
+    return line;
+}
+
+/// The windows below `window`, one line each, indented by their depth: class, identifier, label or
+/// entries, and what sets it apart (disabled, hidden, ticked). Identifiers that wxWidgets gave are
+/// left out.
+void AppendTree(const wxWindow* window, std::size_t depth, std::vector<std::string>& lines) {
+    for (const wxWindow* child : window->GetChildren()) {
+        lines.push_back(std::string(std::size_t{2} * depth, ' ') + Described(child).utf8_string());
+        AppendTree(child, depth + 1, lines);
+    }
+}
 
 const char* const WholeTree[] = {
     "wxPanel",
@@ -55,7 +92,8 @@ const char* const WholeTree[] = {
 
 TEST_F(PanelLayoutTest, HoldsItsControlsInTheirOrder) {
     BuildPanel();
-    std::vector<std::string> tree = WindowTree(m_panel);
+    std::vector<std::string> tree;
+    AppendTree(m_panel, 0, tree);
     for (std::string& line : tree) // the note wraps where the font makes it
         std::replace(line.begin(), line.end(), '\n', ' ');
     EXPECT_THAT(tree, testing::ElementsAreArray(WholeTree));

@@ -27,7 +27,7 @@ TEST_F(PanelMachineTest, IsEnabledWhereItsChoicesCanTakeEffect) {
             m_machine.applications.clear();
         if (!state.hasPrinter)
             m_machine.printers.clear();
-        m_machine.serverVersion = state.serverVersion;
+        m_serverVersion = state.serverVersion;
         BuildPanel({{"PRINTOUTPUTTYPE", "Handouts"}, {"OUTPUTFILETYPEPDF", "1"}});
 
         for (int id = ControlId::PrinterLabel; id < ControlId::NotePanel; ++id) {

@@ -49,11 +49,11 @@ TEST_F(SpecialFilesTest, ThatAreNotNamedByTextAreRefusedAndNotLost) {
     const RunResult run = RunQuillon({"screen", (m_folder / "br\xFC"
                                                             "cke.doc")
                                                     .string()});
-    EXPECT_NE(run.out.find("/br\\xfccke.doc: refused"), std::string::npos) << run.out;
+    EXPECT_THAT(run.out, HasSubstr("/br\\xfccke.doc: refused"));
     const RunResult into = RunQuillon({"convert", m_folder.Write("a.doc", "script").string(),
                                        "--out", (m_folder / "\xE4").string()});
     EXPECT_EQ(into.exitCode, 3);
-    EXPECT_NE(into.err.find("UTF-8"), std::string::npos) << into.err;
+    EXPECT_THAT(into.err, HasSubstr("UTF-8"));
     EXPECT_FALSE(fs::exists(m_folder / "\xE4"));
 }
 

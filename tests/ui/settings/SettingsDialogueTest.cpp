@@ -9,6 +9,8 @@
 #include <wx/checkbox.h>
 #include <wx/choice.h>
 
+#include <gmock/gmock.h>
+
 namespace {
 
 class SettingsDialogueTest : public SettingsWindow {
@@ -20,8 +22,6 @@ protected:
         EXPECT_TRUE(settings) << fault.what;
         return settings ? settings->Value(key).utf8_string() : "";
     }
-
-    bool IsTicked(int id) const { return dynamic_cast<wxCheckBox*>(Find(id))->GetValue(); }
 
     /// Activates the check box, and waits for it to follow.
     void Toggle(int id) {
@@ -36,10 +36,6 @@ protected:
         Press(WXK_RETURN);
         EXPECT_TRUE(Until([this] { return HasClosed(); }));
     }
-
-    wxChoice* Choice(int id) const { return dynamic_cast<wxChoice*>(Find(id)); }
-
-    std::string Chosen(int id) const { return Choice(id)->GetStringSelection().utf8_string(); }
 
     /// As on a small screen.
     void MakeLow() {
@@ -98,8 +94,8 @@ TEST_F(SettingsDialogueTest, ReturnSavesWhatWasPicked) {
         EXPECT_EQ(Value(key), value) << key;
     EXPECT_EQ(Open([this] {
                   EXPECT_TRUE(IsTicked(ControlId::FrameSlides));
-                  EXPECT_EQ(Chosen(ControlId::Printer), "Proofer");
-                  EXPECT_EQ(Chosen(ControlId::DistillerProfile), "Print.joboptions");
+                  EXPECT_EQ(Selection(ControlId::Printer), "Proofer");
+                  EXPECT_EQ(Selection(ControlId::DistillerProfile), "Print.joboptions");
               }),
               wxID_NONE)
         << "and the next window shows it";
@@ -121,9 +117,9 @@ TEST_F(SettingsDialogueTest, ANewFileAndRestoredDefaultsSayWhatHoldsWithoutAFile
                               "<HANDOUTSVERTICAL>1</HANDOUTSVERTICAL>"
                               "<PRINTHIDDENSLIDES>1</PRINTHIDDENSLIDES></UI>");
     Open([this] {
-        EXPECT_EQ(Chosen(ControlId::DistillerProfile), "Print.joboptions");
+        EXPECT_EQ(Selection(ControlId::DistillerProfile), "Print.joboptions");
         Activate(ButtonId::Restore);
-        EXPECT_TRUE(Until([this] { return Chosen(ControlId::Print) == "Slides"; }));
+        EXPECT_TRUE(Until([this] { return Selection(ControlId::Print) == "Slides"; }));
         Find(ControlId::Print)->SetFocus();
         Save();
     });
@@ -139,7 +135,7 @@ TEST_F(SettingsDialogueTest, WhatIsNoLongerThereStaysChosenUnderItsName) {
                 {ControlId::Printer, "Sold last year (not available)", "Proofer"},
                 {ControlId::DistillerProfile, "Gone (not available)", "Print.joboptions"}};
             for (const auto& [id, marked, other] : choices) {
-                EXPECT_EQ(Chosen(id), marked);
+                EXPECT_EQ(Selection(id), marked);
                 EXPECT_LE(Choice(id)->GetTextExtent(marked).x, Choice(id)->GetSize().x);
                 if (touched) {
                     Choose(id, other);
@@ -159,8 +155,8 @@ TEST_F(SettingsDialogueTest, AChoiceOfAnotherLanguageIsTheSameOne) {
                    "</PRINTOUTPUTTYPE><COLOR>Grayscale</COLOR></UI>");
     Speak("de");
     Open([this] {
-        EXPECT_EQ(Chosen(ControlId::Print), "Handzettel");
-        EXPECT_EQ(Chosen(ControlId::Colour), "Graustufen");
+        EXPECT_EQ(Selection(ControlId::Print), "Handzettel");
+        EXPECT_EQ(Selection(ControlId::Colour), "Graustufen");
         EXPECT_TRUE(Find(ControlId::SlidesPerPage)->IsEnabled());
     });
 }
@@ -267,7 +263,7 @@ TEST_F(SettingsDialogueTest, KeepsWhatItDoesNotUnderstand) {
     EXPECT_EQ(end, wxID_SAVE);
     const std::string stored = Stored();
     for (const std::string& each : kept)
-        EXPECT_NE(stored.find(each), std::string::npos) << each.substr(0, 80);
+        EXPECT_THAT(stored, testing::HasSubstr(each)) << each.substr(0, 80);
     EXPECT_EQ(Value("HIGHQUALITY"), "1");
 }
 

@@ -3,9 +3,10 @@
 #include "host/program/settings/Settings.h"
 #include "tests/support/TemporaryFolder.h"
 
-#include <gtest/gtest.h>
+#include <gmock/gmock.h>
 
 namespace fs = std::filesystem;
+using testing::HasSubstr;
 
 namespace {
 
@@ -59,7 +60,7 @@ TEST_F(SettingsFileTest, AnyTextComesBack) {
     const wxString text = wxString::FromUTF8("<&>\"' \xC3\xA4\xF0\x9F\x98\x80");
     Store({{"PRINTER", text}});
     const std::string once = ReadBytes(m_file);
-    EXPECT_NE(once.find("&lt;&amp;&gt;"), std::string::npos) << once;
+    EXPECT_THAT(once, HasSubstr("&lt;&amp;&gt;"));
     EXPECT_EQ(Store({{"PRINTER", text}}), once);
 }
 
@@ -91,7 +92,7 @@ TEST_F(SettingsFileTest, ALinkAndThePermissionsStay) {
     Store({{"COLOR", "new"}});
     EXPECT_TRUE(fs::is_symlink(m_file));
     EXPECT_EQ(fs::status(target).permissions(), fs::perms::owner_read | fs::perms::owner_write);
-    EXPECT_NE(ReadBytes(target).find("new"), std::string::npos);
+    EXPECT_THAT(ReadBytes(target), HasSubstr("new"));
 }
 
 } // namespace

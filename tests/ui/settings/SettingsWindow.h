@@ -1,17 +1,10 @@
 #pragma once
 
 #include "host/program/window/SettingsDialogue.h"
-#include "tests/support/RecordingOffice.h"
-#include "tests/support/TemporaryFolder.h"
-#include "tests/support/TestPrinter.h"
+#include "tests/ui/UiTest.h"
 
 #include <wx/dcscreen.h>
 #include <wx/uiaction.h>
-
-#include <gtest/gtest.h>
-
-#include <functional>
-#include <optional>
 
 /// Runs a function for each window below one.
 void ForEachBelow(wxWindow* window, const std::function<void(wxWindow*)>& visit);
@@ -24,7 +17,7 @@ void ReadAnew(wxScreenDC& screen);
 
 /// The settings window of a machine with Office, two printers and two Distiller profiles, with a
 /// user in front of it.
-class SettingsWindow : public testing::Test {
+class SettingsWindow : public UiTest {
 protected:
     SettingsWindow();
     ~SettingsWindow() override;
@@ -38,23 +31,14 @@ protected:
 
     // What the user sees and does while the window is open.
 
-    wxWindow* Find(int id) const;
+    const wxWindow* Window() const override { return m_window; }
     wxWindow* Focused() const { return FocusedIn(m_window); }
     wxRect Place(const wxWindow* window) const; ///< on the screen
     void Activate(int id);                      ///< a button or a check box, by the space bar
     void Press(int key);
-    /// Picks an entry; the box itself is the toolkit's.
-    void Choose(int id, const wxString& entry);
-
-    /// Lets the toolkit work until the condition holds.
-    /// @return whether it came to that
-    static bool Until(const std::function<bool()>& condition);
 
     std::string Stored() const { return ReadBytes(m_file); }
 
-    TemporaryFolder m_folder;
     std::filesystem::path m_file = m_folder / "job.xml";
-    std::optional<RecordingOffice> m_office;
-    std::optional<TestPrinter> m_printers[2];
     SettingsDialogue* m_window = nullptr;
 };

@@ -63,7 +63,7 @@ TEST_F(ProgramTest, APanelSavedInGermanPrintsHandoutsInEnglish) {
                   Until([this] { return !m_window->IsShown(); });
               }),
               wxID_SAVE);
-    EXPECT_NE(Stored().find("<PRINTOUTPUTTYPE>Handzettel</PRINTOUTPUTTYPE>"), std::string::npos);
+    EXPECT_THAT(Stored(), HasSubstr("<PRINTOUTPUTTYPE>Handzettel</PRINTOUTPUTTYPE>"));
     Speak("en");
     EXPECT_GT(slides, 4U);
     EXPECT_EQ(PagesOfDeck(), (slides + 3) / 4);
@@ -82,8 +82,8 @@ TEST_F(ProgramTest, TheWindowOpensAndSaves) {
     ours->Destroy();
     const RunResult run = program.Wait();
     EXPECT_EQ(run.exitCode, 0) << run.err;
-    EXPECT_NE(run.out.find("saved in " + m_file.string()), std::string::npos) << run.out;
-    EXPECT_NE(Stored().find("<OUTPUTFILETYPEPDF>1</OUTPUTFILETYPEPDF>"), std::string::npos);
+    EXPECT_THAT(run.out, HasSubstr("saved in " + m_file.string()));
+    EXPECT_THAT(Stored(), HasSubstr("<OUTPUTFILETYPEPDF>1</OUTPUTFILETYPEPDF>"));
 }
 
 TEST_F(ProgramTest, SaysWhenThereIsNoDisplay) {
@@ -93,7 +93,7 @@ TEST_F(ProgramTest, SaysWhenThereIsNoDisplay) {
         RunProgram(Command({"settings", "--settings", m_file.string(), "--json"}));
     EXPECT_EQ(run.exitCode, 2);
     ASSERT_EQ(run.Records("error").size(), 1U) << run.out;
-    EXPECT_NE(run.err.find("no display"), std::string::npos) << run.err;
+    EXPECT_THAT(run.err, HasSubstr("no display"));
     EXPECT_FALSE(std::filesystem::exists(m_file));
 }
 
@@ -115,7 +115,7 @@ TEST_F(ProgramTest, SpeaksTheDesktopsLanguageOrTheOneItIsTold) {
         std::vector<std::string> arguments = {"screen", (m_folder / "none.doc").string()};
         arguments.insert(arguments.end(), each.options.begin(), each.options.end());
         const RunResult run = RunProgram(Command(arguments));
-        EXPECT_NE(run.out.find(each.text), std::string::npos) << each.environment << run.out;
+        EXPECT_THAT(run.out, HasSubstr(each.text)) << each.environment;
     }
 }
 
