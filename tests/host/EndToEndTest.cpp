@@ -8,6 +8,18 @@ namespace fs = std::filesystem;
 
 namespace {
 
+/// What there is on the machine, in ScriptedMachine's words.
+constexpr char Machine[] = R"(key HKCR\CLSID\{6B1F0A51-2F0E-4D55-9A01-5E2D8C100009}
+text HKCR\CLSID\{6B1F0A51-2F0E-4D55-9A01-5E2D8C100009}\InprocServer32||)" PRINTING_WORD R"(
+text HKCR\CLSID\{6B1F0A51-2F0E-4D55-9A01-5E2D8C100009}\InprocServer32|ThreadingModel|Both
+text HKCR\Word.Application||A Word that prints
+text HKCR\Word.Application\CLSID||{6B1F0A51-2F0E-4D55-9A01-5E2D8C100009}
+text HKCR\Word.Application\CurVer||Word.Application.16
+text HKLM\SOFTWARE\Orvanta\Marlo Quillon|InstallPath|)" TEST_INSTALLATION R"(
+text HKLM\SOFTWARE\Adobe\Acrobat Distiller\9.0|JobOptionsFolder|)" TEST_PROFILES R"(
+flag HKCU\Software\Scripted Bridge|MakesPdf
+)";
+
 /// The program as it is installed, with the office filter itself, a Word that prints and a
 /// Distiller's bridge that makes files.
 class EndToEndTest : public ConvertRun {
@@ -15,18 +27,13 @@ protected:
     void SetUp() override { Change(""); }
 
     void TearDown() override {
-        for (const char* module : {"PrintingWord", "ScriptedMachine"})
-            UnregisterStandIn(TEST_OFFICE "/" + std::string(module));
+        UnregisterStandIn(TEST_OFFICE "/ScriptedMachine");
         wxUnsetEnv("SCRIPTED_MACHINE");
     }
 
-    /// @param more changes of the machine that has Word and Distiller
+    /// @param more changes of the machine
     static void Change(const std::string& more) {
-        const std::string machine =
-            "text HKLM\\SOFTWARE\\Orvanta\\Marlo Quillon|InstallPath|" TEST_INSTALLATION
-            "\ntext HKLM\\SOFTWARE\\Adobe\\Acrobat Distiller\\9.0|JobOptionsFolder|" TEST_PROFILES
-            "\nflag HKCU\\Software\\Scripted Bridge|MakesPdf\n";
-        wxSetEnv("SCRIPTED_MACHINE", wxString::FromUTF8(machine + more));
+        wxSetEnv("SCRIPTED_MACHINE", wxString::FromUTF8(Machine + more));
     }
 
     static RunResult Run(const Arguments& arguments) {

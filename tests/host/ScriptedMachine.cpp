@@ -1,6 +1,6 @@
-// A stand-in for tests of the host: changes the registry of the machine that the other stand-ins of
-// its folder have made, as the environment says, in lines "delete KEY", "key KEY" and
-// "text KEY|VALUE|TEXT", "flag KEY|VALUE". A key begins with HKCR, HKCU or HKLM.
+// A stand-in for tests of the host: makes the registry what the environment says, in lines "delete
+// KEY", "key KEY", "text KEY|VALUE|TEXT" and "flag KEY|VALUE". A key begins with HKCR, HKCU or
+// HKLM.
 
 #include <objbase.h>
 #include <windows.h>

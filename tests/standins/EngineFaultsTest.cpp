@@ -3,9 +3,9 @@
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/Processes.h"
 #include "tests/support/RegistryText.h"
+#include "tests/support/linux/ResourceLimit.h"
 
 #include <gmock/gmock.h>
-#include <sys/resource.h>
 
 #include <array>
 #include <csignal>
@@ -15,23 +15,6 @@ namespace fs = std::filesystem;
 using testing::EndsWith;
 
 namespace {
-
-/// Limits what this process, and those that it starts, may use.
-class Limit {
-public:
-    Limit(__rlimit_resource resource, rlim_t most) : m_resource(resource) {
-        getrlimit(resource, &m_before);
-        const rlimit limit{most, m_before.rlim_max};
-        EXPECT_EQ(0, setrlimit(resource, &limit));
-    }
-    ~Limit() { setrlimit(m_resource, &m_before); }
-    Limit(const Limit&) = delete;
-    Limit& operator=(const Limit&) = delete;
-
-private:
-    __rlimit_resource m_resource;
-    rlimit m_before{};
-};
 
 class EngineFaultsTest : public OfficeTest {
 protected:
@@ -81,7 +64,7 @@ TEST_F(EngineFaultsTest, AnEngineThatHasTooLittleIsNoFaultOfTheDocument) {
         {RLIMIT_CPU, 999, "a process may use only 999 seconds of processor time (ulimit -t)"},
     };
     for (const auto& [resource, most, words] : limits) {
-        const Limit limit(resource, most);
+        const ResourceLimit limit(resource, most);
         ExpectFailure("exit 1", std::string("LibreOffice ended with exit code 1; ") + words,
                       "machine");
     }

@@ -28,11 +28,6 @@ protected:
         SetLimit("DocumentsPerStart", 100);
     }
 
-    void TearDown() override {
-        Call("DllUnregisterServer"); // which ends it
-        OfficeTest::TearDown();
-    }
-
     /// The letter among the samples, with bytes that no test before has opened.
     fs::path NewLetter() const {
         static int number = 0;

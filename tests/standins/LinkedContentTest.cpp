@@ -18,11 +18,6 @@ protected:
         OfficeTest::SetUp();
         SetLimit("DocumentsPerStart", GetParam());
     }
-
-    void TearDown() override {
-        Call("DllUnregisterServer"); // which ends it
-        OfficeTest::TearDown();
-    }
 };
 
 INSTANTIATE_TEST_SUITE_P(Engines, LinkedContentTest, testing::Values(1, 100));

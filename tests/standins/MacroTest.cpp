@@ -121,7 +121,6 @@ TEST_F(MacroTest, OfAWorkbookIsNotRun) {
         EXPECT_THAT(text, HasSubstr("#")) << "the cell is not there"; // it shows an error
         EXPECT_THAT(text, Not(HasSubstr(Shown)));
     }
-    Call("DllUnregisterServer"); // ends what is kept started
 }
 
 /// No application of Office's has such documents, so the engine is asked for one by itself.

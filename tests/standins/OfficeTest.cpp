@@ -70,6 +70,7 @@ void OfficeTest::SetUp() {
 }
 
 void OfficeTest::TearDown() {
+    Call("DllUnregisterServer"); // ends what is kept started
     StandInTest::TearDown();
     // Nothing tells whose a socket is: one that goes soon is that of a test at the same time.
     std::set<std::string> left;

@@ -1,3 +1,4 @@
+#include "machine/RegistryText.h"
 #include "tests/standins/FakeEngine.h"
 #include "tests/standins/OfficeTest.h"
 #include "tests/standins/Packages.h"
@@ -5,8 +6,6 @@
 #include "tests/support/CompoundFile.h"
 
 #include <gmock/gmock.h>
-// After the strings, which it takes for granted.
-#include <wx/msw/registry.h>
 
 namespace fs = std::filesystem;
 using testing::HasSubstr;
@@ -19,11 +18,10 @@ class PageTextTest : public OfficeTest {};
 /// What the stand-ins have left for the host of the fonts that are not there. It is gone
 /// afterwards.
 std::string TakeFontsLeft() {
-    wxRegKey key(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Stand-Ins\\Last Fonts");
-    wxString fonts;
-    if (key.Exists() && key.QueryValue("Fonts", fonts))
-        key.DeleteSelf();
-    return fonts.utf8_string();
+    const char* const key = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Fonts";
+    const auto fonts = ReadRegistryText(wxRegKey::HKCU, key, "Fonts");
+    wxRegKey(wxRegKey::HKCU, key).DeleteSelf();
+    return fonts.value_or(wxString()).utf8_string();
 }
 
 std::string Letter(const std::string& paragraphs) {

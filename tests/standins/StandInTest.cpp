@@ -1,12 +1,9 @@
 #include "tests/standins/StandInTest.h"
 
 #include "common/LoadedModule.h"
+#include "machine/RegistryText.h"
 #include "platform/win32/base/LogSink.h"
 #include "tests/standins/Processes.h"
-
-#include <windows.h>
-
-#include <wx/msw/registry.h>
 
 #include <sys/wait.h>
 #include <unistd.h>
@@ -61,11 +58,11 @@ std::string StandInTest::ReasonUnless(bool isDone) {
 }
 
 std::string StandInTest::FailureLeft() {
-    const wxRegKey key(wxRegKey::HKCU, "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure");
-    wxString fault;
-    wxString reason;
-    EXPECT_TRUE(key.QueryValue("Fault", fault) && key.QueryValue("Reason", reason));
-    return (fault + ": " + reason).utf8_string();
+    const auto text = [](const char* name) {
+        const char* const key = "SOFTWARE\\Orvanta\\Stand-Ins\\Last Failure";
+        return ReadRegistryText(wxRegKey::HKCU, key, name).value().utf8_string();
+    };
+    return text("Fault") + ": " + text("Reason");
 }
 
 pid_t StandInTest::AwaitEngine() const {
@@ -132,9 +129,5 @@ std::set<std::string> StandInTest::Names() const {
 }
 
 std::string MachineText(const char* key, const char* name) {
-    const wxRegKey opened(wxRegKey::HKLM, key);
-    wxString text;
-    if (opened.Exists() && opened.HasValue(name))
-        opened.QueryValue(name, text);
-    return text.utf8_string();
+    return ReadRegistryText(wxRegKey::HKLM, key, name).value_or(wxString()).utf8_string();
 }

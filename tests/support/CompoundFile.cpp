@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdint>
+#include <initializer_list>
 #include <tuple>
 
 namespace {
@@ -17,20 +18,22 @@ constexpr std::uint32_t FatSector = 0xFFFFFFFD;
 constexpr std::uint32_t EndOfChain = 0xFFFFFFFE;
 constexpr std::uint32_t Unused = 0xFFFFFFFF;
 
-void Append(std::string& bytes, std::uint64_t number, std::size_t size) {
-    for (std::size_t i = 0; i < size; ++i)
-        bytes += static_cast<char>(number >> 8 * i);
-}
-
-void PadTo(std::string& bytes, std::size_t unit, char filler = '\0') {
-    bytes.append((unit - bytes.size() % unit) % unit, filler);
-}
-
-std::string ToBytes(const std::vector<std::uint32_t>& numbers) {
+/// Numbers in the file's order of bytes: each one and the bytes that it has.
+std::string Fields(std::initializer_list<std::pair<std::uint64_t, int>> fields) {
     std::string bytes;
-    for (const std::uint32_t number : numbers)
-        Append(bytes, number, 4);
-    PadTo(bytes, SectorSize, '\xFF');
+    for (const auto& [number, size] : fields)
+        for (int i = 0; i < size; ++i)
+            bytes += static_cast<char>(number >> 8 * i);
+    return bytes;
+}
+
+/// A table in whole sectors.
+std::string ToBytes(std::vector<std::uint32_t> table) {
+    table.resize((table.size() + NumbersPerSector - 1) / NumbersPerSector * NumbersPerSector,
+                 Unused);
+    std::string bytes;
+    for (const std::uint32_t number : table)
+        bytes += Fields({{number, 4}});
     return bytes;
 }
 
@@ -50,12 +53,12 @@ public:
             PlaceStream(i);
         m_places[0].size = m_miniStream.size();
         m_places[0].start = AddChain(m_fat, m_sectors, m_miniStream, SectorSize);
-        const std::uint32_t miniFatCount = ToNumber(ToBytes(m_miniFat).size() / SectorSize);
-        const std::uint32_t miniFat = AddChain(m_fat, m_sectors, ToBytes(m_miniFat), SectorSize);
+        const std::string miniTable = ToBytes(m_miniFat);
+        const std::uint32_t miniFat = AddChain(m_fat, m_sectors, miniTable, SectorSize);
         LinkSiblings();
         const std::uint32_t directory = AddChain(m_fat, m_sectors, Directory(), SectorSize);
         const std::vector<std::uint32_t> fatSectors = AddFat();
-        return Header(directory, miniFat, miniFatCount, fatSectors) + m_sectors;
+        return Header(directory, miniFat, miniTable.size() / SectorSize, fatSectors) + m_sectors;
     }
 
 private:
@@ -75,7 +78,7 @@ private:
             return EndOfChain;
         const std::uint32_t first = ToNumber(table.size());
         space += data;
-        PadTo(space, unit);
+        space.resize((space.size() + unit - 1) / unit * unit);
         while (table.size() < space.size() / unit)
             table.push_back(ToNumber(table.size()) + 1);
         table.back() = m_file.m_cyclicChains ? first : EndOfChain;
@@ -130,18 +133,16 @@ private:
             const Entry& entry = m_file.m_entries[i];
             std::string name;
             for (const char16_t unit : entry.name)
-                Append(name, unit, 2);
+                name += Fields({{unit, 2}});
             name.resize(64);
+            const std::uint64_t kind = i == 0 ? 5 : entry.isStream ? 2 : 1;
+            constexpr std::uint64_t Black = 1;
+            const Place& place = m_places[i];
             bytes += name;
-            Append(bytes, 2 * (entry.name.size() + 1), 2);
-            Append(bytes, i == 0 ? 5 : entry.isStream ? 2 : 1, 1);
-            Append(bytes, 1, 1); // black
-            Append(bytes, m_places[i].left, 4);
-            Append(bytes, m_places[i].right, 4);
-            Append(bytes, m_places[i].child, 4);
+            bytes += Fields({{2 * (entry.name.size() + 1), 2}, {kind, 1}, {Black, 1}});
+            bytes += Fields({{place.left, 4}, {place.right, 4}, {place.child, 4}});
             bytes.append(36, '\0'); // class, state and times
-            Append(bytes, entry.isStream || i == 0 ? m_places[i].start : 0, 4);
-            Append(bytes, m_places[i].size, 8);
+            bytes += Fields({{kind == 1 ? 0 : place.start, 4}, {place.size, 8}});
         }
         const std::string unusedEntry =
             std::string(68, '\0') + std::string(12, '\xFF') + std::string(48, '\0');
@@ -179,27 +180,20 @@ private:
         return sectors;
     }
 
-    std::string Header(std::uint32_t directory, std::uint32_t miniFat, std::uint32_t miniFatCount,
-                       const std::vector<std::uint32_t>& fatSectors) const {
-        std::string bytes("\xD0\xCF\x11\xE0\xA1\xB1\x1A\xE1", 8);
-        bytes.append(16, '\0');   // class
-        Append(bytes, 0x3E, 2);   // minor version
-        Append(bytes, 3, 2);      // major version
-        Append(bytes, 0xFFFE, 2); // byte order
-        Append(bytes, 9, 2);      // sectors of 2^9 bytes
-        Append(bytes, 6, 2);      // mini sectors of 2^6 bytes
-        bytes.append(10, '\0');
-        Append(bytes, m_fatCount, 4);
-        Append(bytes, directory, 4);
-        Append(bytes, 0, 4);
-        Append(bytes, MiniStreamLimit, 4);
-        Append(bytes, miniFat, 4);
-        Append(bytes, miniFatCount, 4);
+    std::string Header(std::uint32_t directory, std::uint32_t miniFat, std::size_t miniFatCount,
+                       std::vector<std::uint32_t> fatSectors) const {
         const std::size_t difatCount = fatSectors.size() - m_fatCount;
-        Append(bytes, difatCount > 0 ? fatSectors[m_fatCount] : EndOfChain, 4);
-        Append(bytes, difatCount, 4);
-        for (std::size_t i = 0; i < FatSectorsInHeader; ++i)
-            Append(bytes, i < m_fatCount ? fatSectors[i] : Unused, 4);
+        const std::uint32_t difat = difatCount > 0 ? fatSectors[m_fatCount] : EndOfChain;
+        fatSectors.resize(std::min(m_fatCount, FatSectorsInHeader));
+        std::string bytes("\xD0\xCF\x11\xE0\xA1\xB1\x1A\xE1", 8);
+        bytes.append(16, '\0'); // class
+        // The version; the order of bytes; sectors of 2^9 bytes, mini sectors of 2^6 bytes.
+        bytes += Fields({{0x3E, 2}, {3, 2}, {0xFFFE, 2}, {9, 2}, {6, 2}});
+        bytes.append(10, '\0');
+        bytes += Fields({{m_fatCount, 4}, {directory, 4}, {0, 4}, {MiniStreamLimit, 4}});
+        bytes += Fields({{miniFat, 4}, {miniFatCount, 4}, {difat, 4}, {difatCount, 4}});
+        bytes += ToBytes(fatSectors);
+        bytes.resize(SectorSize, '\xFF');
         return bytes;
     }
 

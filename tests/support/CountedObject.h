@@ -2,6 +2,9 @@
 
 #include <ole2.h>
 
+#include <string>
+#include <vector>
+
 /// A COM object of one interface that counts its references; the first one is its maker's. It
 /// stays when the last one goes, unless a class below sees to that.
 template <typename Interface>
@@ -69,3 +72,16 @@ public:
 
     Product product;
 };
+
+/// The texts among a call's arguments, which come the last first.
+inline std::vector<std::wstring> TextsOf(const DISPPARAMS& arguments) {
+    std::vector<std::wstring> texts;
+    for (UINT i = arguments.cArgs; i-- > 0;) {
+        const VARIANT* value = &arguments.rgvarg[i];
+        if (value->vt == (VT_VARIANT | VT_BYREF))
+            value = value->pvarVal;
+        if (value->vt == VT_BSTR && value->bstrVal)
+            texts.emplace_back(value->bstrVal);
+    }
+    return texts;
+}

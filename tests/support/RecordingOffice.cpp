@@ -66,13 +66,6 @@ std::string Described(const VARIANT& value) {
     }
 }
 
-void CollectText(const VARIANT& value, std::vector<std::wstring>& texts) {
-    if (value.vt == (VT_VARIANT | VT_BYREF))
-        CollectText(*value.pvarVal, texts);
-    else if (value.vt == VT_BSTR && value.bstrVal)
-        texts.emplace_back(value.bstrVal);
-}
-
 const char* KindName(WORD flags) {
     switch (flags) {
     case DISPATCH_METHOD:
@@ -98,12 +91,11 @@ public:
     HRESULT STDMETHODCALLTYPE Invoke(DISPID member, REFIID /*reserved*/, LCID /*locale*/,
                                      WORD flags, DISPPARAMS* arguments, VARIANT* result,
                                      EXCEPINFO* exception, UINT* /*badArgument*/) override {
-        std::vector<std::wstring> texts;
-        Note(member, flags, *arguments, texts);
+        Note(member, flags, *arguments);
         try {
             const auto action = m_state->actions.find({m_name, member});
             if (action != m_state->actions.end())
-                action->second(texts);
+                action->second(TextsOf(*arguments));
         } catch (const RecordingOffice::Raise& raised) {
             exception->bstrSource = SysAllocString(L"Recording Office");
             exception->bstrDescription = SysAllocString(raised.description.c_str());
@@ -123,17 +115,13 @@ private:
         delete this;
     }
 
-    void Note(DISPID member, WORD flags, const DISPPARAMS& arguments,
-              std::vector<std::wstring>& texts) {
+    void Note(DISPID member, WORD flags, const DISPPARAMS& arguments) {
         std::string line = m_name + "." + std::to_string(member) + " " + KindName(flags);
         if (flags == DISPATCH_PROPERTYPUT &&
             (arguments.cNamedArgs != 1 || arguments.rgdispidNamedArgs[0] != DISPID_PROPERTYPUT))
             line += " unnamed";
-        for (UINT i = arguments.cArgs; i-- > 0;) {
-            const VARIANT& value = arguments.rgvarg[i];
-            line += (i + 1 == arguments.cArgs ? " (" : ", ") + Described(value);
-            CollectText(value, texts);
-        }
+        for (UINT i = arguments.cArgs; i-- > 0;)
+            line += (i + 1 == arguments.cArgs ? " (" : ", ") + Described(arguments.rgvarg[i]);
         m_state->journal.push_back(line + (arguments.cArgs > 0 ? ")" : ""));
     }
 

@@ -3,11 +3,11 @@
 #include "tests/platform/ErrorOf.h"
 #include "tests/platform/OpenPath.h"
 #include "tests/support/TemporaryFolder.h"
+#include "tests/support/linux/ResourceLimit.h"
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/file.h>
-#include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -60,14 +60,12 @@ TEST(LinuxFiles, AFullDiskIsTold) {
     const TemporaryFolder folder;
     const FileHandle file = OpenPath(folder.Write("file", ""), GENERIC_WRITE, 0);
     std::signal(SIGXFSZ, SIG_IGN);
-    rlimit before{};
-    ASSERT_EQ(0, getrlimit(RLIMIT_FSIZE, &before));
-    const rlimit small{10, before.rlim_max};
-    ASSERT_EQ(0, setrlimit(RLIMIT_FSIZE, &small));
     DWORD written = 0;
-    const BOOL done = WriteFile(file.Get(), "more than ten bytes", 19, &written, nullptr);
-    const LSTATUS error = ErrorOf(done);
-    setrlimit(RLIMIT_FSIZE, &before);
+    LSTATUS error = ERROR_SUCCESS;
+    {
+        const ResourceLimit small(RLIMIT_FSIZE, 10);
+        error = ErrorOf(WriteFile(file.Get(), "more than ten bytes", 19, &written, nullptr));
+    }
     EXPECT_EQ(ERROR_DISK_FULL, error);
     EXPECT_EQ(10U, written);
 }

@@ -3,32 +3,16 @@
 #include "office/ComPointer.h"
 #include "tests/support/CompoundFile.h"
 #include "tests/support/TemporaryFolder.h"
+#include "tests/support/linux/ResourceLimit.h"
 
 #include <ole2.h>
 
 #include <gtest/gtest.h>
-#include <sys/resource.h>
 
 namespace {
 
-/// Limits the stack of the main thread, as a thread of its own may have it.
-class SmallStack {
-public:
-    SmallStack() {
-        getrlimit(RLIMIT_STACK, &m_before);
-        const rlimit small{1 << 20, m_before.rlim_max};
-        EXPECT_EQ(0, setrlimit(RLIMIT_STACK, &small));
-    }
-    ~SmallStack() { setrlimit(RLIMIT_STACK, &m_before); }
-    SmallStack(const SmallStack&) = delete;
-    SmallStack& operator=(const SmallStack&) = delete;
-
-private:
-    rlimit m_before{};
-};
-
 HRESULT Open(const std::filesystem::path& path) {
-    const SmallStack small;
+    const ResourceLimit smallStack(RLIMIT_STACK, 1 << 20); // as a thread of its own may have it
     ComPointer<IStorage> storage;
     return StgOpenStorage(path.wstring().c_str(), nullptr, STGM_READ | STGM_SHARE_DENY_WRITE,
                           nullptr, 0, storage.Receive());
