@@ -9,6 +9,7 @@ build_packages=(
     libpoppler-glib-dev libcairo2-dev libpango1.0-dev libfontconfig-dev libglib2.0-dev libseccomp-dev
     libharfbuzz-dev libreoffice-dev libreofficekit-dev
     libcli11-dev nlohmann-json3-dev gettext
+    libsqlite3-dev libtomlplusplus-dev libcpp-httplib-dev prometheus-cpp-dev libsystemd-dev
 )
 run_packages=(
     'libreoffice-writer|libreoffice-writer-nogui'

@@ -1,0 +1,62 @@
+#pragma once
+
+#include "host/program/base/Fault.h"
+
+#include <wx/string.h>
+
+#include <chrono>
+#include <cstdint>
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+/// What becomes of an output whose name is taken.
+enum class OnSameName {
+    Number,  ///< it is called "letter (2)"
+    Replace, ///< the other one goes
+};
+
+/// What becomes of files in a watched folder that no filter takes.
+enum class Others {
+    Leave, ///< they stay where they are
+    Fail,  ///< they fail, as documents do that are refused
+    Pass,  ///< they come out as they are
+};
+
+/// One watched folder.
+struct FolderConfiguration {
+    wxString name;
+    std::filesystem::path in; ///< absolute, as all paths here
+    std::filesystem::path out;
+    std::optional<std::filesystem::path> settings; ///< the file, read anew for each document
+    std::vector<std::string> assignments;          ///< KEY=VALUE, in place of the file's
+    std::optional<std::string> language;           ///< of reasons; the program's if not given
+    int priority = 50;
+    bool byName = false;      ///< documents in the order of their names, not of their arrival
+    bool folderIsJob = false; ///< a folder inside is begun when all in it has settled
+    OnSameName onSameName = OnSameName::Number;
+    Others others = Others::Leave;
+    std::optional<std::chrono::milliseconds>
+        settle;                                ///< as long as the file system wants if not given
+    std::vector<std::chrono::seconds> retries; ///< the time before each further attempt
+    std::optional<std::chrono::seconds> keepProcessed; ///< for ever if not given
+};
+
+/// What a watch works by.
+struct WatchConfiguration {
+    std::string journal;        ///< for OpenJournal
+    unsigned jobs = 0;          ///< documents at a time; 0 for as many as pay
+    std::string http;           ///< HOST:PORT of the page; empty for none
+    std::uintmax_t minFree = 0; ///< bytes that must be free for a document to be begun
+    std::vector<FolderConfiguration> folders;
+};
+
+/// What holds where a configuration says nothing.
+FolderConfiguration StandardFolderConfiguration();
+WatchConfiguration StandardWatchConfiguration();
+
+/// Reads a configuration. Its paths are relative to its own folder.
+/// @param fault receives why it cannot be used, with line and column
+std::optional<WatchConfiguration> ReadWatchConfiguration(const std::filesystem::path& file,
+                                                         Fault& fault);
