@@ -13,6 +13,9 @@ namespace {
 
 volatile std::sig_atomic_t g_requested = 0;
 
+std::atomic<bool> g_reloadRequested{false};
+static_assert(std::atomic<bool>::is_always_lock_free, "it is set by a signal");
+
 std::atomic<const char*> g_note{nullptr};
 
 extern "C" void NoteRequest(int signal) {
@@ -26,6 +29,10 @@ extern "C" void NoteRequest(int signal) {
     if (const char* const note = g_note) [[maybe_unused]]
         const ssize_t written = write(STDERR_FILENO, note, std::strlen(note));
     errno = error;
+}
+
+extern "C" void NoteReload(int) {
+    g_reloadRequested = true;
 }
 
 extern "C" void DoNothing(int) {}
@@ -74,4 +81,12 @@ void Interruption::LeaveToParent() {
 
 bool Interruption::Requested() {
     return g_requested != 0;
+}
+
+void Interruption::ReloadOnHangUp() {
+    Handle(SIGHUP, NoteReload);
+}
+
+bool Interruption::ReloadRequested() {
+    return g_reloadRequested.exchange(false);
 }

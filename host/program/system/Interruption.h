@@ -19,4 +19,11 @@ void LeaveToParent();
 /// Whether one has come.
 bool Requested();
 
+/// From now on, after Install, a hang-up is no request to end, but one to read the configuration
+/// anew. Not every system has such a request.
+void ReloadOnHangUp();
+
+/// Whether one of those has come since this was asked last.
+bool ReloadRequested();
+
 } // namespace Interruption

@@ -68,3 +68,11 @@ void Interruption::LeaveToParent() {
 bool Interruption::Requested() {
     return g_requested;
 }
+
+// A window that is closed ends its programs here, and nothing else means to read anew.
+
+void Interruption::ReloadOnHangUp() {}
+
+bool Interruption::ReloadRequested() {
+    return false;
+}

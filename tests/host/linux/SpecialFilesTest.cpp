@@ -1,5 +1,6 @@
 // Files of which only this system knows.
 
+#include "host/program/system/FileIdentity.h"
 #include "tests/host/ScreenRun.h"
 
 #include <sys/stat.h>
@@ -24,6 +25,15 @@ TEST_F(SpecialFilesTest, AreToldByTheirKind) {
         fs::permissions(m_folder.Write("secret.doc", "x"), fs::perms::none);
         ExpectRefused(m_folder / "secret.doc", -1002, "cannot be read");
     }
+}
+
+TEST_F(SpecialFilesTest, AreLookedAtThemselves) {
+    ASSERT_EQ(mkfifo((m_folder / "pipe").c_str(), 0600), 0);
+    fs::create_symlink("pipe", m_folder / "link");
+    std::error_code error;
+    EXPECT_EQ(LookAt(m_folder / "pipe", error).type, fs::file_type::fifo);
+    EXPECT_EQ(LookAt(m_folder / "link", error).type, fs::file_type::symlink);
+    EXPECT_EQ(LookAt("/dev/null", error).type, fs::file_type::character);
 }
 
 TEST_F(SpecialFilesTest, ThatAreNamedOutOfTheOrdinaryAreShownOnOneLine) {
