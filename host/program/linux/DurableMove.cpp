@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <cstdio>
 
 namespace fs = std::filesystem;
 
@@ -33,6 +34,25 @@ std::error_code Sync(const fs::path& path, int flags) {
 }
 
 } // namespace
+
+std::error_code SyncFile(const fs::path& file) {
+    return Sync(file, 0);
+}
+
+std::error_code MoveWithoutReplacing(const fs::path& from, const fs::path& to) {
+    std::error_code error = Sync(from, 0);
+    if (error)
+        return error;
+    if (renameat2(AT_FDCWD, from.c_str(), AT_FDCWD, to.c_str(), RENAME_NOREPLACE) == 0)
+        return {};
+    if (errno != EINVAL && errno != ENOSYS)
+        return {errno, std::generic_category()};
+    // The file system cannot do both at once. To link and unlink could leave both names.
+    if (fs::exists(fs::symlink_status(to, error)))
+        return std::make_error_code(std::errc::file_exists);
+    fs::rename(from, to, error);
+    return error;
+}
 
 std::error_code MoveDurably(const fs::path& from, const fs::path& to) {
     std::error_code error = Sync(from, 0);

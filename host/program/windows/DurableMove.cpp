@@ -12,6 +12,15 @@ std::error_code LastError() {
     return {static_cast<int>(GetLastError()), std::system_category()};
 }
 
+std::error_code Move(const fs::path& from, const fs::path& to, DWORD flags) {
+    if (const std::error_code error = SyncFile(from))
+        return error;
+    return MoveFileExW(from.c_str(), to.c_str(), flags | MOVEFILE_WRITE_THROUGH) ? std::error_code()
+                                                                                 : LastError();
+}
+
+} // namespace
+
 std::error_code SyncFile(const fs::path& path) {
     constexpr DWORD Everything = FILE_SHARE_READ | FILE_SHARE_WRITE | FILE_SHARE_DELETE;
     HANDLE opened = CreateFileW(path.c_str(), GENERIC_WRITE, Everything, nullptr, OPEN_EXISTING,
@@ -24,14 +33,12 @@ std::error_code SyncFile(const fs::path& path) {
     return LastError();
 }
 
-} // namespace
+std::error_code MoveWithoutReplacing(const fs::path& from, const fs::path& to) {
+    return Move(from, to, 0);
+}
 
 std::error_code MoveDurably(const fs::path& from, const fs::path& to) {
-    if (const std::error_code error = SyncFile(from))
-        return error;
-    return MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING | MOVEFILE_WRITE_THROUGH)
-               ? std::error_code()
-               : LastError();
+    return Move(from, to, MOVEFILE_REPLACE_EXISTING);
 }
 
 /// Folders cannot be flushed here; the move itself has waited for the disk.
