@@ -39,7 +39,7 @@ TEST(MessagesTest, WhatIsNoSuchMessageIsRefused) {
             EXPECT_FALSE(DecodeNews(wrong.dump())) << wrong;
         }
     for (const auto& [field, beyond] :
-         {std::pair("/outcome/state", 6), {"/outcome/fault/blame", 4}}) {
+         {std::pair("/outcome/state", 7), {"/outcome/fault/blame", 4}}) {
         json wrong = whole;
         wrong[json::json_pointer(field)] = beyond;
         EXPECT_FALSE(DecodeNews(wrong.dump())) << wrong;

@@ -9,6 +9,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
+constexpr unsigned StandardStall = 60; // seconds
 constexpr unsigned LongestSeconds = 24 * 60 * 60;
 constexpr unsigned MostMegabytes = 1 << 20;
 constexpr unsigned MostEngineDocuments = 10'000;
@@ -75,8 +76,12 @@ void AddCommonOptions(CLI::App& program, CommonOptions& options) {
         ->type_name("DIR");
 }
 
-std::vector<std::string> OptionsForWorkers(const CommonOptions& options) {
-    std::vector<std::string> arguments;
+std::chrono::seconds WorkerPatience(const CommonOptions& options) {
+    return std::chrono::seconds(options.stallSeconds.value_or(StandardStall));
+}
+
+std::vector<std::string> WorkerArguments(const CommonOptions& options) {
+    std::vector<std::string> arguments = {"worker"};
     const auto pass = [&arguments](const char* option, const std::optional<std::string>& value) {
         if (value)
             arguments.insert(arguments.end(), {option, *value});

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <filesystem>
 #include <functional>
 #include <optional>
@@ -32,8 +33,11 @@ struct CommonOptions {
 /// @param options receives what is given, and outlives the parsing
 void AddCommonOptions(CLI::App& program, CommonOptions& options);
 
-/// The options that a run hands on to its workers.
-std::vector<std::string> OptionsForWorkers(const CommonOptions& options);
+/// The arguments that make this program a worker of a run.
+std::vector<std::string> WorkerArguments(const CommonOptions& options);
+
+/// How long a worker may give no sign of life.
+std::chrono::seconds WorkerPatience(const CommonOptions& options);
 
 // By these, most commands do without the headers of the command line's library, which take long.
 

@@ -1,6 +1,8 @@
 #include "host/program/base/PathText.h"
 #include "host/program/commands/Command.h"
 #include "host/program/documents/Conversion.h"
+#include "host/program/documents/Delivery.h"
+#include "host/program/documents/OutputFolder.h"
 #include "host/program/documents/Screening.h"
 #include "host/program/documents/Workplace.h"
 #include "host/program/machine/MachineSetup.h"
@@ -14,11 +16,11 @@
 #include <wx/intl.h>
 
 #include <CLI/CLI.hpp>
+#include <map>
 
 namespace {
 
 constexpr unsigned MostJobs = 64;
-constexpr unsigned WorkerPatience = 60; // seconds
 
 struct ConvertOptions {
     std::vector<std::string> paths;
@@ -79,48 +81,121 @@ std::vector<Input> Convertible(const Run& run) {
     return inputs;
 }
 
-void ConvertInTurn(const Run& run, Reporter& reporter, OrderedReport& report) {
-    for (std::size_t i = 0; i < run.inputs.size(); ++i) {
-        const Input& input = run.inputs[i];
-        Progress progress(reporter, Shown(input.given.filename()));
-        report.Add(i, Interruption::Requested() ? NotReached(run.filters, input)
-                                                : ConvertInput(input, run.names[i], run.filters,
-                                                               run.outputFolder, progress));
-    }
+/// Says in the outcome that nothing can be made of its document.
+Outcome WithoutWorkplace(const Run& run, const Input& input, const Fault& fault) {
+    Outcome outcome;
+    outcome.input = input.given;
+    outcome.End(State::Failed, fault, run.filters.ErrorText(fault.code));
+    return outcome;
 }
 
-/// The arguments that make this program a worker of the run.
-std::vector<std::string> WorkerArguments(const CommonOptions& options) {
-    std::vector<std::string> arguments = OptionsForWorkers(options);
-    arguments.insert(arguments.begin(), "worker");
-    return arguments;
+Outcome ConvertHere(const Run& run, std::size_t number, Reporter& reporter) {
+    const Input& input = run.inputs[number];
+    if (run.names[number].empty())
+        return Screen(run.filters, input).outcome;
+    Fault fault;
+    const std::optional<Workplace> workplace = Workplace::Create(run.outputFolder.Path(), fault);
+    if (!workplace)
+        return WithoutWorkplace(run, input, fault);
+    Progress progress(reporter, Shown(input.given.filename()));
+    Outcome outcome = ConvertInput(input, run.filters, workplace->Path(), progress);
+    Deliver(*workplace, run.names[number], run.filters, outcome);
+    return outcome;
+}
+
+void ConvertInTurn(const Run& run, Reporter& reporter, OrderedReport& report) {
+    for (std::size_t i = 0; i < run.inputs.size(); ++i)
+        report.Add(i, Interruption::Requested() ? NotReached(run.filters, run.inputs[i])
+                                                : ConvertHere(run, i, reporter));
 }
 
 unsigned EngineDocuments(const CommonOptions& options, std::size_t documents, std::size_t workers) {
     return options.engineDocuments.value_or(WorthwhileEngineDocuments(documents, workers));
 }
 
-void ConvertSideBySide(const Run& run, std::size_t workers, const CommonOptions& options,
-                       const Settings& settings, Reporter& reporter, OrderedReport& report) {
-    std::vector<Assignment> assignments;
-    std::vector<std::size_t> numbers; // of the assignments' inputs
-    for (std::size_t i = 0; i < run.inputs.size(); ++i) {
-        if (run.names[i].empty()) { // there is nothing to convert, nor to wait for
-            report.Add(i, Screen(run.filters, run.inputs[i]).outcome);
-            continue;
+/// Has the documents of a run converted by workers.
+class ConversionSideBySide : private WorkerPool::Owner {
+public:
+    /// @param work what all assignments have in common
+    ConversionSideBySide(const Run& run, Assignment work, const CommonOptions& options,
+                         Reporter& reporter, OrderedReport& report)
+        : m_run(run), m_work(std::move(work)), m_reporter(reporter), m_report(report),
+          m_pool(WorkerArguments(options), WorkerPatience(options), *this) {}
+
+    void Convert(std::size_t workers) {
+        std::size_t next = 0;
+        while (next < m_run.inputs.size() || m_pool.Busy() > 0) {
+            while (next < m_run.inputs.size() && m_pool.Busy() < workers)
+                Begin(next++);
+            if (m_pool.Busy() > 0)
+                m_pool.Step();
         }
-        assignments.push_back({run.inputs[i], run.names[i]});
-        numbers.push_back(i);
+        m_pool.Close();
     }
-    WorkerPool pool(WorkerArguments(options),
-                    std::chrono::seconds(options.stallSeconds.value_or(WorkerPatience)),
-                    {settings.Xml(), run.outputFolder.Path(),
-                     EngineDocuments(options, assignments.size(), workers)},
-                    run.filters, reporter);
-    pool.Run(assignments, workers, [&](std::size_t assignment, Outcome outcome) {
-        report.Add(numbers[assignment], std::move(outcome));
-    });
-}
+
+private:
+    struct UnderWay {
+        Workplace workplace;
+        Progress progress;
+    };
+
+    void Begin(std::size_t number) {
+        const Input& input = m_run.inputs[number];
+        Fault fault;
+        if (m_run.names[number].empty()) { // there is nothing to convert
+            Add(number, Screen(m_run.filters, input).outcome);
+        } else if (Interruption::Requested()) {
+            Add(number, NotReached(m_run.filters, input));
+        } else if (auto workplace = Workplace::Create(m_run.outputFolder.Path(), fault)) {
+            Assignment work = m_work;
+            work.input = input;
+            work.workplace = workplace->Path();
+            m_underWay.try_emplace(number,
+                                   UnderWay{std::move(*workplace),
+                                            Progress(m_reporter, Shown(input.given.filename()))});
+            m_pool.Give(static_cast<WorkerPool::Ticket>(number), std::move(work));
+        } else {
+            Add(number, WithoutWorkplace(m_run, input, fault));
+        }
+    }
+
+    void Add(std::size_t number, Outcome outcome) {
+        ++m_done;
+        m_report.Add(number, std::move(outcome));
+    }
+
+    void OnProgress(WorkerPool::Ticket ticket, const wxString& step, int percent) override {
+        if (!m_reporter.ForTerminal()) {
+            m_underWay.at(static_cast<std::size_t>(ticket)).progress.Report(step, percent);
+            return;
+        }
+        wxString names; // one line is there for all that is under way
+        for (const auto& [number, each] : m_underWay)
+            names << (names.empty() ? "" : ", ") << each.progress.Document();
+        const std::size_t all = m_run.inputs.size();
+        m_reporter.Passing(
+            ProgressLine(static_cast<int>(m_done * 100 / all),
+                         wxString::Format(_("%zu of %zu"), m_done, all) + "  " + names));
+    }
+
+    void OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) override {
+        const auto number = static_cast<std::size_t>(ticket);
+        const auto underWay = m_underWay.find(number);
+        if (outcome.fault && outcome.text.empty())
+            outcome.text = m_run.filters.ErrorText(outcome.fault->code);
+        Deliver(underWay->second.workplace, m_run.names[number], m_run.filters, outcome);
+        m_underWay.erase(underWay);
+        Add(number, std::move(outcome));
+    }
+
+    const Run& m_run;
+    const Assignment m_work;
+    Reporter& m_reporter;
+    OrderedReport& m_report;
+    std::size_t m_done = 0;
+    std::map<std::size_t, UnderWay> m_underWay;
+    WorkerPool m_pool;
+};
 
 ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
                     Reporter& reporter) {
@@ -144,10 +219,15 @@ ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
     OrderedReport report(inputs.size(), reporter);
     const std::vector<Input> convertible = Convertible(run);
     const std::size_t workers = convert.jobs ? *convert.jobs : WorthwhileWorkers(convertible);
+    const unsigned engineDocuments = EngineDocuments(options, convertible.size(), workers);
     if (workers > 1) {
-        ConvertSideBySide(run, workers, options, *settings, reporter, report);
+        Assignment work;
+        work.settings = settings->Xml();
+        work.language = options.language;
+        work.engineDocuments = engineDocuments;
+        ConversionSideBySide(run, work, options, reporter, report).Convert(workers);
     } else {
-        KeepEngine(EngineDocuments(options, convertible.size(), workers));
+        KeepEngine(engineDocuments);
         filters.ApplySettings(settings->Node());
         ConvertInTurn(run, reporter, report);
     }

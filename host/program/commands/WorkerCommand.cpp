@@ -1,14 +1,16 @@
+#include "common/WQServices.h"
 #include "host/program/commands/Command.h"
-#include "host/program/documents/Conversion.h"
 #include "host/program/machine/MachineSetup.h"
+#include "host/program/report/Language.h"
 #include "host/program/settings/Settings.h"
 #include "host/program/system/ChildProcess.h"
-#include "host/program/workers/Messages.h"
+#include "host/program/workers/AssignmentWork.h"
 
 #include <condition_variable>
 #include <deque>
 #include <mutex>
 #include <thread>
+#include <utility>
 
 namespace {
 
@@ -104,30 +106,58 @@ private:
     std::thread m_heart;
 };
 
-ExitCode Serve(Run& run, const RunFacts& facts, const std::filesystem::path& filtersFolder) {
-    Fault fault;
-    const std::optional<Settings> settings = Settings::FromXml(facts.settings, fault);
-    const std::optional<OutputFolder> outputFolder = OutputFolder::Open(facts.outputFolder, fault);
-    if (!settings || !outputFolder)
-        EndAtOnce(ExitCode::WrongUsage);
-    KeepEngine(facts.engineDocuments);
-    FilterSet filters(filtersFolder);
-    filters.ApplySettings(settings->Node());
-    run.Done();
+/// What has to be as an assignment says, and is changed only where it is not.
+class Surroundings {
+public:
+    explicit Surroundings(const CommonOptions& options)
+        : m_filters(options.FiltersFolder()), m_language(options.language) {}
+
+    /// @return whether the assignment's settings are any
+    bool Suit(const Assignment& work) {
+        if (std::exchange(m_engineDocuments, work.engineDocuments) != work.engineDocuments)
+            KeepEngine(work.engineDocuments);
+        if (std::exchange(m_language, work.language) != work.language)
+            Speak();
+        if (m_settings == work.settings)
+            return true;
+        Fault fault;
+        const std::optional<Settings> settings = Settings::FromXml(work.settings, fault);
+        if (!settings)
+            return false;
+        m_filters.ApplySettings(settings->Node());
+        m_settings = work.settings;
+        return true;
+    }
+
+    const FilterSet& Filters() const { return m_filters; }
+
+private:
+    void Speak() const {
+        const auto fault =
+            UseLanguage(m_language ? std::optional(wxString::FromUTF8(*m_language)) : std::nullopt);
+        if (fault)
+            SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__) << fault->what;
+    }
+
+    FilterSet m_filters;
+    unsigned m_engineDocuments = 0;
+    std::optional<std::string> m_language;
+    std::optional<std::string> m_settings;
+};
+
+ExitCode RunWorker(const CommonOptions& options, Reporter& /*reporter*/) {
+    Run run;
+    Surroundings surroundings(options);
     while (const std::optional<Assignment> work = run.Next(DecodeAssignment)) {
         run.Tell({}); // it has begun
+        if (!surroundings.Suit(*work))
+            EndAtOnce(ExitCode::WrongUsage);
         News news;
-        news.outcome = ConvertInput(work->input, work->baseName, filters, *outputFolder, run);
+        news.outcome = ConvertAssignment(*work, surroundings.Filters(), run);
         run.Done();
         run.Tell(news);
     }
     return ExitCode::Done;
-}
-
-ExitCode RunWorker(const CommonOptions& options, Reporter& /*reporter*/) {
-    Run run;
-    const std::optional<RunFacts> facts = run.Next(DecodeRunFacts);
-    return facts ? Serve(run, *facts, options.FiltersFolder()) : ExitCode::Done;
 }
 
 } // namespace

@@ -18,6 +18,8 @@ const char* NameOf(State state) {
         return wxTRANSLATE("failed");
     case State::NotConverted:
         return wxTRANSLATE("not converted");
+    case State::Changed:
+        return wxTRANSLATE("changed");
     }
     return "";
 }

@@ -12,17 +12,19 @@
 /// How far a file has come.
 enum class State {
     Accepted,     ///< by its filter; nothing more was asked for
-    Converted,    ///< its output is there
+    Converted,    ///< its output is there, or made and to be delivered
     Skipped,      ///< found in a folder, and no filter's business
     Refused,      ///< is no document that can be converted
     Failed,       ///< could not be converted
     NotConverted, ///< its turn did not come
+    Changed,      ///< is not what it was, or gone, when its turn came or while it was converted
 };
 
 /// What has become of one file.
 struct Outcome {
     std::filesystem::path input;
-    std::filesystem::path output; ///< empty when there is none
+    std::filesystem::path made;   ///< its output, as long as that is not in its place
+    std::filesystem::path output; ///< in its place; empty when there is none
     State state = State::Accepted;
     std::optional<Fault> fault; ///< why it has come no further
     wxString text;              ///< the result code's message

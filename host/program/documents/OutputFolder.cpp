@@ -62,8 +62,8 @@ wxString OutputFolder::Allot(const wxString& fileName) {
     return name;
 }
 
-bool OutputFolder::IsFull() const {
+bool IsFull(const fs::path& folder) {
     std::error_code error;
     const fs::path temporary = fs::temp_directory_path(error);
-    return !HasRoom(m_path) || (!error && !HasRoom(temporary));
+    return !HasRoom(folder) || (!error && !HasRoom(temporary));
 }

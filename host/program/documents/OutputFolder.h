@@ -21,12 +21,12 @@ public:
     /// @param fileName the input's name with extension
     wxString Allot(const wxString& fileName);
 
-    /// Whether next to nothing can be written any more, here or among the temporary files.
-    bool IsFull() const;
-
 private:
     explicit OutputFolder(std::filesystem::path path) : m_path(std::move(path)) {}
 
     std::filesystem::path m_path;
     std::set<wxString> m_allotted; ///< in lower case, as some file systems see no difference
 };
+
+/// Whether next to nothing can be written any more, in a folder or among the temporary files.
+bool IsFull(const std::filesystem::path& folder);

@@ -1,7 +1,6 @@
 #include "host/program/documents/Workplace.h"
 
 #include "host/program/base/PathText.h"
-#include "host/program/system/DurableMove.h"
 
 #include <windows.h>
 
@@ -78,7 +77,7 @@ std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, Fault& 
     for (int number = 0; number < 1000; ++number) { // taken: by a process that was ended
         const fs::path path = outputFolder / (prefix + std::to_string(number));
         if (fs::create_directory(path, error)) {
-            Workplace workplace(path);
+            Workplace workplace(path, OpenMark(path, CREATE_NEW));
             if (workplace.IsMarked())
                 return workplace;
         }
@@ -105,8 +104,18 @@ void Workplace::RemoveAbandoned(const fs::path& outputFolder) {
     }
 }
 
-Workplace::Workplace(fs::path path)
-    : m_path(std::move(path)), m_mark(OpenMark(m_path, CREATE_NEW)) {}
+std::optional<Workplace> Workplace::TakeOver(const fs::path& path) {
+    std::shared_ptr<void> mark = OpenMark(path, OPEN_EXISTING);
+    return mark ? std::optional(Workplace(path, std::move(mark))) : std::nullopt;
+}
+
+void Workplace::Leave() {
+    m_path.clear();
+    m_mark.reset();
+}
+
+Workplace::Workplace(fs::path path, std::shared_ptr<void> mark)
+    : m_path(std::move(path)), m_mark(std::move(mark)) {}
 
 /// Another process may take a workplace for abandoned in the moment between the making of its mark
 /// and the lock on it. Then there is no lock, or the mark is gone.
@@ -123,25 +132,4 @@ Workplace::Workplace(Workplace&& other) noexcept
 Workplace::~Workplace() {
     if (!m_path.empty())
         Remove(m_path, std::move(m_mark));
-}
-
-std::optional<Fault> Workplace::Deliver(const wxString& name, const wxString& newName) const {
-    const fs::path from = m_path / FromText(name);
-    const fs::path to = m_path.parent_path() / FromText(newName);
-    const std::error_code error = MoveDurably(from, to);
-    if (!error)
-        return std::nullopt;
-    return Fault{wxString::Format(_("the output could not be put in place as %s: %s"), Shown(to),
-                                  Because(error)),
-                 Blame::Machine};
-}
-
-std::optional<Fault> Workplace::ConfirmDelivery() const {
-    const fs::path outputFolder = m_path.parent_path();
-    const std::error_code error = SyncFolder(outputFolder);
-    if (!error)
-        return std::nullopt;
-    return Fault{wxString::Format(_("the output is in %s, but may be lost if the power fails: %s"),
-                                  Shown(outputFolder), Because(error)),
-                 Blame::Machine};
 }

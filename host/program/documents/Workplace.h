@@ -13,6 +13,10 @@ public:
     /// @param fault receives why there is none
     static std::optional<Workplace> Create(const std::filesystem::path& outputFolder, Fault& fault);
 
+    /// Takes over one whose program was ended, or has left it.
+    /// @return nothing when it is gone, or somebody else has it
+    static std::optional<Workplace> TakeOver(const std::filesystem::path& path);
+
     /// Removes the workplaces of programs that were ended before they could do it: those whose mark
     /// nobody has, and old ones that have none.
     static void RemoveAbandoned(const std::filesystem::path& outputFolder);
@@ -23,18 +27,11 @@ public:
 
     const std::filesystem::path& Path() const { return m_path; }
 
-    /// Moves a file to the output folder, in place of an older one, when its bytes are on the disk.
-    /// @param name of the file here
-    /// @param newName of the file there
-    /// @return why it is not there
-    std::optional<Fault> Deliver(const wxString& name, const wxString& newName) const;
-
-    /// Waits until all that was delivered is on the disk under its names.
-    /// @return why that is not certain
-    std::optional<Fault> ConfirmDelivery() const;
+    /// Leaves it with what is in it to whoever takes it over.
+    void Leave();
 
 private:
-    explicit Workplace(std::filesystem::path path);
+    Workplace(std::filesystem::path path, std::shared_ptr<void> mark);
     bool IsMarked() const;
 
     std::filesystem::path m_path; ///< empty after a move

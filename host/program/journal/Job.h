@@ -47,6 +47,8 @@ struct Job {
     wxString product;                ///< the name of its output's file in there
     std::filesystem::path output;    ///< where its output goes, or has gone; or empty
 
+    std::filesystem::path aside; ///< where its source is to be put away, or has been; or empty
+
     std::optional<Fault> fault; ///< of its last attempt
     wxString text;              ///< the message of the fault's code
 

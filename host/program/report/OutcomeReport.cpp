@@ -113,6 +113,8 @@ wxString CountFormat(State state, unsigned count) {
         return wxPLURAL("%u failed", "%u failed", count);
     case State::NotConverted:
         return wxPLURAL("%u not converted", "%u not converted", count);
+    case State::Changed:
+        return wxPLURAL("%u changed", "%u changed", count);
     }
     return {};
 }

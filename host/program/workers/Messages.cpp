@@ -64,7 +64,7 @@ json ToJson(const Fault& fault) {
 
 json ToJson(const Outcome& outcome) {
     return {{"input", outcome.input.u8string()},
-            {"output", outcome.output.u8string()},
+            {"made", outcome.made.u8string()},
             {"state", static_cast<int>(outcome.state)},
             {"fault", outcome.fault ? ToJson(*outcome.fault) : json()},
             {"text", outcome.text.utf8_string()},
@@ -87,8 +87,8 @@ Fault FaultOf(const json& value) {
 Outcome OutcomeOf(const json& value) {
     Outcome outcome;
     outcome.input = PathOf(value.at("input"));
-    outcome.output = PathOf(value.at("output"));
-    outcome.state = ValueOf(value.at("state"), State::NotConverted);
+    outcome.made = PathOf(value.at("made"));
+    outcome.state = ValueOf(value.at("state"), State::Changed);
     if (const json& fault = value.at("fault"); !fault.is_null())
         outcome.fault = FaultOf(fault);
     outcome.text = TextOf(value.at("text"));
@@ -104,17 +104,20 @@ std::string LineOf(const json& message) {
 
 } // namespace
 
-std::string Encode(const RunFacts& facts) {
-    return LineOf({{"settings", facts.settings},
-                   {"outputFolder", facts.outputFolder.u8string()},
-                   {"engineDocuments", facts.engineDocuments}});
-}
-
 std::string Encode(const Assignment& assignment) {
-    return LineOf({{"given", assignment.input.given.u8string()},
-                   {"full", assignment.input.full.u8string()},
-                   {"named", assignment.input.named},
-                   {"baseName", assignment.baseName.utf8_string()}});
+    json message = {{"given", assignment.input.given.u8string()},
+                    {"full", assignment.input.full.u8string()},
+                    {"named", assignment.input.named},
+                    {"workplace", assignment.workplace.u8string()},
+                    {"settings", assignment.settings},
+                    {"engineDocuments", assignment.engineDocuments},
+                    {"asItIs", assignment.asItIs}};
+    if (assignment.language)
+        message["language"] = *assignment.language;
+    if (assignment.identity)
+        message["identity"] = {assignment.identity->device, assignment.identity->number,
+                               assignment.identity->size, assignment.identity->modified};
+    return LineOf(message);
 }
 
 std::string Encode(const News& news) {
@@ -124,18 +127,22 @@ std::string Encode(const News& news) {
     return LineOf(message);
 }
 
-std::optional<RunFacts> DecodeRunFacts(const std::string& line) {
-    return Decode<RunFacts>(line, [](const json& message) {
-        return RunFacts{message.at("settings"), PathOf(message.at("outputFolder")),
-                        message.at("engineDocuments")};
-    });
-}
-
 std::optional<Assignment> DecodeAssignment(const std::string& line) {
     return Decode<Assignment>(line, [](const json& message) {
-        return Assignment{
-            {PathOf(message.at("given")), PathOf(message.at("full")), message.at("named")},
-            TextOf(message.at("baseName"))};
+        Assignment assignment;
+        assignment.input = {PathOf(message.at("given")), PathOf(message.at("full")),
+                            message.at("named")};
+        assignment.workplace = PathOf(message.at("workplace"));
+        assignment.settings = message.at("settings");
+        assignment.engineDocuments = message.at("engineDocuments");
+        assignment.asItIs = message.at("asItIs");
+        if (message.contains("language"))
+            assignment.language = message["language"];
+        if (message.contains("identity")) {
+            const json& identity = message["identity"];
+            assignment.identity = {identity.at(0), identity.at(1), identity.at(2), identity.at(3)};
+        }
+        return assignment;
     });
 }
 

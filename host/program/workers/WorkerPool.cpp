@@ -1,49 +1,70 @@
 #include "host/program/workers/WorkerPool.h"
 
 #include "common/WQServices.h"
-#include "host/program/base/PathText.h"
 #include "host/program/base/Reasons.h"
-#include "host/program/documents/Screening.h"
-#include "host/program/documents/Workplace.h"
-#include "host/program/system/Interruption.h"
-#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 
 #include <algorithm>
 
-using Clock = std::chrono::steady_clock;
-
 WorkerPool::WorkerPool(std::vector<std::string> arguments, std::chrono::seconds patience,
-                       RunFacts facts, const FilterSet& filters, Reporter& reporter)
-    : m_arguments(std::move(arguments)), m_patience(patience), m_facts(std::move(facts)),
-      m_filters(filters), m_reporter(reporter) {}
+                       Owner& owner)
+    : m_arguments(std::move(arguments)), m_patience(patience), m_owner(owner),
+      m_looked(Clock::now()) {}
 
 WorkerPool::~WorkerPool() {
-    for (Worker& worker : m_workers) // none are left but after an exception
+    for (Worker& worker : m_workers)
         if (worker.process) {
             worker.process->Kill();
             worker.reader.join();
         }
 }
 
-void WorkerPool::Run(const std::vector<Assignment>& assignments, std::size_t workers,
-                     const Deliver& deliver) {
-    m_assignments = &assignments;
-    m_deliver = &deliver;
-    m_workers.resize(std::min(workers, assignments.size()));
-    m_looked = Clock::now();
-    for (std::size_t number = 0; number < m_workers.size(); ++number)
-        GiveWork(number);
-    while (IsAnyBusy()) {
-        if (const std::optional<Event> event = Await()) {
-            if (event->line)
-                OnLine(event->worker, *event->line);
-            else
-                OnEnd(event->worker);
-        }
-        EndTheSilent();
+void WorkerPool::Give(Ticket ticket, Assignment assignment) {
+    const std::size_t number = IdleWorker();
+    Worker& worker = m_workers[number];
+    worker.ticket = ticket;
+    worker.assignment = std::move(assignment);
+    worker.attempts = 0;
+    worker.triedAgain = false;
+    Begin(number);
+}
+
+/// @return one that has a process, if there is any such
+std::size_t WorkerPool::IdleWorker() {
+    std::size_t idle = m_workers.size();
+    for (std::size_t number = m_workers.size(); number-- > 0;)
+        if (!m_workers[number].ticket && (idle == m_workers.size() || m_workers[number].process))
+            idle = number;
+    if (idle == m_workers.size())
+        m_workers.emplace_back();
+    return idle;
+}
+
+std::size_t WorkerPool::Busy() const {
+    return static_cast<std::size_t>(
+        std::count_if(m_workers.begin(), m_workers.end(),
+                      [](const Worker& worker) { return worker.ticket.has_value(); }));
+}
+
+void WorkerPool::Step(std::chrono::milliseconds longest) {
+    if (const std::optional<Event> event = Await(longest)) {
+        if (event->line)
+            OnLine(event->worker, *event->line);
+        else
+            OnEnd(event->worker);
     }
+    EndTheSilent();
+}
+
+void WorkerPool::Retire(std::chrono::seconds idleFor) {
+    const Clock::time_point now = Clock::now();
+    for (Worker& worker : m_workers)
+        if (worker.process && !worker.ticket && now - worker.idleSince > idleFor)
+            worker.process->Channel().CloseOutput(); // its reader will say that it has ended
+}
+
+void WorkerPool::Close() {
     for (Worker& worker : m_workers)
         if (worker.process)
             worker.process->Channel().CloseOutput();
@@ -55,26 +76,16 @@ void WorkerPool::Run(const std::vector<Assignment>& assignments, std::size_t wor
         }
 }
 
-/// Gives the worker the next assignment, if there is one.
-void WorkerPool::GiveWork(std::size_t number) {
-    while (m_next < m_assignments->size() && !m_workers[number].assignment) {
-        const std::size_t assignment = m_next++;
-        if (Interruption::Requested())
-            (*m_deliver)(assignment, NotReached(m_filters, (*m_assignments)[assignment].input));
-        else
-            Assign(number, assignment);
-    }
-}
-
-void WorkerPool::Assign(std::size_t number, std::size_t assignment) {
+/// Has the worker try its assignment, in a folder of its own: what has had the last one may still
+/// be writing.
+void WorkerPool::Begin(std::size_t number) {
     Worker& worker = m_workers[number];
-    const Assignment& work = (*m_assignments)[assignment];
-    worker.assignment = assignment;
     worker.begun = false;
-    worker.progress.emplace(m_reporter, Shown(work.input.given.filename()));
+    Assignment attempt = worker.assignment;
+    attempt.workplace /= std::to_string(++worker.attempts);
     // When it has ended meanwhile, its reader will say so.
     if (EnsureProcess(number))
-        worker.process->Channel().Write(Encode(work));
+        worker.process->Channel().Write(Encode(attempt));
 }
 
 /// @return whether the worker has a process; if not, its assignment has failed
@@ -92,9 +103,7 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
     worker.proven = false;
     worker.ending = nullptr;
     worker.heard = Clock::now();
-    LineChannel& channel = worker.process->Channel();
-    channel.Write(Encode(m_facts));
-    worker.reader = std::thread([this, number, &channel] {
+    worker.reader = std::thread([this, number, &channel = worker.process->Channel()] {
         while (std::optional<std::string> line = channel.Read())
             Post({number, std::move(line)});
         Post({number, std::nullopt});
@@ -105,7 +114,7 @@ bool WorkerPool::EnsureProcess(std::size_t number) {
 void WorkerPool::OnLine(std::size_t number, const std::string& line) {
     Worker& worker = m_workers[number];
     worker.heard = Clock::now();
-    if (line == SignOfLife || !worker.assignment)
+    if (line == SignOfLife || !worker.ticket)
         return;
     std::optional<News> news = DecodeNews(line);
     if (!news) {
@@ -116,9 +125,8 @@ void WorkerPool::OnLine(std::size_t number, const std::string& line) {
     if (news->outcome) {
         worker.proven = true;
         Finish(number, std::move(*news->outcome));
-        GiveWork(number);
     } else {
-        ShowProgress(worker, *news);
+        m_owner.OnProgress(*worker.ticket, news->step, news->percent);
     }
 }
 
@@ -128,19 +136,21 @@ void WorkerPool::OnEnd(std::size_t number) {
     worker.process->Kill(); // it may only have closed its side
     Fault end = worker.process->Wait();
     worker.process.reset();
-    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
-        << "A worker has " << end.what << (worker.assignment ? " with a document under way" : "");
-    Workplace::RemoveAbandoned(m_facts.outputFolder);
-    if (!worker.assignment)
+    if (!worker.ticket) {
+        SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__)
+            << "A worker without a document has " << end.what;
         return;
+    }
+    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+        << "A worker has " << end.what << " with a document under way";
     if (worker.ending)
         end = {worker.ending};
     const bool fromOutside = end.blame == Blame::Outside;
     if (worker.proven && !worker.begun) { // it ended before the document reached it
-        Assign(number, *worker.assignment);
+        Begin(number);
     } else if (fromOutside && !worker.triedAgain) {
         worker.triedAgain = true;
-        Assign(number, *worker.assignment);
+        Begin(number);
     } else {
         end.what =
             wxString::Format(_("the process that converted it %s"), TranslateReason(end.what));
@@ -148,15 +158,14 @@ void WorkerPool::OnEnd(std::size_t number) {
             end.what = wxString::Format(_("%s, at the second try too"), end.what);
         Fail(number, end);
     }
-    GiveWork(number);
 }
 
 void WorkerPool::Finish(std::size_t number, Outcome outcome) {
     Worker& worker = m_workers[number];
-    ++m_done;
-    (*m_deliver)(*worker.assignment, std::move(outcome));
-    worker.assignment.reset();
-    worker.triedAgain = false;
+    const Ticket ticket = *worker.ticket;
+    worker.ticket.reset();
+    worker.idleSince = Clock::now();
+    m_owner.OnOutcome(ticket, std::move(outcome));
 }
 
 /// Ends a worker; its reader will say so.
@@ -168,25 +177,11 @@ void WorkerPool::End(Worker& worker, const char* reason) {
     worker.process->Kill();
 }
 
-void WorkerPool::Fail(std::size_t number, const Fault& fault) {
+void WorkerPool::Fail(std::size_t number, Fault fault) {
     Outcome outcome;
-    outcome.input = (*m_assignments)[*m_workers[number].assignment].input.given;
-    outcome.End(State::Failed, fault, m_filters.ErrorText(fault.code));
+    outcome.input = m_workers[number].assignment.input.given;
+    outcome.End(State::Failed, std::move(fault), {});
     Finish(number, std::move(outcome));
-}
-
-void WorkerPool::ShowProgress(Worker& worker, const News& news) {
-    if (!m_reporter.ForTerminal()) {
-        worker.progress->Report(news.step, news.percent);
-        return;
-    }
-    wxString names; // one line is there for all that is under way
-    for (const Worker& each : m_workers)
-        if (each.assignment)
-            names << (names.empty() ? "" : ", ") << each.progress->Document();
-    m_reporter.Passing(ProgressLine(
-        static_cast<int>(m_done * 100 / m_assignments->size()),
-        wxString::Format(_("%zu of %zu"), m_done, m_assignments->size()) + "  " + names));
 }
 
 /// Ends the workers that have been silent for too long.
@@ -203,21 +198,24 @@ void WorkerPool::EndTheSilent() {
     }
 }
 
-bool WorkerPool::IsAnyBusy() const {
-    return std::any_of(m_workers.begin(), m_workers.end(),
-                       [](const Worker& worker) { return worker.assignment.has_value(); });
-}
-
 void WorkerPool::Post(Event event) {
     const std::lock_guard lock(m_mutex);
     m_events.push_back(std::move(event));
     m_posted.notify_one();
 }
 
+void WorkerPool::Wake() {
+    const std::lock_guard lock(m_mutex);
+    m_woken = true;
+    m_posted.notify_one();
+}
+
 /// @return nothing when there was none for some time
-std::optional<WorkerPool::Event> WorkerPool::Await() {
+std::optional<WorkerPool::Event> WorkerPool::Await(std::chrono::milliseconds longest) {
     std::unique_lock lock(m_mutex);
-    if (!m_posted.wait_for(lock, BetweenSignsOfLife, [this] { return !m_events.empty(); }))
+    m_posted.wait_for(lock, longest, [this] { return m_woken || !m_events.empty(); });
+    m_woken = false;
+    if (m_events.empty())
         return std::nullopt;
     Event event = std::move(m_events.front());
     m_events.pop_front();

@@ -3,6 +3,8 @@
 #include "host/program/documents/Workplace.h"
 
 #include "host/program/documents/Conversion.h"
+#include "host/program/documents/Delivery.h"
+#include "host/program/documents/OutputFolder.h"
 #include "tests/support/RecordingProgress.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -63,8 +65,10 @@ protected:
         Fault fault;
         const FilterSet filters(TEST_FILTERS);
         RecordingProgress progress;
-        return ConvertInput({document, document}, "a", filters,
-                            OutputFolder::Open(Out(), fault).value(), progress);
+        const auto workplace = Workplace::Create(OutputFolder::Open(Out(), fault)->Path(), fault);
+        Outcome outcome = ConvertInput({document, document}, filters, workplace->Path(), progress);
+        Deliver(*workplace, "a", filters, outcome);
+        return outcome;
     }
 
     TemporaryFolder m_folder;
