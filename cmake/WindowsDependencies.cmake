@@ -1,8 +1,14 @@
-# What Debian has as packages for Linux only. The headers of these two are all of them.
-foreach(library CLI11::CLI11 nlohmann_json::nlohmann_json)
+# What Debian has as packages for Linux only. The headers of the first four are all of them.
+foreach(library CLI11::CLI11 nlohmann_json::nlohmann_json PkgConfig::HTTPLIB PkgConfig::TOML
+                PkgConfig::PROMETHEUS PkgConfig::SQLITE)
     add_library(${library} INTERFACE IMPORTED)
     target_include_directories(${library} SYSTEM INTERFACE "${QUILLON_WINDOWS_LIBRARIES}/include")
 endforeach()
+target_link_libraries(PkgConfig::HTTPLIB INTERFACE ws2_32)
+target_link_libraries(PkgConfig::PROMETHEUS INTERFACE
+    "${QUILLON_WINDOWS_LIBRARIES}/lib/libprometheus-cpp-core.a")
+target_compile_definitions(PkgConfig::PROMETHEUS INTERFACE PROMETHEUS_CPP_CORE_STATIC_DEFINE)
+target_link_libraries(PkgConfig::SQLITE INTERFACE "${QUILLON_WINDOWS_LIBRARIES}/lib/libsqlite3.a")
 
 set(INSTALL_GTEST OFF)
 add_subdirectory(/usr/src/googletest "${CMAKE_BINARY_DIR}/googletest" EXCLUDE_FROM_ALL)

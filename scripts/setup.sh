@@ -20,11 +20,11 @@ run_packages=(
     fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
 )
 test_packages=(libgtest-dev libgmock-dev poppler-utils xvfb xauth)
-# The compiler and the zlib for Windows, Wine, and what builds wxWidgets and expat from source.
+# The compiler and the zlib for Windows, Wine, and what builds the other libraries from source.
 windows_packages=(
     g++-mingw-w64-x86-64-posix gcc-mingw-w64-x86-64-posix libz-mingw-w64 libz-mingw-w64-dev
     googletest wine64
-    dpkg-dev autoconf automake libtool make patch xz-utils
+    dpkg-dev autoconf automake libtool make patch tcl xz-utils
 )
 lint_packages=(clang-format clang-tidy libbenchmark-dev)
 bench_packages=(libgtest-dev libgmock-dev libbenchmark-dev hyperfine python3)
