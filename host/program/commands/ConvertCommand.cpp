@@ -20,8 +20,6 @@
 
 namespace {
 
-constexpr unsigned MostJobs = 64;
-
 struct ConvertOptions {
     std::vector<std::string> paths;
     std::string out;
@@ -261,7 +259,7 @@ void AddConvert(CLI::App& program, Command& chosen) {
         ->add_option("-j,--jobs", given->jobs,
                      "How many documents to convert at a time; by default as many as pay")
         ->type_name("N")
-        ->check(CLI::Range(1U, MostJobs));
+        ->check(CLI::Range(1U, MostWorkers));
     convert
         ->add_option("--set", given->settings.assignments,
                      "One setting; may be given several times")

@@ -3,19 +3,14 @@
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
 #include "host/program/machine/FilePrinter.h"
+#include "host/program/settings/KnownSettings.h"
 #include "machine/Distiller.h"
-#include "plugin/settings/FilterSettings.h"
 
 #include <wx/intl.h>
 
 #include <algorithm>
 
 namespace {
-
-bool IsKnown(const wxString& key) {
-    return std::any_of(std::begin(FilterSettings::All), std::end(FilterSettings::All),
-                       [&key](const Setting* setting) { return key == setting->key; });
-}
 
 /// @return whether the text is a setting
 bool Apply(const std::string& assignment, Settings& settings, Fault& fault) {
@@ -27,7 +22,7 @@ bool Apply(const std::string& assignment, Settings& settings, Fault& fault) {
         return false;
     }
     const wxString key = text.BeforeFirst('=');
-    if (!IsKnown(key))
+    if (!FindSetting(key))
         SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
             << "No filter is known to have a setting " << key << "; see quillon --help.";
     settings.Set(key, text.AfterFirst('='));

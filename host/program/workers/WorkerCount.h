@@ -5,6 +5,9 @@
 #include <cstddef>
 #include <vector>
 
+/// How many documents can be asked to be converted at a time.
+constexpr unsigned MostWorkers = 64;
+
 /// How many documents are best converted at a time: one for each processor, and more of those that
 /// wait without using one, as far as there is memory for them.
 /// @param inputs those that are to be converted
