@@ -7,12 +7,15 @@ namespace System {
 /// Whether documents are converted side by side: not where all of a user's processes share one
 /// registry.
 constexpr bool ConvertsSideBySide = false;
+/// Whether a file can be removed while it is open.
+constexpr bool RemovesOpenFiles = false;
 constexpr char ModuleSuffix[] = ".dll";
 /// What is said to install where Office or PowerPoint is missing.
 constexpr char OfficeAdvice[] = "Install Microsoft Office";
 constexpr char PowerPointAdvice[] = "Install Microsoft PowerPoint";
 #else
 constexpr bool ConvertsSideBySide = true;
+constexpr bool RemovesOpenFiles = true;
 constexpr char ModuleSuffix[] = ".so";
 constexpr char OfficeAdvice[] = "apt-get install libreoffice-writer-nogui";
 constexpr char PowerPointAdvice[] = "libreoffice-impress-nogui";

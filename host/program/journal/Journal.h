@@ -100,15 +100,22 @@ public:
     /// Names of folders as above.
     virtual std::set<wxString> Paused() = 0;
 
-    /// Whether another object or program has changed anything since the last call.
+    /// Whether another object or program may have changed anything since the last call.
     virtual bool HasNews() = 0;
 };
 
-/// Opens a journal, making it where there is none.
+/// What becomes of a journal that is not there, or damaged.
+enum class JournalNeed {
+    Make,  ///< it is begun anew; a damaged one is set aside before, under a name that says so
+    Visit, ///< it stays so, and cannot be opened
+};
+
+/// Opens a journal.
 /// @param where a file's path, UTF-8
-/// @param fault receives why there is none. One of a later version of the program is left alone.
-///     One that is damaged is set aside under a name that says so, and begun anew.
-std::unique_ptr<Journal> OpenJournal(const std::string& where, Fault& fault);
+/// @param fault receives why it cannot be opened. One of a later version of the program is left
+///     alone.
+std::unique_ptr<Journal> OpenJournal(const std::string& where, Fault& fault,
+                                     JournalNeed need = JournalNeed::Make);
 
 /// The user's journal, where no other is named. UTF-8.
 std::string StandardJournal();
