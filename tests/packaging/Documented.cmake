@@ -1,0 +1,33 @@
+# Fails when the help has a command, an option or a setting that the manual page or the completion
+# lacks.
+cmake_minimum_required(VERSION 3.25)
+
+execute_process(COMMAND "${QUILLON}" --help OUTPUT_VARIABLE help COMMAND_ERROR_IS_FATAL ANY)
+string(REGEX MATCHALL "--[a-z][a-z-]+" options "${help}")
+string(REGEX MATCHALL "\n  [A-Z]+   *" settings "${help}")
+string(REGEX REPLACE ".*\nSubcommands:\n(.*)\n\n\n.*" "\\1" commands "${help}")
+string(REGEX MATCHALL "(^|\n)[a-z]+" commands "${commands}")
+foreach(list options settings commands)
+    list(TRANSFORM ${list} STRIP)
+    list(REMOVE_DUPLICATES ${list})
+    list(LENGTH ${list} count)
+    if(count LESS 4)
+        message(SEND_ERROR "The help is not understood: it has ${count} ${list}")
+    endif()
+endforeach()
+
+file(READ "${PROJECT}/docs/man/quillon.1" manual)
+string(REPLACE " \\-" " --" manual "${manual}")
+string(REPLACE "\\-" "-" manual "${manual}")
+file(READ "${PROJECT}/packaging/quillon.bash" completion)
+
+function(expect_all name text)
+    foreach(word IN LISTS ARGN)
+        if(NOT text MATCHES "[^A-Za-z-]${word}[^A-Za-z-]")
+            message(SEND_ERROR "${name} lacks ${word}")
+        endif()
+    endforeach()
+endfunction()
+expect_all(quillon.1 "${manual}" ${commands} ${options})
+string(REPLACE "\\n" "\n" completion "${completion}")
+expect_all(quillon.bash "${completion}" ${commands} ${options} ${settings})
