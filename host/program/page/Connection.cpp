@@ -1,8 +1,6 @@
 #include "host/program/page/Connection.h"
 
-#include <poll.h>
-#include <sys/socket.h>
-#include <unistd.h>
+#include "host/program/system/Sockets.h"
 
 #include <algorithm>
 #include <cctype>
@@ -13,7 +11,7 @@ constexpr std::size_t LargestRequest = 16 << 10;
 constexpr auto LongestRequest = std::chrono::seconds(3);
 constexpr auto LongestRequestInHurry = std::chrono::milliseconds(300);
 constexpr auto LongestAnswer = std::chrono::seconds(5);
-constexpr int LookEvery = 50; // ms
+constexpr auto LookEvery = std::chrono::milliseconds(50);
 
 /// Parts of what we serve are asked for by nobody, and the library reads a long list of them with
 /// a recursion as deep.
@@ -27,32 +25,37 @@ bool AsksForParts(const std::string& head) {
 } // namespace
 
 Connection::Connection(socket_t socket, std::function<bool()> inHurry)
-    : m_socket(socket), m_inHurry(std::move(inHurry)) {}
-
-Connection::~Connection() {
-    shutdown(m_socket, SHUT_RDWR);
-    close(m_socket);
+    : m_socket(socket), m_inHurry(std::move(inHurry)) {
+    Sockets::NeverBlock(static_cast<Sockets::Socket>(socket));
 }
 
-bool Connection::Await(short event, Clock::time_point end) const {
-    for (;;) {
-        pollfd look = {m_socket, event, 0};
-        const int found = poll(&look, 1, LookEvery);
-        if (found > 0)
-            return true;
-        const Clock::time_point now = Clock::now();
-        if ((found < 0 && errno != EINTR) || now > end ||
-            (event == POLLIN && now > m_since + LongestRequestInHurry && m_inHurry()))
+Connection::~Connection() {
+    Sockets::Close(static_cast<Sockets::Socket>(m_socket));
+}
+
+bool Connection::AwaitRequest() const {
+    while (
+        !Sockets::Await(static_cast<Sockets::Socket>(m_socket), Sockets::Use::Receive, LookEvery)) {
+        const auto age = Clock::now() - m_since;
+        if (age > LongestRequest || (age > LongestRequestInHurry && m_inHurry()))
             return false;
     }
+    return true;
+}
+
+bool Connection::AwaitAnswer() const {
+    const auto left = m_answeredSince.value_or(Clock::now()) + LongestAnswer - Clock::now();
+    return left > Clock::duration::zero() &&
+           Sockets::Await(static_cast<Sockets::Socket>(m_socket), Sockets::Use::Send,
+                          std::chrono::duration_cast<std::chrono::milliseconds>(left));
 }
 
 bool Connection::ReceiveMore() {
     char bytes[4096];
     if (m_received.size() >= LargestRequest || Clock::now() > m_since + LongestRequest ||
-        !Await(POLLIN, m_since + LongestRequest))
+        !AwaitRequest())
         return false;
-    const ssize_t size = recv(m_socket, bytes, sizeof bytes, MSG_DONTWAIT);
+    const auto size = recv(m_socket, bytes, sizeof bytes, 0);
     if (size > 0)
         m_received.append(bytes, static_cast<std::size_t>(size));
     return size > 0;
@@ -67,11 +70,11 @@ bool Connection::ReadHead() {
 }
 
 bool Connection::is_readable() const {
-    return m_read < m_received.size() || Await(POLLIN, m_since + LongestRequest);
+    return m_read < m_received.size() || AwaitRequest();
 }
 
 bool Connection::is_writable() const {
-    return Await(POLLOUT, Clock::now() + LongestAnswer);
+    return AwaitAnswer();
 }
 
 ssize_t Connection::read(char* bytes, std::size_t size) {
@@ -83,12 +86,9 @@ ssize_t Connection::read(char* bytes, std::size_t size) {
 }
 
 ssize_t Connection::write(const char* bytes, std::size_t size) {
-    if (m_answeredSince == Clock::time_point())
+    if (!m_answeredSince)
         m_answeredSince = Clock::now();
-    const Clock::time_point end = m_answeredSince + LongestAnswer;
-    if (Clock::now() > end || !Await(POLLOUT, end))
-        return -1;
-    return send(m_socket, bytes, size, MSG_DONTWAIT | MSG_NOSIGNAL);
+    return AwaitAnswer() ? Sockets::Send(static_cast<Sockets::Socket>(m_socket), bytes, size) : -1;
 }
 
 void Connection::get_remote_ip_and_port(std::string& ip, int& port) const {

@@ -4,6 +4,7 @@
 
 #include <chrono>
 #include <functional>
+#include <optional>
 #include <string>
 
 /// A client's connection, for one request and its answer. Neither may be larger or take longer
@@ -33,13 +34,14 @@ public:
 private:
     using Clock = std::chrono::steady_clock;
 
-    bool Await(short event, Clock::time_point end) const;
+    bool AwaitRequest() const;
+    bool AwaitAnswer() const;
     bool ReceiveMore();
 
     const socket_t m_socket;
     const std::function<bool()> m_inHurry;
     const Clock::time_point m_since = Clock::now();
-    Clock::time_point m_answeredSince; ///< its first byte
+    std::optional<Clock::time_point> m_answeredSince; ///< when its first byte went
     std::string m_received;
     std::size_t m_read = 0; ///< of that
 };

@@ -96,7 +96,8 @@ void WriteFolder(Html& html, const PageContent& content, const FolderStatus& fol
     const bool isPaused = IsPaused(name, content.status, content.journal);
     html << "<article class=\"card\">\n<div class=\"bar\"><h3 id=\"folder-" << index << "\"><bdi>"
          << OneLine(name) << "</bdi></h3>";
-    WriteBadge(html, folder, isPaused, content.texts);
+    WriteBadge(html, folder, isPaused || IsPaused("", content.status, content.journal),
+               content.texts);
     html << "</div>\n";
     if (!folder.obstacle.empty())
         html << "<p class=\"notice warn\">" << OneLine(folder.obstacle) << "</p>\n";

@@ -1,5 +1,7 @@
 #include "host/program/page/PageAddress.h"
 
+#include "host/program/system/Sockets.h"
+
 #include <wx/intl.h>
 
 #include <arpa/inet.h>
@@ -46,19 +48,14 @@ std::optional<int> PortOf(const std::string& text) {
 
 } // namespace
 
-bool IsNumber(const std::string& host) {
-    in6_addr number = {};
-    return inet_pton(AF_INET, host.c_str(), &number) == 1 ||
-           inet_pton(AF_INET6, host.c_str(), &number) == 1;
-}
-
 std::string PageAddress::Text() const {
     const bool needsBrackets = host.find(':') != std::string::npos;
     return (needsBrackets ? '[' + host + ']' : host) + ':' + std::to_string(port);
 }
 
 bool PageAddress::IsLoopback() const {
-    return host == "localhost" || host == "::1" || (IsNumber(host) && host.rfind("127.", 0) == 0);
+    return host == "localhost" || host == "::1" ||
+           (Sockets::IsNumber(host) && host.rfind("127.", 0) == 0);
 }
 
 std::optional<PageAddress> ReadPageAddress(const std::string& text, Fault& fault) {

@@ -24,6 +24,3 @@ std::optional<PageAddress> ReadPageAddress(const std::string& text, Fault& fault
 /// The host that a request's header names, in lower case and without brackets and port.
 /// @return nothing when there is none
 std::optional<std::string> HostIn(const std::string& header);
-
-/// Whether a host is a number, which cannot be made to lead elsewhere.
-bool IsNumber(const std::string& host);

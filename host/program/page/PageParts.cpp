@@ -99,7 +99,7 @@ void WriteState(Html& html, const PageContent& content) {
     const Texts& texts = content.texts;
     const JournalExtract& journal = content.journal;
     WriteReasons(html, content);
-    html << "<div class=\"bar card\"><dl class=\"figures sums row\">";
+    html << "<div class=\"bar card\"><dl class=\"figures sums\">";
     WriteFigure(html, texts(wxTRANSLATE("Waiting")), CountOf(journal, JobState::Waiting, nullptr));
     WriteFigure(html, texts(wxTRANSLATE("Under way")), content.status.running.size());
     WriteFigure(html, texts(wxTRANSLATE("Done")),

@@ -102,7 +102,7 @@ void Server::SetRoutes() {
                                              "that the configuration names.")));
         return httplib::Server::HandlerResponse::Handled;
     });
-    m_web.set_exception_handler([](const Request&, Response& response, std::exception_ptr) {
+    m_web.set_exception_handler([](const Request&, Response& response, const std::exception_ptr&) {
         Refuse(response, 500, "internal error");
     });
     m_web.set_error_handler([](const Request&, Response& response) {

@@ -30,7 +30,8 @@ section { margin-top: 1.5rem; outline-offset: .4rem; }
 .good { color: var(--good); background: var(--good-back); }
 .warn { color: var(--warn); background: var(--warn-back); }
 .bad { color: var(--bad); background: var(--bad-back); }
-.reason { font-weight: 600; }
+.reason { font-weight: 600; margin-top: .3rem; }
+.card > .bar:last-child { margin-bottom: 0; }
 .paths { display: grid; grid-template-columns: max-content 1fr; gap: 0 .8rem; font-size: .9rem; }
 .paths dt, .figures dt { color: var(--quiet); }
 .figures { display: grid; grid-template-columns: repeat(auto-fit, minmax(6.5rem, 1fr)); gap: .5rem .8rem;
@@ -39,10 +40,10 @@ section { margin-top: 1.5rem; outline-offset: .4rem; }
 .figures dt { font-size: .8rem; line-height: 1.3; }
 .figures dd { font-size: 1.15rem; font-weight: 600; font-variant-numeric: tabular-nums; }
 .figures .bad { background: none; }
-.sums { margin: 0; }
+.sums { margin: 0; flex: 1 1 16rem; grid-template-columns: repeat(auto-fit, minmax(4.5rem, 8rem)); }
 .sums dd { font-size: 1.6rem; line-height: 1.3; }
 .row { display: flex; flex-wrap: wrap; gap: .3rem 1rem; align-items: baseline; justify-content: space-between; }
-.row > :first-child { flex: 1 1 14rem; }
+.row > :first-child { flex: 1 1 14rem; min-width: 0; }
 progress { width: 100%; height: .6rem; accent-color: var(--accent); display: block; margin-top: .4rem; }
 button { font: inherit; color: var(--ink); background: var(--card); border: 1px solid var(--quiet);
   border-radius: .4rem; padding: .3rem .9rem; min-height: 2.2rem; cursor: pointer; }
@@ -77,7 +78,8 @@ const char* const PageScript = R"js(
     fetch(location.href, {cache: 'no-store'}).then(function (answer) {
       return answer.ok ? answer.text() : Promise.reject();
     }).then(function (text) {
-      new DOMParser().parseFromString(text, 'text/html').querySelectorAll('[data-part]')
+      var main = text.slice(text.indexOf('<main>'), text.indexOf('</main>'));
+      new DOMParser().parseFromString(main, 'text/html').querySelectorAll('[data-part]')
         .forEach(replace);
       away.hidden = true;
     }).catch(function () { away.hidden = false; }).then(function () { isBusy = false; });

@@ -1,5 +1,7 @@
 #include "host/program/page/RequestGuard.h"
 
+#include "host/program/system/Sockets.h"
+
 #include <wx/utils.h>
 
 #include <random>
@@ -44,7 +46,8 @@ RequestGuard::RequestGuard(const PageAddress& address)
 
 bool RequestGuard::IsForUs(const std::string& hostHeader) const {
     const std::optional<std::string> host = HostIn(hostHeader);
-    return host && (IsNumber(*host) || m_names.count(*host) > 0);
+    // A number cannot be made to lead elsewhere.
+    return host && (Sockets::IsNumber(*host) || m_names.count(*host) > 0);
 }
 
 bool RequestGuard::MayChange(const RequestOrigin& request) const {

@@ -5,8 +5,6 @@
 
 #include <wx/intl.h>
 
-#include <sys/socket.h>
-
 namespace {
 
 constexpr std::size_t Threads = 4;
@@ -14,29 +12,24 @@ constexpr unsigned MostWaiting = 16; // more stay with the system, and take none
 constexpr std::size_t LargestForm = 4 << 10;
 constexpr auto RestBetweenStarts = std::chrono::seconds(1);
 
-/// The library would share the port with others that are willing to.
-void SetSocketOptions(socket_t socket) {
-    const int yes = 1;
-    setsockopt(socket, SOL_SOCKET, SO_REUSEADDR, &yes, sizeof yes);
-}
-
-Fault FaultOfBinding(const PageAddress& address, int error) {
+Fault FaultOfBinding(const PageAddress& address, Sockets::BindFailure failure) {
     const wxString where = wxString::FromUTF8(address.Text());
     const Fault fault{wxString::Format(_("the page cannot be served at %s"), where), Blame::Usage};
     const auto with = [&fault](const wxString& why, const wxString& advice) {
         return Fault{fault.what + ": " + why, fault.blame, fault.code, advice};
     };
-    switch (error) {
-    case EADDRINUSE:
+    switch (failure) {
+    case Sockets::BindFailure::InUse:
         return with(_("another program serves there"),
                     _("End that program, or name another port for the page"));
-    case EACCES:
+    case Sockets::BindFailure::NotAllowed:
         return with(_("only the administrator may use this port"),
                     _("Name a port from 1024 on for the page"));
-    default:
-        return with(_("this machine has no such address"),
-                    _("Name one that it has, for instance 127.0.0.1:9188"));
+    case Sockets::BindFailure::Other:
+        break;
     }
+    return with(_("this machine has no such address"),
+                _("Name one that it has, for instance 127.0.0.1:9188"));
 }
 
 } // namespace
@@ -68,7 +61,10 @@ private:
 
 WebServer::WebServer() {
     set_payload_max_length(LargestForm);
-    set_socket_options(SetSocketOptions);
+    Restore();                               // what the base class has done to the signal
+    set_socket_options([](socket_t socket) { // the library would share the port with others
+        Sockets::ServeAlone(static_cast<Sockets::Socket>(socket));
+    });
     new_task_queue = [this] { return BeginListening(); };
 }
 
@@ -85,12 +81,11 @@ WebServer::~WebServer() {
 }
 
 std::optional<Fault> WebServer::Bind(PageAddress& address) {
-    errno = 0;
     const int port = address.port == 0                          ? bind_to_any_port(address.host)
                      : bind_to_port(address.host, address.port) ? address.port
                                                                 : -1;
     if (port < 0)
-        return FaultOfBinding(address, errno);
+        return FaultOfBinding(address, Sockets::LastBindFailure());
     address.port = port;
     m_address = address;
     return std::nullopt;

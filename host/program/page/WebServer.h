@@ -1,6 +1,7 @@
 #pragma once
 
 #include "host/program/page/PageAddress.h"
+#include "host/program/system/Sockets.h"
 
 #include <httplib.h>
 
@@ -10,7 +11,7 @@
 
 /// The library's server in threads of its own, few of them, whatever clients do; it begins anew
 /// when the system ends it. Its routes are set before it serves.
-class WebServer : private httplib::Server {
+class WebServer : private Sockets::KeptSignal, private httplib::Server {
 public:
     WebServer();
     ~WebServer() override;

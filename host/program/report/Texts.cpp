@@ -1,7 +1,5 @@
 #include "host/program/report/Texts.h"
 
-#include "host/services/CatalogueLoader.h"
-
 #include <wx/arrstr.h>
 #include <wx/tokenzr.h>
 
@@ -21,11 +19,11 @@ double WeightOf(const wxString& parameter) {
 
 } // namespace
 
-Texts::Texts(const wxString& language) : m_language(language) {
+Texts::Texts(const wxString& language, const wxString& folder) : m_language(language) {
     if (language == English)
         return;
     m_translations = std::make_unique<wxTranslations>();
-    m_translations->SetLoader(new CatalogueLoader(CatalogueLoader::ProgramFolder())); // owned by it
+    m_translations->SetLoader(new CatalogueLoader(folder)); // owned by it
     m_translations->SetLanguage(language);
     m_translations->AddCatalog(CatalogueDomain);
 }
@@ -43,12 +41,11 @@ wxString Texts::Plural(const char* one, const char* many, unsigned number) const
     return text ? *text : wxString(number == 1 ? one : many);
 }
 
-TextsOfLanguages::TextsOfLanguages() {
-    wxArrayString languages =
-        CatalogueLoader(CatalogueLoader::ProgramFolder()).GetAvailableTranslations(CatalogueDomain);
+TextsOfLanguages::TextsOfLanguages(const wxString& folder) {
+    wxArrayString languages = CatalogueLoader(folder).GetAvailableTranslations(CatalogueDomain);
     languages.Add(English);
     for (const wxString& language : languages)
-        m_texts.try_emplace(language, language);
+        m_texts.try_emplace(language, language, folder);
     wxTranslations* const ofProgram = wxTranslations::Get();
     m_ofProgram = ofProgram ? Find(ofProgram->GetBestTranslation(CatalogueDomain)) : nullptr;
     if (!m_ofProgram)

@@ -1,7 +1,8 @@
 #pragma once
 
+#include "host/services/CatalogueLoader.h"
+
 #include <wx/string.h>
-#include <wx/translation.h>
 
 #include <map>
 #include <memory>
@@ -12,7 +13,8 @@
 class Texts {
 public:
     /// @param language as a catalogue is called; without a catalogue the texts are English
-    explicit Texts(const wxString& language);
+    explicit Texts(const wxString& language,
+                   const wxString& folder = CatalogueLoader::ProgramFolder());
 
     const wxString& Language() const { return m_language; }
 
@@ -30,7 +32,7 @@ class TextsOfLanguages {
 public:
     /// Reads them. Like all that has to do with the program's own language, not beside threads
     /// that ask for texts.
-    TextsOfLanguages();
+    explicit TextsOfLanguages(const wxString& folder = CatalogueLoader::ProgramFolder());
 
     /// Those in a language ("de", "de-AT").
     /// @return null when there are none
