@@ -49,7 +49,7 @@ std::optional<Fault> CheckIsolation(const CommonOptions& options) {
 
 ExitCode Run(const CommandLine& line) {
     const auto& [options, command] = line;
-    Reporter reporter(options.json);
+    Reporter reporter(options.json, options.quiet);
     const bool hasLog = StartLog(options);
     if (const auto fault = StartLanguage(options))
         return reporter.Error(*fault);
@@ -80,7 +80,7 @@ ExitCode RunOnConsole(const CommandLine& line) {
 ExitCode TellNoDisplay(const CommonOptions& options) {
     wxAppConsole console; // the texts are looked for beside the program, which it knows
     wxApp::SetInstance(&console);
-    Reporter reporter(options.json);
+    Reporter reporter(options.json, options.quiet);
     const std::optional<Fault> fault = StartLanguage(options);
     reporter.Error(
         fault ? *fault

@@ -97,15 +97,16 @@ class ScriptedFilter : public WQPlugin {
 public:
     int Initialize(const wxString& serverInfo) override {
         Note("Initialize");
-        m_told = serverInfo + '\n';
+        m_server = serverInfo + '\n';
         return 0;
     }
 
     int ApplySettings(const wxXmlNode* settings) override {
         Note("ApplySettings");
         const wxXmlNode* const ui = FindUi(settings);
+        m_settings.clear();
         for (const wxXmlNode* setting = ui->GetChildren(); setting; setting = setting->GetNext())
-            m_told << setting->GetName() << '=' << setting->GetNodeContent() << '\n';
+            m_settings << setting->GetName() << '=' << setting->GetNodeContent() << '\n';
         return 0;
     }
 
@@ -159,7 +160,7 @@ public:
         if (!script["end"].empty() && IsDue(script))
             System::EndThisProcess();
         if (script["output"] != "none")
-            wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_told);
+            wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_server + m_settings);
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
             wxFile(outputFolder + '/' + wxFileName(outputName).GetName() + script["companion"],
                    wxFile::write);
@@ -178,7 +179,8 @@ private:
         return item;
     }
 
-    wxString m_told;
+    wxString m_server; ///< what it was told of it
+    wxString m_settings;
 };
 
 } // namespace

@@ -32,8 +32,11 @@ AddCommand AddScreen;
 AddCommand AddConvert;
 /// `quillon settings`: shows the filters' settings panels in a window, and stores what is chosen.
 AddCommand AddSettings;
+/// `quillon watch`: converts what comes into folders.
+AddCommand AddWatch;
 /// `quillon worker`: converts what another process of this program asks for; see WorkerPool.
 AddCommand AddWorker;
 
 /// All of them, in the order of the help.
-constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen, AddConvert, AddSettings, AddWorker};
+constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen,   AddConvert,
+                                       AddWatch,  AddSettings, AddWorker};

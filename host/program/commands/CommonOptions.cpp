@@ -2,6 +2,7 @@
 
 #include "host/program/base/PathText.h"
 #include "host/program/base/ProgramFiles.h"
+#include "host/program/workers/WorkerCount.h"
 
 #include <CLI/CLI.hpp>
 
@@ -38,6 +39,7 @@ void AddCommonOptions(CLI::App& program, CommonOptions& options) {
                      "Write JSON Lines to stdout, lines for people to stderr");
     program.add_flag("-v,--verbose", options.verbose,
                      "Show the whole log on stderr, not only warnings");
+    program.add_flag("-q,--quiet", options.quiet, "Write nothing for people but errors");
     program.add_option("--log", options.logFile, "Append the whole log to a file")
         ->type_name("FILE");
     program
@@ -117,4 +119,39 @@ void AddRequired(CLI::App& command, const std::string& name, const std::string& 
 
 void AddPaths(CLI::App& command, std::vector<std::string>& paths) {
     command.add_option("PATH", paths, "Files, or folders of files")->required();
+}
+
+void AddOption(CLI::App& command, const std::string& name, const std::string& type,
+               const std::string& description, std::optional<std::string>& value) {
+    command.add_option(name, value, description)->type_name(type);
+}
+
+void AddFlag(CLI::App& command, const std::string& name, const std::string& description,
+             bool& value) {
+    command.add_flag(name, value, description);
+}
+
+void AddJobs(CLI::App& command, std::optional<unsigned>& jobs) {
+    command
+        .add_option("-j,--jobs", jobs,
+                    "How many documents to convert at a time; by default as many as pay")
+        ->type_name("N")
+        ->check(CLI::Range(1U, MostWorkers));
+}
+
+void AddSettingsOptions(CLI::App& command, SettingsOptions& options) {
+    command.add_option("--printer", options.printer, "The printer to print on")->type_name("NAME");
+    command.add_option("--settings", options.file, "A file with settings")->type_name("FILE.xml");
+    CLI::Option* const ps = command.add_flag_callback(
+        "--ps", [&options] { options.pdf = false; }, "Make PostScript files only");
+    command
+        .add_flag_callback(
+            "--pdf", [&options] { options.pdf = true; }, "Make PDF files too")
+        ->excludes(ps);
+    command.add_option("--profile", options.profile, "The Distiller profile of the PDF files")
+        ->type_name("NAME")
+        ->excludes(ps);
+    command.add_option("--set", options.assignments, "One setting; may be given several times")
+        ->type_name("KEY=VALUE")
+        ->allow_extra_args(false);
 }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "host/program/settings/RunSettings.h"
+
 #include <chrono>
 #include <filesystem>
 #include <functional>
@@ -16,6 +18,7 @@ struct CommonOptions {
     std::optional<std::string> language;
     bool json = false;
     bool verbose = false;
+    bool quiet = false;
     std::optional<std::string> logFile;
     std::optional<unsigned> stallSeconds;
     std::optional<unsigned> limitSeconds;
@@ -57,3 +60,19 @@ void AddRequired(CLI::App& command, const std::string& name, const std::string& 
 /// Adds the files that a command works on.
 /// @param paths receives what is given, and outlives the parsing
 void AddPaths(CLI::App& command, std::vector<std::string>& paths);
+
+/// Adds an option.
+/// @param type what its value is called in the help
+/// @param value receives it, and outlives the parsing
+void AddOption(CLI::App& command, const std::string& name, const std::string& type,
+               const std::string& description, std::optional<std::string>& value);
+
+/// Adds an option without a value.
+void AddFlag(CLI::App& command, const std::string& name, const std::string& description,
+             bool& value);
+
+/// Adds how many documents are converted at a time.
+void AddJobs(CLI::App& command, std::optional<unsigned>& jobs);
+
+/// Adds those that say how documents are printed.
+void AddSettingsOptions(CLI::App& command, SettingsOptions& options);

@@ -15,7 +15,6 @@
 
 #include <wx/intl.h>
 
-#include <CLI/CLI.hpp>
 #include <map>
 
 namespace {
@@ -171,9 +170,10 @@ private:
         for (const auto& [number, each] : m_underWay)
             names << (names.empty() ? "" : ", ") << each.progress.Document();
         const std::size_t all = m_run.inputs.size();
-        m_reporter.Passing(
-            ProgressLine(static_cast<int>(m_done * 100 / all),
-                         wxString::Format(_("%zu of %zu"), m_done, all) + "  " + names));
+        const wxString left = TimeLeft(std::chrono::steady_clock::now() - m_begun, m_done, all);
+        m_reporter.Passing(ProgressLine(static_cast<int>(m_done * 100 / all),
+                                        wxString::Format(_("%zu of %zu"), m_done, all) + "  " +
+                                            (left.empty() ? left : left + "  ") + names));
     }
 
     void OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) override {
@@ -190,6 +190,7 @@ private:
     const Assignment m_work;
     Reporter& m_reporter;
     OrderedReport& m_report;
+    const std::chrono::steady_clock::time_point m_begun = std::chrono::steady_clock::now();
     std::size_t m_done = 0;
     std::map<std::size_t, UnderWay> m_underWay;
     WorkerPool m_pool;
@@ -232,43 +233,19 @@ ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
     return report.Finish();
 }
 
-void AddSettingsOptions(CLI::App& convert, SettingsOptions& options) {
-    convert.add_option("--printer", options.printer, "The printer to print on")->type_name("NAME");
-    convert.add_option("--settings", options.file, "A file with settings")->type_name("FILE.xml");
-    CLI::Option* const ps = convert.add_flag_callback(
-        "--ps", [&options] { options.pdf = false; }, "Make PostScript files only");
-    convert
-        .add_flag_callback(
-            "--pdf", [&options] { options.pdf = true; }, "Make PDF files too")
-        ->excludes(ps);
-    convert.add_option("--profile", options.profile, "The Distiller profile of the PDF files")
-        ->type_name("NAME")
-        ->excludes(ps);
-}
-
 } // namespace
 
 void AddConvert(CLI::App& program, Command& chosen) {
-    CLI::App* const convert =
-        program.add_subcommand("convert", "Convert documents: quillon convert PATH… --out DIR");
     const auto given = std::make_shared<ConvertOptions>();
-    AddPaths(*convert, given->paths);
-    AddRequired(*convert, "-o,--out", "DIR", "The folder for the output", given->out);
-    AddSettingsOptions(*convert, given->settings);
-    convert
-        ->add_option("-j,--jobs", given->jobs,
-                     "How many documents to convert at a time; by default as many as pay")
-        ->type_name("N")
-        ->check(CLI::Range(1U, MostWorkers));
-    convert
-        ->add_option("--set", given->settings.assignments,
-                     "One setting; may be given several times")
-        ->type_name("KEY=VALUE")
-        ->allow_extra_args(false);
-    convert->final_callback([&chosen, given] {
-        chosen.opensDocuments = true;
-        chosen.run = [given](const CommonOptions& options, Reporter& reporter) {
-            return RunConvert(*given, options, reporter);
-        };
-    });
+    CLI::App& convert = AddSubcommand(
+        program, "convert", "Convert documents: quillon convert PATH… --out DIR", [&chosen, given] {
+            chosen.opensDocuments = true;
+            chosen.run = [given](const CommonOptions& options, Reporter& reporter) {
+                return RunConvert(*given, options, reporter);
+            };
+        });
+    AddPaths(convert, given->paths);
+    AddRequired(convert, "-o,--out", "DIR", "The folder for the output", given->out);
+    AddSettingsOptions(convert, given->settings);
+    AddJobs(convert, given->jobs);
 }

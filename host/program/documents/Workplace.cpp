@@ -31,11 +31,17 @@ std::shared_ptr<void> OpenMark(const fs::path& workplace, DWORD disposition) {
     return file == INVALID_HANDLE_VALUE ? nullptr : std::shared_ptr<void>(file, CloseHandle);
 }
 
+const char* PrefixOf(Workplace::Kind kind) {
+    return kind == Workplace::Kind::OfWatch ? ".quillon-watch-" : ".quillon-";
+}
+
 /// Whether it is a folder, and no link to one, with a name such as Create gives.
-bool IsWorkplace(const fs::directory_entry& entry) {
-    static const wxRegEx s_names(R"(^\.quillon-[0-9]+-[0-9]+$)");
+bool IsWorkplace(const fs::directory_entry& entry, Workplace::Kind kind) {
+    static const wxRegEx s_ofRuns(R"(^\.quillon-[0-9]+-[0-9]+$)");
+    static const wxRegEx s_ofWatches(R"(^\.quillon-watch-[0-9]+-[0-9]+$)");
+    const wxRegEx& names = kind == Workplace::Kind::OfWatch ? s_ofWatches : s_ofRuns;
     std::error_code error;
-    return s_names.Matches(ToText(entry.path().filename())) &&
+    return names.Matches(ToText(entry.path().filename())) &&
            fs::is_directory(entry.symlink_status(error));
 }
 
@@ -71,8 +77,8 @@ void Remove(const fs::path& workplace, std::shared_ptr<void> mark) {
 
 } // namespace
 
-std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, Fault& fault) {
-    const std::string prefix = ".quillon-" + std::to_string(wxGetProcessId()) + '-';
+std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, Fault& fault, Kind kind) {
+    const std::string prefix = PrefixOf(kind) + std::to_string(wxGetProcessId()) + '-';
     std::error_code error;
     for (int number = 0; number < 1000; ++number) { // taken: by a process that was ended
         const fs::path path = outputFolder / (prefix + std::to_string(number));
@@ -91,11 +97,11 @@ std::optional<Workplace> Workplace::Create(const fs::path& outputFolder, Fault& 
     return std::nullopt;
 }
 
-void Workplace::RemoveAbandoned(const fs::path& outputFolder) {
+void Workplace::RemoveAbandoned(const fs::path& outputFolder, Kind kind) {
     std::error_code error;
     for (fs::directory_iterator entry(outputFolder, error), end; !error && entry != end;
          entry.increment(error)) {
-        if (!IsWorkplace(*entry))
+        if (!IsWorkplace(*entry, kind))
             continue;
         std::shared_ptr<void> mark = OpenMark(entry->path(), OPEN_EXISTING);
         if (mark ? !IsLocked(entry->path()) : !IsLeftUnmarked(entry->path()))
@@ -127,6 +133,12 @@ bool Workplace::IsMarked() const {
 Workplace::Workplace(Workplace&& other) noexcept
     : m_path(std::move(other.m_path)), m_mark(std::move(other.m_mark)) {
     other.m_path.clear();
+}
+
+Workplace& Workplace::operator=(Workplace&& other) noexcept {
+    std::swap(m_path, other.m_path);
+    std::swap(m_mark, other.m_mark);
+    return *this;
 }
 
 Workplace::~Workplace() {

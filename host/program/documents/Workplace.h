@@ -10,8 +10,12 @@
 /// appears in the output folder whole or not at all. It goes with whatever is left in it.
 class Workplace {
 public:
+    /// Whose it is: what a journal tells of must outlast its program.
+    enum class Kind { OfRun, OfWatch };
+
     /// @param fault receives why there is none
-    static std::optional<Workplace> Create(const std::filesystem::path& outputFolder, Fault& fault);
+    static std::optional<Workplace> Create(const std::filesystem::path& outputFolder, Fault& fault,
+                                           Kind kind = Kind::OfRun);
 
     /// Takes over one whose program was ended, or has left it.
     /// @return nothing when it is gone, or somebody else has it
@@ -19,10 +23,10 @@ public:
 
     /// Removes the workplaces of programs that were ended before they could do it: those whose mark
     /// nobody has, and old ones that have none.
-    static void RemoveAbandoned(const std::filesystem::path& outputFolder);
+    static void RemoveAbandoned(const std::filesystem::path& outputFolder, Kind kind = Kind::OfRun);
 
     Workplace(Workplace&& other) noexcept;
-    Workplace& operator=(Workplace&&) = delete;
+    Workplace& operator=(Workplace&& other) noexcept;
     ~Workplace();
 
     const std::filesystem::path& Path() const { return m_path; }

@@ -3,6 +3,8 @@
 #include "host/program/system/Interruption.h"
 #include "host/services/OneLine.h"
 
+#include <wx/intl.h>
+
 #include <algorithm>
 
 namespace {
@@ -23,6 +25,16 @@ wxString ProgressLine(int percent, const wxString& text) {
     return wxString::Format("[%s%s] %3d %%  %s", wxString('#', filled),
                             wxString('.', BarWidth - filled), percent,
                             Shortened(text, LongestText));
+}
+
+wxString TimeLeft(std::chrono::steady_clock::duration passed, std::size_t done, std::size_t all) {
+    using namespace std::chrono;
+    if (done == 0 || passed < 1s)
+        return {};
+    const auto left = duration_cast<seconds>(passed).count() *
+                      static_cast<std::int64_t>(all - done) / static_cast<std::int64_t>(done);
+    return wxString::Format(_("%lld:%02lld left"), static_cast<long long>(left / 60),
+                            static_cast<long long>(left % 60));
 }
 
 bool Progress::Report(const wxString& text, int percent) {

@@ -12,8 +12,9 @@ void Write(std::FILE* stream, const std::string& text) {
 
 } // namespace
 
-Reporter::Reporter(bool json)
-    : m_json(json), m_people(json ? stderr : stdout), m_forTerminal(IsTerminal(m_people)) {}
+Reporter::Reporter(bool json, bool quiet)
+    : m_json(json), m_quiet(quiet), m_people(json ? stderr : stdout),
+      m_forTerminal(IsTerminal(m_people) && !quiet) {}
 
 void Reporter::ClearPassing() {
     if (m_passing)
@@ -22,6 +23,8 @@ void Reporter::ClearPassing() {
 }
 
 void Reporter::Line(const wxString& text) {
+    if (m_quiet)
+        return;
     ClearPassing();
     Write(m_people, text.utf8_string() + '\n');
 }

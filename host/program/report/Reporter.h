@@ -11,7 +11,8 @@ using Json = nlohmann::ordered_json;
 /// the lines for people on stderr. Everything is UTF-8 and written out at once.
 class Reporter {
 public:
-    explicit Reporter(bool json);
+    /// @param quiet whether only errors and records are written
+    explicit Reporter(bool json, bool quiet = false);
 
     /// A line for people.
     void Line(const wxString& text);
@@ -34,6 +35,7 @@ private:
     void ClearPassing();
 
     bool m_json;
+    bool m_quiet;
     std::FILE* m_people;
     bool m_forTerminal;
     bool m_passing = false;

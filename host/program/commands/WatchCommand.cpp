@@ -1,0 +1,170 @@
+#include "host/program/base/PathText.h"
+#include "host/program/commands/Command.h"
+#include "host/program/page/PageServer.h"
+#include "host/program/system/Interruption.h"
+#include "host/program/watch/WatchService.h"
+#include "machine/OfficeApplication.h"
+#include "plugin/settings/FilterSettings.h"
+
+#include <wx/filename.h>
+#include <wx/intl.h>
+
+namespace fs = std::filesystem;
+
+namespace {
+
+struct WatchOptions {
+    std::optional<std::string> folder;
+    std::optional<std::string> out;
+    std::optional<std::string> configuration; ///< a file
+    std::optional<std::string> journal;
+    std::optional<std::string> http;
+    SettingsOptions settings;
+    std::optional<unsigned> jobs;
+    bool check = false;
+    bool once = false;
+};
+
+/// What a command line says of the settings, as assignments.
+std::vector<std::string> AssignmentsOf(const SettingsOptions& options) {
+    std::vector<std::string> assignments = options.assignments;
+    const auto assign = [&assignments](const Setting& setting, const std::string& value) {
+        assignments.push_back(setting.key + ("=" + value));
+    };
+    if (options.printer)
+        assign(FilterSettings::Printer, *options.printer);
+    if (options.profile)
+        assign(FilterSettings::DistillerProfile, *options.profile);
+    if (options.pdf) {
+        assign(FilterSettings::OutputPS, *options.pdf ? "0" : "1");
+        assign(FilterSettings::OutputPDF, *options.pdf ? "1" : "0");
+    }
+    return assignments;
+}
+
+/// A watch of one folder, as the command line says.
+std::optional<WatchConfiguration> ConfigurationOf(const WatchOptions& options, Fault& fault) {
+    if (!options.folder || !options.out) {
+        fault = {_("say which folder to watch, and with --out where its output goes; or name a "
+                   "file with --config"),
+                 Blame::Usage};
+        return std::nullopt;
+    }
+    FolderConfiguration folder = StandardFolderConfiguration();
+    folder.in = fs::absolute(FromArgument(*options.folder)).lexically_normal();
+    if (!folder.in.has_filename())
+        folder.in = folder.in.parent_path();
+    folder.name = Shown(folder.in.filename());
+    folder.out = fs::absolute(FromArgument(*options.out)).lexically_normal();
+    if (options.settings.file)
+        folder.settings = fs::absolute(FromArgument(*options.settings.file));
+    folder.assignments = AssignmentsOf(options.settings);
+    WatchConfiguration configuration = StandardWatchConfiguration();
+    configuration.http.clear();
+    configuration.folders = {std::move(folder)};
+    return configuration;
+}
+
+/// What is to be watched: the file's word, and the command line's in its place.
+std::optional<WatchConfiguration> ReadConfiguration(const WatchOptions& options, Fault& fault) {
+    if (options.configuration && options.folder) {
+        fault = {_("name either a folder or a file with --config"), Blame::Usage};
+        return std::nullopt;
+    }
+    std::optional<WatchConfiguration> configuration =
+        options.configuration ? ReadWatchConfiguration(FromArgument(*options.configuration), fault)
+                              : ConfigurationOf(options, fault);
+    if (!configuration)
+        return std::nullopt;
+    if (options.journal)
+        configuration->journal = fs::absolute(FromArgument(*options.journal)).u8string();
+    if (options.http)
+        configuration->http = *options.http;
+    if (options.jobs)
+        configuration->jobs = *options.jobs;
+    return configuration;
+}
+
+/// Tells the page's figures what becomes of documents.
+class PageAudience : public WatchService::Audience {
+public:
+    explicit PageAudience(PageServer& page) : m_page(page) {}
+
+    void OnEnd(const Job& job, const Outcome& outcome) override {
+        const auto application =
+            ApplicationForExtension(wxFileName(job.source.u8string()).GetExt());
+        m_page.Count(job.folder, NameOf(outcome.state), outcome.fault ? outcome.fault->code : 0,
+                     application ? NameOf(*application) : "", outcome.seconds.value_or(0));
+    }
+
+    void OnRetry(const Job& job) override { m_page.CountRetry(job.folder); }
+
+private:
+    PageServer& m_page;
+};
+
+WatchService::Means MeansOf(const WatchOptions& watch, const CommonOptions& options) {
+    WatchService::Means means;
+    means.workerArguments = WorkerArguments(options);
+    means.workerPatience = WorkerPatience(options);
+    means.language = options.language;
+    means.engineDocuments = options.engineDocuments;
+    means.once = watch.once;
+    if (watch.configuration)
+        means.reload = [watch](Fault& fault) { return ReadConfiguration(watch, fault); };
+    return means;
+}
+
+ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Reporter& reporter) {
+    Fault fault;
+    const std::optional<WatchConfiguration> configuration = ReadConfiguration(watch, fault);
+    if (!configuration)
+        return reporter.Error(fault);
+    const FilterSet filters(options.FiltersFolder());
+    const std::unique_ptr<Journal> journal = OpenJournal(configuration->journal, fault);
+    if (!journal)
+        return reporter.Error(fault);
+    StatusBoard board;
+    WatchService service(*configuration, MeansOf(watch, options), *journal, filters, board,
+                         reporter);
+    std::unique_ptr<PageServer> page;
+    std::optional<PageAudience> audience;
+    if (!configuration->http.empty()) {
+        const auto openJournal = [where = configuration->journal](Fault& why) {
+            return OpenJournal(where, why);
+        };
+        page = PageServer::Start(
+            configuration->http, openJournal, board, [&service] { service.Wake(); }, fault);
+        if (!page)
+            return reporter.Error(fault);
+        service.SetAudience(&audience.emplace(*page));
+    }
+    if (watch.configuration)
+        Interruption::ReloadOnHangUp();
+    return service.Run();
+}
+
+} // namespace
+
+void AddWatch(CLI::App& program, Command& chosen) {
+    const auto given = std::make_shared<WatchOptions>();
+    CLI::App& watch = AddSubcommand(
+        program, "watch", "Convert what comes into a folder: quillon watch FOLDER --out DIR",
+        [&chosen, given] {
+            chosen.opensDocuments = true;
+            chosen.run = [given](const CommonOptions& options, Reporter& reporter) {
+                return RunWatch(*given, options, reporter);
+            };
+        });
+    AddOption(watch, "FOLDER", "DIR", "The folder that documents come into", given->folder);
+    AddOption(watch, "-o,--out", "DIR", "The folder for the output", given->out);
+    AddOption(watch, "--config", "FILE.toml", "What to watch, in place of one folder",
+              given->configuration);
+    AddFlag(watch, "--check", "Say what would be done, and what will not work", given->check);
+    AddFlag(watch, "--once", "End when all that has settled is done", given->once);
+    AddOption(watch, "--journal", "FILE", "Where it is kept what is known of documents",
+              given->journal);
+    AddOption(watch, "--http", "HOST:PORT", "Where to show a page", given->http);
+    AddSettingsOptions(watch, given->settings);
+    AddJobs(watch, given->jobs);
+}

@@ -1,0 +1,263 @@
+#include "host/program/watch/WatchService.h"
+
+#include "common/WQServices.h"
+#include "host/program/base/PathText.h"
+#include "host/program/report/OutcomeReport.h"
+#include "host/program/system/Interruption.h"
+#include "host/program/system/ServiceManager.h"
+#include "host/program/watch/FreeSpace.h"
+
+#include <wx/intl.h>
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+namespace {
+
+constexpr std::chrono::seconds BetweenHeartbeats = 10s;
+constexpr std::chrono::seconds BetweenStatuses = 1s;
+constexpr std::chrono::minutes BetweenRemovals = 1min;
+constexpr std::size_t MostRemovals = 500; // at a time
+
+/// How long the journal tells of a document whose file is kept for ever, or is gone.
+constexpr std::chrono::hours RecordsLast = 24h * 90;
+
+/// How long a document under way may take to be finished before the program ends, beyond what a
+/// service is given anyway.
+constexpr std::chrono::seconds DrainingTakes = 120s;
+
+/// In lower case, without dots.
+std::set<std::string> ExtensionsOf(const FilterSet& filters) {
+    std::set<std::string> extensions;
+    for (const auto& filter : filters.Filters())
+        for (const wxString& extension : filter->Extensions())
+            extensions.insert(extension.Lower().utf8_string());
+    return extensions;
+}
+
+} // namespace
+
+WatchService::WatchService(WatchConfiguration configuration, Means means, Journal& journal,
+                           const FilterSet& filters, StatusBoard& board, Reporter& reporter)
+    : m_configuration(std::move(configuration)), m_means(std::move(means)), m_journal(journal),
+      m_filters(filters), m_board(board), m_reporter(reporter),
+      m_work({m_means.workerArguments, m_means.workerPatience, m_means.language,
+              m_means.engineDocuments, m_configuration.jobs,
+              [this](const Job& job, const Outcome& outcome) { OnEnd(job, outcome); },
+              [this](const Job& job) {
+                  if (m_audience)
+                      m_audience->OnRetry(job);
+              }},
+             journal, m_folders, filters),
+      m_started(std::chrono::system_clock::now()) {}
+
+ExitCode WatchService::Run() {
+    OpenFolders(m_configuration.folders);
+    bool isReady = false;
+    while (!m_isOver && !(m_isDraining && IsDrained())) {
+        Pass();
+        if (!isReady) {
+            if (const std::optional<Fault> other = FindOtherWatcher())
+                return m_reporter.Error(*other);
+            isReady = std::all_of(m_folders.begin(), m_folders.end(),
+                                  [](const auto& folder) { return folder.View().hasLooked; });
+            if (isReady)
+                ServiceManager::TellReady();
+        }
+        m_work.Step();
+    }
+    const ExitCode exitCode = Verdict();
+    m_folders.clear();
+    m_work.Close();
+    return exitCode;
+}
+
+/// With a journal that takes nothing, no document comes further.
+bool WatchService::IsDrained() const {
+    return m_journalFault.empty() ? !m_work.IsBusy() : m_work.Running().empty();
+}
+
+ExitCode WatchService::Verdict() const {
+    if (!m_means.once)
+        return ExitCode::Done;
+    if (m_isDraining)
+        return ExitCode::Interrupted;
+    const bool isBlocked = std::any_of(m_folders.begin(), m_folders.end(), [](const auto& folder) {
+        return folder.Obstacle().has_value();
+    });
+    if (isBlocked)
+        return ExitCode::MachineAtFault;
+    return m_failed > 0 ? ExitCode::DocumentsAtFault : ExitCode::Done;
+}
+
+void WatchService::OpenFolders(const std::vector<FolderConfiguration>& folders) {
+    const std::set<std::string> extensions = ExtensionsOf(m_filters);
+    const std::map<wxString, FolderCounts> counts = m_journal.Counts();
+    m_folders.clear();
+    for (const FolderConfiguration& folder : folders)
+        m_folders.emplace_back(folder, extensions, counts.count(folder.name) != 0,
+                               [this] { m_work.Wake(); });
+}
+
+/// @return why the watch cannot begin
+std::optional<Fault> WatchService::FindOtherWatcher() const {
+    for (const WatchedFolder& folder : m_folders)
+        if (folder.View().fault && folder.View().fault->blame == Blame::Usage)
+            return folder.View().fault;
+    return std::nullopt;
+}
+
+/// A configuration that cannot be used changes nothing.
+void WatchService::Reload() {
+    if (!m_means.reload)
+        return;
+    ServiceManager::TellReloading();
+    Fault fault;
+    if (std::optional<WatchConfiguration> configuration = m_means.reload(fault)) {
+        OpenFolders(configuration->folders);
+        m_configuration.folders = configuration->folders;
+        m_configuration.minFree = configuration->minFree;
+        m_reporter.Line(_("The configuration has been read anew. A change of journal, jobs or http "
+                          "takes effect when the program is started again."));
+    } else {
+        m_reporter.Error(fault);
+        m_reporter.Line(_("The configuration stays as it was."));
+    }
+    ServiceManager::TellReady();
+}
+
+/// Looks after all that there is to do. What the journal does not take now is done in a later
+/// pass.
+void WatchService::Pass() {
+    const Clock::time_point now = Clock::now();
+    m_isDraining = m_isDraining || Interruption::Requested();
+    try {
+        if (!m_isDraining && Interruption::ReloadRequested())
+            Reload();
+        m_paused = m_journal.Paused();
+        LookAfterFolders();
+        m_work.EndJobs();
+        if (!m_isDraining)
+            m_work.BeginJobs();
+        if (now - m_heartbeat > BetweenHeartbeats) {
+            m_work.Heartbeat();
+            m_heartbeat = now;
+            if (m_isDraining)
+                ServiceManager::TellStopping(DrainingTakes);
+        }
+        if (now - m_removedOld > BetweenRemovals) {
+            RemoveOld();
+            m_removedOld = now;
+        }
+        m_isOver = m_means.once && IsDone();
+        m_lastPass = now;
+        m_journalFault.clear();
+        ServiceManager::TellAlive();
+    } catch (const JournalError& error) {
+        const wxString fault = wxString::FromUTF8(error.what());
+        if (m_journalFault != fault)
+            SetLevelAndGetLogger(LevelError, __FILE__, __func__, __LINE__)
+                << "The journal cannot be used: " << fault;
+        m_journalFault = fault;
+        m_mustForget = true;
+    }
+    if (now - m_told > BetweenStatuses)
+        TellStatus();
+}
+
+void WatchService::LookAfterFolders() {
+    const std::optional<Fault> shortage = FindShortage(
+        {fs::temp_directory_path(), FromArgument(m_configuration.journal).parent_path()},
+        m_configuration.minFree);
+    if (std::exchange(m_mustForget, false))
+        for (WatchedFolder& folder : m_folders)
+            folder.Watcher().Forget();
+    for (WatchedFolder& folder : m_folders) {
+        folder.Update(m_paused, m_configuration.minFree, shortage);
+        if (folder.View().awaitsAdmission) {
+            if (const std::size_t count = m_work.Recover(folder))
+                m_reporter.Line(wxString::Format(wxPLURAL("%s: recovered %zu document",
+                                                          "%s: recovered %zu documents",
+                                                          static_cast<unsigned>(count)),
+                                                 folder.Name(), count));
+            folder.Watcher().Admit();
+        }
+        Insert(folder);
+    }
+}
+
+void WatchService::Insert(WatchedFolder& folder) {
+    std::vector<NewJob> jobs;
+    for (SettledFile& file : folder.Watcher().Take())
+        jobs.push_back({folder.Name(), std::move(file.path), std::move(file.inside), file.identity,
+                        folder.Configuration()->priority});
+    if (jobs.empty())
+        return;
+    m_journal.Insert(jobs);
+    m_work.Expect();
+}
+
+/// Removes processed documents whose time is over, and what the journal has of them.
+void WatchService::RemoveOld() {
+    const JournalTime now = std::chrono::system_clock::now();
+    for (const WatchedFolder& folder : m_folders) {
+        const auto& keep = folder.Configuration()->keepProcessed;
+        for (const JobState state : {JobState::Archived, JobState::Vanished}) {
+            JobQuery query;
+            query.folder = folder.Name();
+            query.state = state;
+            query.endedBefore = now - (keep ? *keep : std::chrono::seconds(RecordsLast));
+            query.limit = MostRemovals;
+            for (const Job& job : m_journal.List(query)) {
+                std::error_code error;
+                if (keep && state == JobState::Archived && !job.aside.empty() &&
+                    LookAt(job.aside, error).identity.number == job.identity.number && !error)
+                    fs::remove(job.aside, error);
+                m_journal.Remove(job.id);
+            }
+        }
+    }
+}
+
+void WatchService::TellStatus() {
+    m_told = Clock::now();
+    WatchStatus status;
+    status.started = m_started;
+    status.lastPass = m_lastPass;
+    status.journalFault = m_journalFault;
+    status.draining = m_isDraining;
+    for (const WatchedFolder& folder : m_folders)
+        status.folders.push_back(folder.Status());
+    status.running = m_work.Running();
+    wxString line = wxString::Format(_("%zu under way, %zu done, %zu failed"),
+                                     status.running.size(), m_done, m_failed);
+    if (!m_journalFault.empty())
+        line << "; " << wxString::Format(_("the journal cannot be used: %s"), m_journalFault);
+    for (const FolderStatus& folder : status.folders)
+        if (!folder.obstacle.empty())
+            line << "; " << folder.configuration.name << ": " << folder.obstacle;
+    ServiceManager::TellStatus(line);
+    m_board.Put(std::move(status));
+}
+
+/// Whether nothing is left that has settled, or may yet.
+bool WatchService::IsDone() const {
+    if (m_isDraining || m_work.IsBusy())
+        return false;
+    for (const WatchedFolder& folder : m_folders) {
+        const FolderWatcher::View& view = folder.View();
+        const bool isLookingYet = !view.hasLooked || view.awaitsAdmission || view.scans == 0;
+        if (!view.fault && (isLookingYet || view.settling > 0))
+            return false;
+    }
+    return true; // whatever waits could have been begun, and was not: it waits for another day
+}
+
+void WatchService::OnEnd(const Job& job, const Outcome& outcome) {
+    ++(job.state == JobState::Failed ? m_failed : m_done);
+    Tell(outcome, m_reporter);
+    if (m_audience)
+        m_audience->OnEnd(job, outcome);
+}

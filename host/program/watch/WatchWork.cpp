@@ -1,0 +1,356 @@
+#include "host/program/watch/WatchWork.h"
+
+#include "common/WQServices.h"
+#include "host/program/base/PathText.h"
+#include "host/program/workers/WorkerCount.h"
+#include "plugin/interface/ResultCodes.h"
+
+#include <wx/filename.h>
+#include <wx/intl.h>
+#include <wx/utils.h>
+
+#include <algorithm>
+
+namespace fs = std::filesystem;
+using namespace std::chrono_literals;
+
+namespace {
+
+/// How often a document's attempt may end this program, before the document is to blame.
+constexpr int MostDeaths = 3;
+
+/// Before a document is tried again that the machine could not convert: longer than its folder
+/// waits, so that another one comes first, in case it is this one that the machine cannot do.
+constexpr std::chrono::seconds GivenBackFor = 40s;
+
+/// Before a document's end is tried again.
+constexpr std::chrono::seconds BetweenEnds = 30s;
+
+constexpr std::chrono::seconds UpcomingLasts = 1s;
+constexpr std::size_t MostUpcoming = 64;
+
+Claimant ThisProgram() {
+    Claimant claimant;
+    claimant.name = wxString::Format("%s:%lu", wxGetHostName(), wxGetProcessId());
+    return claimant;
+}
+
+Input InputOf(const Job& job) {
+    return {job.source, job.source, true};
+}
+
+WatchWork::Clock::time_point Now() {
+    return WatchWork::Clock::now();
+}
+
+void TryAgain(Job& job, std::chrono::seconds delay) {
+    job.state = JobState::Waiting;
+    job.workplace.clear();
+    job.product.clear();
+    job.due = std::chrono::system_clock::now() + delay;
+}
+
+/// After an attempt that says nothing of the document.
+void GiveBack(Job& job) {
+    job.attempts = std::max(job.attempts - 1, 0);
+    TryAgain(job, GivenBackFor);
+}
+
+} // namespace
+
+WatchWork::WatchWork(Means means, Journal& journal, Folders& folders, const FilterSet& filters)
+    : m_means(std::move(means)), m_journal(journal), m_folders(folders), m_filters(filters),
+      m_claimant(ThisProgram()), m_pool(m_means.workerArguments, m_means.workerPatience, *this) {}
+
+WatchWork::~WatchWork() {
+    for (auto& [id, work] : m_ending)
+        if (work.job.state == JobState::Delivering && work.workplace)
+            work.workplace->Leave();
+}
+
+bool WatchWork::IsBusy() const {
+    return !m_underWay.empty() ||
+           std::any_of(m_ending.begin(), m_ending.end(),
+                       [](const auto& entry) { return entry.second.next == Clock::time_point(); });
+}
+
+std::size_t WatchWork::Recover(WatchedFolder& folder) {
+    std::size_t count = 0;
+    for (Job& job : m_journal.TakeOver(folder.Name(), m_claimant)) {
+        if (m_underWay.count(job.id) != 0 || m_ending.count(job.id) != 0)
+            continue; // the folder was away, its document was not
+        ++count;
+        UnderWay& work = m_ending[job.id];
+        work.folder = folder.Configuration();
+        if (!job.workplace.empty())
+            work.workplace = Workplace::TakeOver(job.workplace.parent_path());
+        if (job.state == JobState::Converting) {
+            if (++job.deaths >= MostDeaths)
+                Fail(job, {wxString::Format(_("it ended the program %d times"), job.deaths)});
+            else
+                TryAgain(job, 0s);
+            work.isToBeTold = true;
+        }
+        work.job = std::move(job);
+    }
+    EndJobs(); // with what they have in workplaces
+    Sweep(folder.Configuration()->out);
+    return count;
+}
+
+/// Removes abandoned workplaces, unless the journal knows of an output in one of them.
+void WatchWork::Sweep(const fs::path& outputFolder) {
+    JobQuery query;
+    query.state = JobState::Delivering;
+    for (const Job& job : m_journal.List(query))
+        if (m_ending.count(job.id) == 0 &&
+            job.workplace.parent_path().parent_path() == outputFolder)
+            return; // its folder's turn comes, or it is watched no more
+    Workplace::RemoveAbandoned(outputFolder, Workplace::Kind::OfWatch);
+}
+
+void WatchWork::BeginJobs() {
+    const Clock::time_point now = Now();
+    LookAtUpcoming();
+    while (m_pool.Busy() < WorthwhileJobs()) {
+        std::vector<ClaimableFolder> claimable;
+        for (const WatchedFolder& folder : m_folders)
+            if (folder.MayBegin(now))
+                claimable.push_back({folder.Name(), folder.Configuration()->byName});
+        std::optional<Job> job =
+            claimable.empty() ? std::nullopt : m_journal.Claim(claimable, m_claimant);
+        if (!job)
+            return;
+        if (WatchedFolder* const folder = Find(job->folder))
+            Begin(std::move(*job), *folder);
+    }
+}
+
+void WatchWork::Begin(Job job, WatchedFolder& folder) {
+    folder.Begin();
+    UnderWay work;
+    work.folder = folder.Configuration();
+    work.shown = {job.id, job.folder, Shown(job.source.filename()), {}, 0, Now()};
+    work.job = std::move(job);
+    Assignment assignment;
+    const std::int64_t id = work.job.id;
+    if (const std::optional<Fault> fault = Prepare(work, folder, assignment)) {
+        work.outcome.emplace();
+        work.outcome->input = work.job.source;
+        work.outcome->End(fault->blame == Blame::Document ? State::Refused : State::Failed, *fault,
+                          m_filters.ErrorText(fault->code));
+        m_ending.insert_or_assign(id, std::move(work));
+        return;
+    }
+    m_underWay.insert_or_assign(id, std::move(work));
+    m_pool.Give(id, std::move(assignment));
+}
+
+/// Makes what a worker needs.
+/// @return why it cannot be had
+std::optional<Fault> WatchWork::Prepare(UnderWay& work, WatchedFolder& folder,
+                                        Assignment& assignment) {
+    if (!IsText(work.job.source)) // it could not be told to the worker
+        return Fault{_("its name is not valid UTF-8 text; rename it"), Blame::Document,
+                     Result::InvalidInputFile};
+    const std::optional<std::string> settings = folder.Settings();
+    if (!settings)
+        return folder.Obstacle();
+    Fault fault;
+    work.workplace =
+        Workplace::Create(folder.Configuration()->out, fault, Workplace::Kind::OfWatch);
+    if (!work.workplace)
+        return fault;
+    assignment.input = InputOf(work.job);
+    assignment.workplace = work.workplace->Path();
+    assignment.settings = *settings;
+    assignment.language =
+        folder.Configuration()->language ? folder.Configuration()->language : m_means.language;
+    assignment.engineDocuments = EngineDocuments();
+    assignment.identity = work.job.identity;
+    assignment.asItIs = folder.Configuration()->others == Others::Pass &&
+                        !m_filters.Claiming(ExtensionOf(assignment.input));
+    return std::nullopt;
+}
+
+void WatchWork::OnProgress(WorkerPool::Ticket ticket, const wxString& step, int percent) {
+    RunningDocument& shown = m_underWay.at(ticket).shown;
+    shown.step = step;
+    shown.percent = std::clamp(percent, 0, 100);
+}
+
+void WatchWork::OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) {
+    auto work = m_underWay.extract(ticket);
+    if (outcome.fault && outcome.text.empty())
+        outcome.text = m_filters.ErrorText(outcome.fault->code);
+    work.mapped().outcome = std::move(outcome);
+    m_ending.insert(std::move(work));
+}
+
+void WatchWork::EndJobs() {
+    const Clock::time_point now = Now();
+    for (auto entry = m_ending.begin(); entry != m_ending.end();) {
+        UnderWay& work = entry->second;
+        if (work.outcome && work.job.state == JobState::Converting)
+            Decide(work);
+        if (work.next <= now && End(work))
+            entry = m_ending.erase(entry);
+        else
+            ++entry;
+    }
+}
+
+/// What the worker's outcome means for the document.
+void WatchWork::Decide(UnderWay& work) {
+    Job& job = work.job;
+    job.seconds = work.outcome->seconds.value_or(0);
+    job.text = work.outcome->text;
+    if (work.outcome->state == State::Changed) {
+        DecideChange(work);
+    } else if (work.outcome->state == State::Converted) {
+        if (WatchedFolder* const folder = Find(job.folder))
+            folder->Unblock();
+        job.fault.reset();
+        job.workplace = work.outcome->made.parent_path();
+        job.product = ToText(work.outcome->made.filename());
+        job.state = JobState::Delivering;
+    } else {
+        DecideFailure(work);
+    }
+    work.isToBeTold = job.state != JobState::Delivering; // which its delivery begins with
+}
+
+/// A file that is another by now is found anew.
+void WatchWork::DecideChange(UnderWay& work) {
+    Job& job = work.job;
+    if (WatchedFolder* const folder = Find(job.folder))
+        folder->Free();
+    std::error_code error;
+    if (!fs::is_directory(work.folder->in, error)) { // nobody can say what is in it
+        GiveBack(job);
+        return;
+    }
+    job.state = JobState::Vanished;
+    job.open = false;
+    job.ended = std::chrono::system_clock::now();
+}
+
+void WatchWork::DecideFailure(UnderWay& work) {
+    Job& job = work.job;
+    const Fault& fault = *work.outcome->fault;
+    WatchedFolder* const folder = Find(job.folder);
+    job.fault = fault;
+    if (fault.blame == Blame::Machine || fault.blame == Blame::Usage) {
+        if (folder)
+            folder->Block(fault);
+        m_pool.Retire(0s); // the machine may be mended before the next one
+        GiveBack(job);
+        return;
+    }
+    if (folder)
+        folder->Unblock();
+    const auto attempt = static_cast<std::size_t>(std::max(job.attempts, 1));
+    const std::vector<std::chrono::seconds>& retries = work.folder->retries;
+    if (work.outcome->state == State::Refused || attempt > retries.size()) {
+        Fail(job, fault);
+        return;
+    }
+    TryAgain(job, retries[attempt - 1]);
+    if (m_means.onRetry)
+        m_means.onRetry(job);
+}
+
+/// @return whether no step is left
+bool WatchWork::End(UnderWay& work) {
+    if (work.isToBeTold)
+        m_journal.Commit(work.job);
+    work.isToBeTold = false;
+    const std::optional<Fault> fault = DoLastSteps(work);
+    if (!fault)
+        return true;
+    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__) << fault->Text();
+    work.next = Now() + BetweenEnds;
+    if (work.job.state == JobState::Delivering)
+        if (WatchedFolder* const folder = Find(work.job.folder))
+            folder->Block(*fault);
+    return false;
+}
+
+std::optional<Fault> WatchWork::DoLastSteps(UnderWay& work) {
+    Job& job = work.job;
+    if (job.state == JobState::Delivering)
+        if (std::optional<Fault> fault = DeliverProduct(job, *work.folder, m_journal))
+            return fault;
+    work.workplace.reset();
+    Report(work);
+    if (!job.open || (job.state != JobState::Finished && job.state != JobState::Failed))
+        return std::nullopt;
+    return PutSourceAway(job, *work.folder, TextsFor(*work.folder), m_journal);
+}
+
+void WatchWork::Report(UnderWay& work) const {
+    const JobState state = work.job.state;
+    const bool isEnd = state == JobState::Finished || state == JobState::Failed;
+    if (!work.outcome || !isEnd || std::exchange(work.isReported, true))
+        return;
+    work.outcome->made.clear();
+    work.outcome->output = work.job.output;
+    m_means.onEnd(work.job, *work.outcome);
+}
+
+void WatchWork::Fail(Job& job, Fault fault) const {
+    if (job.text.empty())
+        job.text = m_filters.ErrorText(fault.code);
+    job.state = JobState::Failed;
+    job.fault = std::move(fault);
+    job.ended = std::chrono::system_clock::now();
+}
+
+WatchedFolder* WatchWork::Find(const wxString& name) {
+    const auto found =
+        std::find_if(m_folders.begin(), m_folders.end(),
+                     [&name](const WatchedFolder& folder) { return folder.Name() == name; });
+    return found == m_folders.end() ? nullptr : &*found;
+}
+
+const Texts& WatchWork::TextsFor(const FolderConfiguration& folder) const {
+    const std::optional<std::string>& language =
+        folder.language ? folder.language : m_means.language;
+    const Texts* const texts = language ? m_texts.Find(wxString::FromUTF8(*language)) : nullptr;
+    return texts ? *texts : m_texts.Choose({});
+}
+
+void WatchWork::LookAtUpcoming() {
+    const Clock::time_point now = Now();
+    if (now - m_upcomingKnown < UpcomingLasts)
+        return;
+    m_upcomingKnown = now;
+    m_upcoming.clear();
+    JobQuery query;
+    query.state = JobState::Waiting;
+    query.limit = MostUpcoming;
+    for (const Job& job : m_journal.List(query))
+        m_upcoming.push_back(InputOf(job));
+}
+
+/// How many documents are best under way now.
+std::size_t WatchWork::WorthwhileJobs() const {
+    if (m_means.jobs > 0)
+        return m_means.jobs;
+    std::vector<Input> inputs = m_upcoming;
+    for (const auto& [id, work] : m_underWay)
+        inputs.push_back(InputOf(work.job));
+    return WorthwhileWorkers(inputs);
+}
+
+unsigned WatchWork::EngineDocuments() const {
+    return m_means.engineDocuments.value_or(
+        WorthwhileEngineDocuments(m_upcoming.size(), m_pool.Busy() + 1));
+}
+
+std::vector<RunningDocument> WatchWork::Running() const {
+    std::vector<RunningDocument> running;
+    for (const auto& [id, work] : m_underWay)
+        running.push_back(work.shown);
+    return running;
+}

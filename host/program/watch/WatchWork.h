@@ -1,0 +1,105 @@
+#pragma once
+
+#include "host/program/documents/Workplace.h"
+#include "host/program/filters/FilterSet.h"
+#include "host/program/watch/JobEnding.h"
+#include "host/program/watch/WatchedFolder.h"
+#include "host/program/workers/WorkerPool.h"
+
+#include <deque>
+#include <list>
+
+/// What a watch works on: documents are claimed, given to workers, and brought to their ends.
+/// Whatever needs the journal may throw JournalError; nothing is lost by that, and the next call
+/// goes on where it was.
+class WatchWork : private WorkerPool::Owner {
+public:
+    using Folders = std::list<WatchedFolder>;
+    using Clock = std::chrono::steady_clock;
+
+    struct Means {
+        std::vector<std::string> workerArguments;
+        std::chrono::seconds workerPatience{};
+        std::optional<std::string> language;     ///< where a folder has none
+        std::optional<unsigned> engineDocuments; ///< as many as pay if not given
+        unsigned jobs = 0;                       ///< at a time; as many as pay if 0
+        /// Told what has become of a document, when its output is in its place.
+        std::function<void(const Job&, const Outcome&)> onEnd;
+        std::function<void(const Job&)> onRetry;
+    };
+
+    WatchWork(Means means, Journal& journal, Folders& folders, const FilterSet& filters);
+    /// What is to be delivered yet stays for the next program.
+    ~WatchWork() override;
+    WatchWork(const WatchWork&) = delete;
+    WatchWork& operator=(const WatchWork&) = delete;
+
+    /// Puts a folder's affairs in order that an earlier program has left.
+    /// @return how many documents there were
+    std::size_t Recover(WatchedFolder& folder);
+
+    /// Brings those to their ends that workers are done with, or that could not be before.
+    void EndJobs();
+
+    /// Begins documents, as many as there are workers for.
+    /// @return whether there may be more, but no worker
+    void BeginJobs();
+
+    /// Says that there are more documents than there were.
+    void Expect() { m_upcomingKnown = {}; }
+
+    void Heartbeat() { m_journal.Heartbeat(m_claimant); }
+
+    /// Waits for something to happen.
+    void Step() { m_pool.Step(); }
+    /// From any thread.
+    void Wake() { m_pool.Wake(); }
+    void Close() { m_pool.Close(); }
+
+    /// Whether something is under way that does not wait for better times.
+    bool IsBusy() const;
+    std::vector<RunningDocument> Running() const;
+
+private:
+    struct UnderWay {
+        Job job;
+        std::shared_ptr<const FolderConfiguration> folder;
+        std::optional<Workplace> workplace; ///< until what is in it is delivered
+        RunningDocument shown;
+        std::optional<Outcome> outcome; ///< when the worker is done
+        bool isToBeTold = false;        ///< to the journal, what has been decided
+        bool isReported = false;
+        Clock::time_point next; ///< when its end may be tried again
+    };
+
+    void Begin(Job job, WatchedFolder& folder);
+    std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
+    void Sweep(const std::filesystem::path& outputFolder);
+    void Decide(UnderWay& work);
+    void DecideFailure(UnderWay& work);
+    void DecideChange(UnderWay& work);
+    bool End(UnderWay& work);
+    std::optional<Fault> DoLastSteps(UnderWay& work);
+    void Report(UnderWay& work) const;
+    void Fail(Job& job, Fault fault) const;
+    WatchedFolder* Find(const wxString& name);
+    const Texts& TextsFor(const FolderConfiguration& folder) const;
+    void LookAtUpcoming();
+    std::size_t WorthwhileJobs() const;
+    unsigned EngineDocuments() const;
+
+    void OnProgress(WorkerPool::Ticket ticket, const wxString& step, int percent) override;
+    void OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) override;
+
+    const Means m_means;
+    Journal& m_journal;
+    Folders& m_folders;
+    const FilterSet& m_filters;
+    const TextsOfLanguages m_texts;
+    const Claimant m_claimant;
+    std::map<std::int64_t, UnderWay> m_underWay; ///< with a worker, by the job's id
+    std::map<std::int64_t, UnderWay> m_ending;   ///< no longer with one
+    std::vector<Input> m_upcoming;               ///< some of those that are waiting
+    Clock::time_point m_upcomingKnown;
+    WorkerPool m_pool;
+};

@@ -1,0 +1,66 @@
+#include "tests/host/WatchRun.h"
+
+#include <cstdlib>
+
+namespace {
+
+using testing::ElementsAre;
+
+class WatchCrashTest : public WatchRun {
+protected:
+    void TearDown() override { unsetenv("TEST_DIE_AT_STEP"); }
+
+    /// @return whether it was ended
+    bool DieAt(int step) const {
+        setenv("TEST_DIE_AT_STEP", std::to_string(step).c_str(), 1);
+        setenv("LD_PRELOAD", DIE_AT_STEP, 1);
+        const RunResult run = WatchOnce();
+        unsetenv("LD_PRELOAD");
+        unsetenv("TEST_DIE_AT_STEP");
+        return run.exitCode == -SIGKILL;
+    }
+
+    void Begin() const {
+        for (const char* const name : {"in", "out"}) {
+            std::filesystem::remove_all(m_folder / name);
+            std::filesystem::create_directory(m_folder / name);
+        }
+        for (const char* const ending : {"", "-wal", "-shm"})
+            std::filesystem::remove(m_folder / (std::string("journal.db") + ending));
+        Put("a.doc", "companion=.pdf");
+        Put("b.doc", "screen=-1005");
+    }
+
+    void ExpectAllDoneOnce(const std::string& when) const {
+        SCOPED_TRACE(when);
+        EXPECT_THAT(FilesIn("out"), ElementsAre("a.pdf", "a.ps"));
+        EXPECT_THAT(FilesIn("in"),
+                    ElementsAre("failed/b.doc", "failed/b.doc.txt", "processed/a.doc"));
+    }
+};
+
+TEST_F(WatchCrashTest, WhereverItDiesEachDocumentComesOutOnce) {
+    Configure();
+    int step = 1;
+    for (bool died = true; died && !HasFailure(); ++step) {
+        Begin();
+        died = DieAt(step);
+        EXPECT_THAT(WatchOnce().exitCode, testing::AnyOf(0, 1));
+        ExpectAllDoneOnce("ended before step " + std::to_string(step));
+    }
+    EXPECT_GT(step, 30) << "the steps were not seen";
+}
+
+TEST_F(WatchCrashTest, AndWhereverItDiesWhenItStartsAgain) {
+    Configure();
+    for (const int first : {20, 25, 30, 35, 40}) {
+        Begin();
+        DieAt(first);
+        for (int step = 1; DieAt(step) && !HasFailure(); step += 2)
+            ;
+        WatchOnce();
+        ExpectAllDoneOnce("ended before step " + std::to_string(first) + ", and then before others");
+    }
+}
+
+} // namespace
