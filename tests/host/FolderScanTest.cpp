@@ -108,8 +108,8 @@ TEST_F(FolderScanTest, AFolderMayBeAJob) {
         m_folder.Write("job/more/a.doc", "content");
         EXPECT_EQ(ScanAfter(2s),
                   folderIsJob ? Names{"single.doc"} : (Names{"job/b.doc", "single.doc"}));
-        EXPECT_EQ(ScanAfter(2s), folderIsJob ? (Names{"job/b.doc", "job/more/a.doc"})
-                                             : Names{"job/more/a.doc"});
+        EXPECT_EQ(ScanAfter(2s),
+                  folderIsJob ? (Names{"job/b.doc", "job/more/a.doc"}) : Names{"job/more/a.doc"});
         EXPECT_EQ(m_result.settled.back().inside, "job/more");
     }
 }

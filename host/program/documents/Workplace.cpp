@@ -104,9 +104,11 @@ void Workplace::RemoveAbandoned(const fs::path& outputFolder, Kind kind) {
         if (!IsWorkplace(*entry, kind))
             continue;
         std::shared_ptr<void> mark = OpenMark(entry->path(), OPEN_EXISTING);
-        if (mark ? !IsLocked(entry->path()) : !IsLeftUnmarked(entry->path()))
-            continue;
-        Remove(entry->path(), std::move(mark));
+        std::error_code ignored;
+        if (mark ? IsLocked(entry->path()) : IsLeftUnmarked(entry->path()))
+            Remove(entry->path(), std::move(mark));
+        else if (!mark) // should its maker be about to mark it, it makes another one
+            fs::remove(entry->path(), ignored); // unless something is in it
     }
 }
 

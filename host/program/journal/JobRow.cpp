@@ -45,7 +45,7 @@ FileIdentity ReadIdentity(SqliteStatement& row) {
 
 const char* const JobColumns =
     "id, folder, source, inside, device, number, size, modified, priority, state, open, "
-    "attempts, deaths, inserted, due, begun, ended, seconds, workplace, product, output, "
+    "attempts, deaths, inserted, due, begun, ended, seconds, workplace, product, output, aside, "
     "fault_blame, fault, fault_code, fault_advice, text, claimed_by, token";
 
 Job ReadJob(SqliteStatement& row) {
@@ -68,6 +68,7 @@ Job ReadJob(SqliteStatement& row) {
     job.workplace = row.Path();
     job.product = row.Text();
     job.output = row.Path();
+    job.aside = row.Path();
     job.fault = ReadFault(row);
     job.text = row.Text();
     job.claimedBy = row.Text();
@@ -81,11 +82,11 @@ bool StoreJob(SqliteDatabase& database, const Job& job, JournalTime now) {
                     "UPDATE job SET source=?3, priority=?4, state=?5, open=?6, attempts=?7, "
                     "deaths=?8, due=?9, begun=?10, ended=?11, seconds=?12, workplace=?13, "
                     "product=?14, output=?15, fault_blame=?16, fault=?17, fault_code=?18, "
-                    "fault_advice=?19, text=?20, changed=?21 WHERE id=?1 AND token=?2",
+                    "fault_advice=?19, text=?20, aside=?21, changed=?22 WHERE id=?1 AND token=?2",
                     job.id, job.token, job.source, job.priority, NameOf(job.state), job.open,
                     job.attempts, job.deaths, job.due, job.begun, job.ended, job.seconds,
                     job.workplace, job.product, job.output, job.fault ? NameOf(fault.blame) : "",
-                    fault.what, fault.code, fault.advice, job.text, now)
+                    fault.what, fault.code, fault.advice, job.text, job.aside, now)
         .Run();
     return database.Changes() > 0;
 }

@@ -36,6 +36,7 @@ CREATE TABLE job (
     workplace BLOB NOT NULL DEFAULT x'',
     product TEXT NOT NULL DEFAULT '',
     output BLOB NOT NULL DEFAULT x'',
+    aside BLOB NOT NULL DEFAULT x'',
     fault_blame TEXT NOT NULL DEFAULT '',
     fault TEXT NOT NULL DEFAULT '',
     fault_code INTEGER NOT NULL DEFAULT 0,

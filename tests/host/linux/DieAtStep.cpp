@@ -15,13 +15,15 @@ namespace {
 
 /// Its workers have the same environment, and are not meant.
 bool IsWatch() {
-    char arguments[256] = {};
+    char arguments[4096] = {};
     std::FILE* const file = std::fopen("/proc/self/cmdline", "r");
     const std::size_t read = file ? std::fread(arguments, 1, sizeof arguments - 1, file) : 0;
     if (file)
         std::fclose(file);
-    const std::size_t program = std::strlen(arguments) + 1;
-    return program < read && std::strcmp(arguments + program, "watch") == 0;
+    for (const char* word = arguments; word < arguments + read; word += std::strlen(word) + 1)
+        if (std::strcmp(word, "watch") == 0)
+            return true;
+    return false;
 }
 
 long StepToDieAt() {

@@ -39,10 +39,15 @@ protected:
     }
 };
 
-TEST_F(WatchCrashTest, WhereverItDiesEachDocumentComesOutOnce) {
+/// Each of them has its share of the steps, for they take a while.
+class WatchCrashStepsTest : public WatchCrashTest, public testing::WithParamInterface<int> {};
+
+constexpr int Shares = 4;
+
+TEST_P(WatchCrashStepsTest, WhereverItDiesEachDocumentComesOutOnce) {
     Configure();
-    int step = 1;
-    for (bool died = true; died && !HasFailure(); ++step) {
+    int step = GetParam();
+    for (bool died = true; died && !HasFailure(); step += Shares) {
         Begin();
         died = DieAt(step);
         EXPECT_THAT(WatchOnce().exitCode, testing::AnyOf(0, 1));
@@ -50,6 +55,8 @@ TEST_F(WatchCrashTest, WhereverItDiesEachDocumentComesOutOnce) {
     }
     EXPECT_GT(step, 30) << "the steps were not seen";
 }
+
+INSTANTIATE_TEST_SUITE_P(All, WatchCrashStepsTest, testing::Range(1, Shares + 1));
 
 TEST_F(WatchCrashTest, AndWhereverItDiesWhenItStartsAgain) {
     Configure();
@@ -59,7 +66,8 @@ TEST_F(WatchCrashTest, AndWhereverItDiesWhenItStartsAgain) {
         for (int step = 1; DieAt(step) && !HasFailure(); step += 2)
             ;
         WatchOnce();
-        ExpectAllDoneOnce("ended before step " + std::to_string(first) + ", and then before others");
+        ExpectAllDoneOnce("ended before step " + std::to_string(first) +
+                          ", and then before others");
     }
 }
 

@@ -78,12 +78,13 @@ TEST_F(WorkplaceTest, OnesThatNobodyHasAreRemovedAndNothingElse) {
     Fault fault;
     const auto used = Workplace::Create(Out(), fault);
     ASSERT_TRUE(used) << fault.what;
-    const fs::path gone[] = {Make(".quillon-1-1", "in use", 0h), Make(".quillon-1-2", "", 2h)};
+    const fs::path gone[] = {Make(".quillon-1-1", "in use", 0h), Make(".quillon-1-2", "a.ps", 2h),
+                             Make(".quillon-1-3", "", 0h)};
     const fs::path target = Make("target", "in use", 2h);
     fs::create_directory_symlink(target, Out() / ".quillon-1-4");
     const fs::path kept[] = {
         used->Path(),
-        Make(".quillon-1-3", "", 0h), // its maker may be about to mark it
+        Make(".quillon-1-6", "a.ps", 0h), // on a system that has no locks
         Out() / ".quillon-1-4",
         target / "in use",
         Make(".quillon-1", "", 2h),
