@@ -277,10 +277,11 @@ TEST_F(JournalFileTest, IsBegunAnewWhenItIsDamaged) {
             EXPECT_THROW(visited->List({}), JournalError) << what;
         }
         EXPECT_EQ(FilesSetAside(), 0U) << what;
-        const std::unique_ptr<Journal> journal = Open();
+        std::unique_ptr<Journal> journal = Open();
         ASSERT_TRUE(journal) << what << m_fault.Text();
         EXPECT_THAT(journal->List({}), IsEmpty()) << what;
         EXPECT_EQ(FilesSetAside(), 1U) << what;
+        journal.reset();
         for (const auto& entry : fs::directory_iterator(m_folder.Path()))
             fs::remove(entry.path());
     }
