@@ -2,18 +2,18 @@
 
 # The options of a command, or of all.
 _quillon_options() {
-    printf '%s ' --help --version --lang --json --verbose --log --engine-stall --engine-limit \
-        --memory-limit --require-isolation --engine-documents --filters --stand-ins
+    printf '%s ' --help --version --lang --json --verbose --quiet --log --engine-stall \
+        --engine-limit --memory-limit --require-isolation --engine-documents --filters --stand-ins
     case $1 in
     convert) printf '%s ' --out --printer --settings --ps --pdf --profile --jobs --set ;;
     settings) printf '%s ' --settings ;;
     watch)
-        printf '%s ' --config --check --once \
+        printf '%s ' --config --check --once --journal --http \
             --out --printer --settings --ps --pdf --profile --jobs --set
         ;;
-    queue) printf '%s ' --config --folder --state ;;
-    retry) printf '%s ' --config --folder --failed ;;
-    pause | resume) printf '%s ' --config ;;
+    queue) printf '%s ' --config --journal --folder --state --limit ;;
+    retry) printf '%s ' --config --journal --folder --failed ;;
+    pause | resume) printf '%s ' --config --journal ;;
     esac
 }
 
@@ -54,7 +54,7 @@ _quillon() {
     case $previous in
     --lang) _quillon_choose $'de\nen\nes\nfr\nja' "$current" ;;
     --out | -o | --filters | --stand-ins) _quillon_choose_files -d "$current" ;;
-    --config | --log | --settings) _quillon_choose_files -f "$current" ;;
+    --config | --journal | --log | --settings) _quillon_choose_files -f "$current" ;;
     --profile)
         compopt -o filenames
         _quillon_choose "$(_quillon_profiles "$1")" "$current"
@@ -67,7 +67,7 @@ _quillon() {
         _quillon_choose $'waiting\nconverting\ndelivering\nfinished\narchived\nfailed\nvanished' \
             "$current"
         ;;
-    --engine-* | --folder | --jobs | -j | --memory-limit | --printer) ;; # only the user knows
+    --engine-* | --folder | --http | --jobs | -j | --limit | --memory-limit | --printer) ;; # only the user knows
     *)
         if [[ $current == -* ]]; then
             _quillon_choose "$(_quillon_options "$command" | tr ' ' '\n')" "$current"
