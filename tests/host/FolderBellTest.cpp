@@ -93,6 +93,8 @@ TEST(AskForWritersTest, TellsWhetherSomebodyWrites) {
     EXPECT_TRUE(std::ofstream(file).is_open()) << "the question has kept the file";
     EXPECT_EQ(AskForWriters(folder / "missing"), Writers::Unknown);
     EXPECT_EQ(AskForWriters(folder.Path()), Writers::Unknown);
+    EXPECT_NE(WritersKnownIn(folder.Path()), WritersKnown::OfNone);
+    EXPECT_EQ(WritersKnownIn(folder / "missing"), WritersKnown::OfNone);
 }
 
 } // namespace

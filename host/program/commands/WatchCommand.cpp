@@ -2,12 +2,17 @@
 #include "host/program/commands/Command.h"
 #include "host/program/page/PageServer.h"
 #include "host/program/system/Interruption.h"
+#include "host/program/watch/ConfigurationCheck.h"
+#include "host/program/watch/FolderLock.h"
+#include "host/program/watch/FolderPlaces.h"
 #include "host/program/watch/WatchService.h"
 #include "machine/OfficeApplication.h"
 #include "plugin/settings/FilterSettings.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>
+
+#include <algorithm>
 
 namespace fs = std::filesystem;
 
@@ -82,6 +87,10 @@ std::optional<WatchConfiguration> ReadConfiguration(const WatchOptions& options,
         configuration->http = *options.http;
     if (options.jobs)
         configuration->jobs = *options.jobs;
+    if (const auto clash = FindClash(*configuration)) {
+        fault = {clash->what, Blame::Usage};
+        return std::nullopt;
+    }
     return configuration;
 }
 
@@ -115,12 +124,28 @@ WatchService::Means MeansOf(const WatchOptions& watch, const CommonOptions& opti
     return means;
 }
 
+/// Whether the page could be shown; while the watch runs, it is.
+std::vector<Fault> FindObstacleOfPage(const WatchConfiguration& configuration) {
+    const bool runs =
+        std::any_of(configuration.folders.begin(), configuration.folders.end(),
+                    [](const auto& folder) { return FolderLock::HolderOf(folder.in).has_value(); });
+    const StatusBoard board;
+    Fault fault;
+    if (configuration.http.empty() || runs ||
+        PageServer::Start(
+            configuration.http, {}, board, [] {}, fault))
+        return {};
+    return {fault};
+}
+
 ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Reporter& reporter) {
     Fault fault;
     const std::optional<WatchConfiguration> configuration = ReadConfiguration(watch, fault);
     if (!configuration)
         return reporter.Error(fault);
     const FilterSet filters(options.FiltersFolder());
+    if (watch.check)
+        return TellCheck(*configuration, filters, reporter, FindObstacleOfPage(*configuration));
     const std::unique_ptr<Journal> journal = OpenJournal(configuration->journal, fault);
     if (!journal)
         return reporter.Error(fault);

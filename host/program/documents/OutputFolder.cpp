@@ -19,17 +19,19 @@ bool HasRoom(const fs::path& folder) {
     return error || space.available > NextToNothing;
 }
 
-fs::path WithoutSeparatorAtEnd(const fs::path& path) {
-    return path.has_filename() || path == path.root_path() ? path : path.parent_path();
+/// Absolute, without a separator at its end.
+/// @return empty when there is no such path
+fs::path Normal(const fs::path& path) {
+    std::error_code error;
+    const fs::path folder = fs::absolute(path, error).lexically_normal();
+    if (error || !IsText(folder))
+        return {};
+    return folder.has_filename() || folder == folder.root_path() ? folder : folder.parent_path();
 }
 
 /// @return why there is no such folder; empty when it has been made
 wxString Make(const fs::path& folder) {
     std::error_code error;
-    if (fs::exists(folder, error))
-        return _("it is a file, not a folder");
-    if (!fs::is_directory(folder.parent_path(), error))
-        return _("the folder above it does not exist either; create that first");
     if (!fs::create_directory(folder, error) ||
         (error = SyncFolder(folder.parent_path()))) // or it is lost with what is in it
         return wxString::Format(_("it cannot be created: %s"), Because(error));
@@ -39,20 +41,34 @@ wxString Make(const fs::path& folder) {
 } // namespace
 
 std::optional<OutputFolder> OutputFolder::Open(const fs::path& path, Fault& fault) {
+    const fs::path folder = Normal(path);
     std::error_code error;
-    const fs::path folder = WithoutSeparatorAtEnd(fs::absolute(path, error).lexically_normal());
-    wxString obstacle;
-    if (error || !IsText(folder)) {
-        obstacle = _("its name is not valid UTF-8 text");
-    } else if (!fs::is_directory(folder, error)) {
+    wxString obstacle = FindObstacle(folder);
+    if (obstacle.empty() && !fs::is_directory(folder, error))
         obstacle = Make(folder);
-    } else if (!wxFileName::IsDirWritable(ToText(folder))) {
-        obstacle = _("nothing can be written to it; choose another one or change its permissions");
-    }
     if (obstacle.empty())
         return OutputFolder(folder);
     fault = {obstacle, Blame::Usage};
     return std::nullopt;
+}
+
+wxString OutputFolder::FindObstacle(const fs::path& path) {
+    const fs::path folder = Normal(path);
+    std::error_code error;
+    if (folder.empty())
+        return _("its name is not valid UTF-8 text");
+    const fs::path parent = folder.parent_path();
+    if (!fs::exists(folder, error) && !fs::is_directory(parent, error))
+        return _("the folder above it does not exist either; create that first");
+    if (!fs::exists(folder, error))
+        return wxFileName::IsDirWritable(ToText(parent))
+                   ? wxString()
+                   : _("nothing can be written to the folder above it");
+    if (!fs::is_directory(folder, error))
+        return _("it is a file, not a folder");
+    return wxFileName::IsDirWritable(ToText(folder))
+               ? wxString()
+               : _("nothing can be written to it; choose another one or change its permissions");
 }
 
 wxString OutputFolder::Allot(const wxString& fileName) {

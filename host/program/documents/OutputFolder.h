@@ -13,6 +13,10 @@ public:
     /// @param fault receives why it cannot be used
     static std::optional<OutputFolder> Open(const std::filesystem::path& path, Fault& fault);
 
+    /// Looks why a folder cannot be taken, without creating it.
+    /// @return empty when nothing is in the way that can be seen
+    static wxString FindObstacle(const std::filesystem::path& path);
+
     /// Absolute, without a separator at its end.
     const std::filesystem::path& Path() const { return m_path; }
 

@@ -1,8 +1,10 @@
 #include "host/program/system/FileSystemKind.h"
 
 #include <fcntl.h>
+#include <linux/capability.h>
 #include <linux/magic.h>
 #include <sys/stat.h>
+#include <sys/syscall.h>
 #include <sys/sysmacros.h>
 #include <sys/vfs.h>
 #include <unistd.h>
@@ -11,6 +13,7 @@
 #include <cerrno>
 #include <csignal>
 #include <iterator>
+#include <string>
 
 namespace {
 
@@ -50,6 +53,28 @@ Writers AskForLease(int descriptor) {
     return errno == EAGAIN ? Writers::Some : Writers::Unknown;
 }
 
+/// Whether this process may ask for a lease on what is not its user's.
+bool MayAskOfAll() {
+    __user_cap_header_struct header = {_LINUX_CAPABILITY_VERSION_3, 0};
+    __user_cap_data_struct sets[_LINUX_CAPABILITY_U32S_3] = {};
+    return syscall(SYS_capget, &header, sets) == 0 &&
+           (sets[CAP_TO_INDEX(CAP_LEASE)].effective & CAP_TO_MASK(CAP_LEASE)) != 0;
+}
+
+/// Asks for a lease on a file in the folder that has no name.
+Writers AskForLeaseIn(const std::filesystem::path& folder) {
+    const int written = open(folder.c_str(), O_TMPFILE | O_RDWR | O_CLOEXEC, 0600);
+    if (written < 0) // where there are none, there are leases mostly
+        return errno == EOPNOTSUPP ? Writers::None : Writers::Unknown;
+    const std::string path = "/proc/self/fd/" + std::to_string(written);
+    const int descriptor = open(path.c_str(), O_RDONLY | O_CLOEXEC);
+    close(written);
+    const Writers writers = descriptor < 0 ? Writers::Unknown : AskForLease(descriptor);
+    if (descriptor >= 0)
+        close(descriptor);
+    return writers;
+}
+
 } // namespace
 
 bool IsShare(const std::filesystem::path& folder) {
@@ -69,4 +94,10 @@ Writers AskForWriters(const std::filesystem::path& file) {
     const Writers writers = IsRegular(descriptor) ? AskForLease(descriptor) : Writers::Unknown;
     close(descriptor);
     return writers;
+}
+
+WritersKnown WritersKnownIn(const std::filesystem::path& folder) {
+    if (IsShare(folder) || AskForLeaseIn(folder) == Writers::Unknown)
+        return WritersKnown::OfNone;
+    return MayAskOfAll() ? WritersKnown::OfAll : WritersKnown::OfOwn;
 }

@@ -43,15 +43,20 @@ std::vector<Fault> FindObstacles(const FilterSet& filters) {
 
 } // namespace
 
-ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter) {
-    const wxArrayString convertible = ListConvertible(filters);
+std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation) {
     std::vector<Fault> missing;
-    if (convertible.empty())
+    if (ListConvertible(filters).empty())
         missing = FindObstacles(filters);
     if (const auto pdfMaker = FindMissingPdfMaker())
         missing.push_back(*pdfMaker);
     if (const auto isolation = FindMissingIsolation(); isolation && requireIsolation)
         missing.push_back(*isolation);
+    return missing;
+}
+
+ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter) {
+    const wxArrayString convertible = ListConvertible(filters);
+    const std::vector<Fault> missing = FindMissing(filters, requireIsolation);
     for (const Fault& part : missing) {
         reporter.Line(wxString::Format(_("Missing: %s"), part.Text()));
         reporter.Record({{"type", "missing"},

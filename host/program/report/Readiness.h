@@ -3,8 +3,12 @@
 #include "host/program/filters/FilterSet.h"
 #include "host/program/report/Reporter.h"
 
+/// What is missing to convert documents at all, or to make PDF files of them.
+/// @param requireIsolation whether documents must be kept from the rest of the machine
+std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation);
+
 /// Says what documents can be converted, as a line and as a record of type "summary", or what is
 /// missing, as lines and as records of that type.
-/// @param requireIsolation whether documents must be kept from the rest of the machine
+/// @param requireIsolation as above
 /// @return the exit code of a command that asks for it
 ExitCode TellReadiness(const FilterSet& filters, bool requireIsolation, Reporter& reporter);

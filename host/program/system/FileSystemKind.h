@@ -15,3 +15,13 @@ enum class Writers {
 
 /// Neither waits for anybody nor follows a link.
 Writers AskForWriters(const std::filesystem::path& file);
+
+/// Of which files AskForWriters can tell.
+enum class WritersKnown {
+    OfAll,
+    OfOwn,  ///< those of the user that this process runs as
+    OfNone, ///< the file system cannot tell
+};
+
+/// Leaves no trace in the folder.
+WritersKnown WritersKnownIn(const std::filesystem::path& folder);

@@ -61,6 +61,13 @@ std::optional<FolderLock> FolderLock::Take(const fs::path& folder, Fault& fault)
     return std::nullopt;
 }
 
+std::optional<wxString> FolderLock::HolderOf(const fs::path& folder) {
+    std::error_code ignored;
+    const bool isHeld =
+        fs::exists(folder / LockName, ignored) && !Open(folder / LockName, OPEN_EXISTING);
+    return isHeld ? std::optional(OwnerOf(folder)) : std::nullopt;
+}
+
 FolderLock& FolderLock::operator=(FolderLock&& other) noexcept {
     Release();
     m_folder = std::move(other.m_folder);

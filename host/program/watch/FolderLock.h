@@ -13,6 +13,9 @@ public:
     /// @param fault receives why the folder is not had, with Blame::Usage when somebody else has it
     static std::optional<FolderLock> Take(const std::filesystem::path& folder, Fault& fault);
 
+    /// Looks who watches a folder at the moment, without leaving anything in it.
+    static std::optional<wxString> HolderOf(const std::filesystem::path& folder);
+
     FolderLock(FolderLock&& other) noexcept = default;
     FolderLock& operator=(FolderLock&& other) noexcept;
     ~FolderLock();

@@ -20,10 +20,10 @@ fs::path Real(const fs::path& path) {
 std::optional<wxString> ClashOfInput(const FolderConfiguration& folder,
                                      const FolderConfiguration& other) {
     if (LiesIn(other.in, folder.in) && LiesIn(folder.in, other.in))
-        return wxString::Format(_("the folder \"%s\" has the same one"), other.name);
+        return wxString::Format(_("in: the folder \"%s\" has the same one"), other.name);
     if (LiesIn(folder.in, other.in))
         return wxString::Format(
-            _("it lies in that of the folder \"%s\", which would take the same documents"),
+            _("in: it lies in that of the folder \"%s\", which would take the same documents"),
             other.name);
     return std::nullopt;
 }
@@ -51,16 +51,17 @@ std::optional<Clash> FindClash(const WatchConfiguration& configuration) {
                 if (const auto what = ClashOfInput(folders[i], folders[k]))
                     return Clash{i, Clash::In, *what};
             if (LiesIn(folders[i].out, folders[k].in))
-                return Clash{i, Clash::Out,
-                             wxString::Format(_("it lies in what the folder \"%s\" watches, which "
-                                                "would take the output as documents"),
-                                              folders[k].name)};
+                return Clash{
+                    i, Clash::Out,
+                    wxString::Format(_("out: it lies in what the folder \"%s\" watches, which "
+                                       "would take the output as documents"),
+                                     folders[k].name)};
         }
     const fs::path journal = FromArgument(configuration.journal);
     for (std::size_t i = 0; i < folders.size(); ++i)
         if (LiesIn(journal, folders[i].in))
-            return Clash{
-                i, Clash::JournalFile,
-                wxString::Format(_("it lies in what the folder \"%s\" watches"), folders[i].name)};
+            return Clash{i, Clash::JournalFile,
+                         wxString::Format(_("journal: it lies in what the folder \"%s\" watches"),
+                                          folders[i].name)};
     return std::nullopt;
 }

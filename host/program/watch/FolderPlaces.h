@@ -8,7 +8,7 @@ struct Clash {
 
     std::size_t folder = 0; ///< whose `place` is in the way
     Place place = In;
-    wxString what;
+    wxString what; ///< begins with its key
 };
 
 /// Looks for output that would be taken as documents, and documents that two folders would take.

@@ -13,9 +13,6 @@ using namespace std::chrono_literals;
 
 namespace {
 
-constexpr std::chrono::milliseconds LocalSettle = 2s;
-constexpr std::chrono::milliseconds ShareSettle = 10s;
-
 // Between scans when nothing tells of a change, and between tries to see a folder that is away.
 constexpr std::chrono::milliseconds LocalInterval = 10s;
 constexpr std::chrono::milliseconds ShareInterval = 5s;
@@ -195,7 +192,7 @@ void FolderWatcher::Close(Fault fault) {
 FolderScan::Rules FolderWatcher::MakeRules() {
     FolderScan::Rules rules;
     rules.folder = m_configuration.in;
-    rules.settle = m_configuration.settle.value_or(m_isShare ? ShareSettle : LocalSettle);
+    rules.settle = SettleTime(m_configuration, m_isShare);
     rules.asksForWriters = !m_isShare;
     rules.folderIsJob = m_configuration.folderIsJob;
     rules.takesOthers = m_configuration.others != Others::Leave;

@@ -248,6 +248,10 @@ WatchConfiguration StandardWatchConfiguration() {
     return watch;
 }
 
+std::chrono::milliseconds SettleTime(const FolderConfiguration& folder, bool isOnShare) {
+    return folder.settle.value_or(isOnShare ? 10s : 2s);
+}
+
 std::optional<WatchConfiguration> ReadWatchConfiguration(const fs::path& file, Fault& fault) {
     std::optional<std::string> bytes = ReadBounded(file, fault);
     if (bytes && !bytes->empty() && wxString::FromUTF8(*bytes).empty()) {

@@ -56,6 +56,10 @@ struct WatchConfiguration {
 FolderConfiguration StandardFolderConfiguration();
 WatchConfiguration StandardWatchConfiguration();
 
+/// For how long a file must stay as it is until it has settled.
+/// @param isOnShare where a writer that pauses is seen late
+std::chrono::milliseconds SettleTime(const FolderConfiguration& folder, bool isOnShare);
+
 /// Reads a configuration. Its paths are relative to its own folder.
 /// @param fault receives why it cannot be used, with line and column
 std::optional<WatchConfiguration> ReadWatchConfiguration(const std::filesystem::path& file,

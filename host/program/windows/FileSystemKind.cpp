@@ -17,3 +17,7 @@ Writers AskForWriters(const std::filesystem::path& file) {
     CloseHandle(opened);
     return Writers::None;
 }
+
+WritersKnown WritersKnownIn(const std::filesystem::path& folder) {
+    return IsShare(folder) ? WritersKnown::OfNone : WritersKnown::OfAll;
+}
