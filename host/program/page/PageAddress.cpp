@@ -4,9 +4,6 @@
 
 #include <wx/intl.h>
 
-#include <arpa/inet.h>
-#include <netinet/in.h>
-
 #include <algorithm>
 #include <cctype>
 #include <charconv>
