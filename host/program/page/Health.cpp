@@ -35,7 +35,8 @@ std::vector<wxString> ReasonsOfIllness(const WatchStatus& status, const JournalE
                                        std::chrono::steady_clock::time_point now,
                                        const Texts& texts) {
     std::vector<wxString> reasons;
-    if (status.lastPass == std::chrono::steady_clock::time_point())
+    const bool hasLooked = status.lastPass != std::chrono::steady_clock::time_point();
+    if (!hasLooked)
         reasons.push_back(texts(wxTRANSLATE("the folders have not been looked at yet")));
     else if (now - status.lastPass > LongestPass)
         reasons.push_back(wxString::Format(
@@ -50,6 +51,8 @@ std::vector<wxString> ReasonsOfIllness(const WatchStatus& status, const JournalE
             texts(wxTRANSLATE("the service is ending: what is under way is finished first")));
     if (IsPaused("", status, journal))
         reasons.push_back(texts(wxTRANSLATE("all folders are paused")));
+    if (!hasLooked) // how folders are is not known yet
+        return reasons;
     for (const FolderStatus& folder : status.folders) {
         const wxString reason =
             IllnessOf(folder, IsPaused(folder.configuration.name, status, journal), texts);
