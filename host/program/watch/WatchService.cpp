@@ -3,9 +3,11 @@
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
 #include "host/program/report/OutcomeReport.h"
+#include "host/program/report/Progress.h"
 #include "host/program/system/Interruption.h"
 #include "host/program/system/ServiceManager.h"
 #include "host/program/watch/FreeSpace.h"
+#include "host/program/watch/Retention.h"
 
 #include <wx/intl.h>
 
@@ -19,10 +21,6 @@ namespace {
 constexpr std::chrono::seconds BetweenHeartbeats = 10s;
 constexpr std::chrono::seconds BetweenStatuses = 1s;
 constexpr std::chrono::minutes BetweenRemovals = 1min;
-constexpr std::size_t MostRemovals = 500; // at a time
-
-/// How long the journal tells of a document whose file is kept for ever, or is gone.
-constexpr std::chrono::hours RecordsLast = 24h * 90;
 
 /// How long a document under way may take to be finished before the program ends, beyond what a
 /// service is given anyway.
@@ -148,7 +146,8 @@ void WatchService::Pass() {
                 ServiceManager::TellStopping(DrainingTakes);
         }
         if (now - m_removedOld > BetweenRemovals) {
-            RemoveOld();
+            for (const WatchedFolder& folder : m_folders)
+                RemoveOldDocuments(*folder.Configuration(), m_journal);
             m_removedOld = now;
         }
         m_isOver = m_means.once && IsDone();
@@ -199,28 +198,6 @@ void WatchService::Insert(WatchedFolder& folder) {
     m_work.Expect();
 }
 
-/// Removes processed documents whose time is over, and what the journal has of them.
-void WatchService::RemoveOld() {
-    const JournalTime now = std::chrono::system_clock::now();
-    for (const WatchedFolder& folder : m_folders) {
-        const auto& keep = folder.Configuration()->keepProcessed;
-        for (const JobState state : {JobState::Archived, JobState::Vanished}) {
-            JobQuery query;
-            query.folder = folder.Name();
-            query.state = state;
-            query.endedBefore = now - (keep ? *keep : std::chrono::seconds(RecordsLast));
-            query.limit = MostRemovals;
-            for (const Job& job : m_journal.List(query)) {
-                std::error_code error;
-                if (keep && state == JobState::Archived && !job.aside.empty() &&
-                    LookAt(job.aside, error).identity.number == job.identity.number && !error)
-                    fs::remove(job.aside, error);
-                m_journal.Remove(job.id);
-            }
-        }
-    }
-}
-
 void WatchService::TellStatus() {
     m_told = Clock::now();
     WatchStatus status;
@@ -239,7 +216,27 @@ void WatchService::TellStatus() {
         if (!folder.obstacle.empty())
             line << "; " << folder.configuration.name << ": " << folder.obstacle;
     ServiceManager::TellStatus(line);
+    ShowProgress(status.running);
     m_board.Put(std::move(status));
+}
+
+/// At a terminal: how far what came together has come.
+void WatchService::ShowProgress(const std::vector<RunningDocument>& running) {
+    if (running.empty()) {
+        m_burst = Clock::now();
+        m_doneBefore = m_done + m_failed;
+        return;
+    }
+    if (!m_reporter.ForTerminal() || !m_journalFault.empty())
+        return;
+    const std::size_t done = m_done + m_failed - m_doneBefore;
+    const std::size_t all = done + running.size() + m_work.Waiting();
+    wxString text = wxString::Format(_("%zu of %zu"), done, all) + "  ";
+    const wxString left = TimeLeft(Clock::now() - m_burst, done, all);
+    text << (left.empty() ? left : left + "  ");
+    for (const RunningDocument& document : running)
+        text << document.name << (&document == &running.back() ? "" : ", ");
+    m_reporter.Passing(ProgressLine(static_cast<int>(done * 100 / all), text));
 }
 
 /// Whether nothing is left that has settled, or may yet.

@@ -49,8 +49,8 @@ private:
     void Pass();
     void LookAfterFolders();
     void Insert(WatchedFolder& folder);
-    void RemoveOld();
     void TellStatus();
+    void ShowProgress(const std::vector<RunningDocument>& running);
     bool IsDone() const;
     bool IsDrained() const;
     ExitCode Verdict() const;
@@ -79,4 +79,6 @@ private:
     bool m_isOver = false; ///< with `once`
     std::size_t m_done = 0;
     std::size_t m_failed = 0;
+    Clock::time_point m_burst; ///< since when something has been under way all the time
+    std::size_t m_doneBefore = 0;
 };

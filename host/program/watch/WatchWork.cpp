@@ -2,6 +2,7 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
+#include "host/program/watch/JobDecision.h"
 #include "host/program/workers/WorkerCount.h"
 #include "plugin/interface/ResultCodes.h"
 
@@ -15,13 +16,6 @@ namespace fs = std::filesystem;
 using namespace std::chrono_literals;
 
 namespace {
-
-/// How often a document's attempt may end this program, before the document is to blame.
-constexpr int MostDeaths = 3;
-
-/// Before a document is tried again that the machine could not convert: longer than its folder
-/// waits, so that another one comes first, in case it is this one that the machine cannot do.
-constexpr std::chrono::seconds GivenBackFor = 40s;
 
 /// Before a document's end is tried again.
 constexpr std::chrono::seconds BetweenEnds = 30s;
@@ -41,19 +35,6 @@ Input InputOf(const Job& job) {
 
 WatchWork::Clock::time_point Now() {
     return WatchWork::Clock::now();
-}
-
-void TryAgain(Job& job, std::chrono::seconds delay) {
-    job.state = JobState::Waiting;
-    job.workplace.clear();
-    job.product.clear();
-    job.due = std::chrono::system_clock::now() + delay;
-}
-
-/// After an attempt that says nothing of the document.
-void GiveBack(Job& job) {
-    job.attempts = std::max(job.attempts - 1, 0);
-    TryAgain(job, GivenBackFor);
 }
 
 } // namespace
@@ -85,10 +66,7 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
         if (!job.workplace.empty())
             work.workplace = Workplace::TakeOver(job.workplace.parent_path());
         if (job.state == JobState::Converting) {
-            if (++job.deaths >= MostDeaths)
-                Fail(job, {wxString::Format(_("it ended the program %d times"), job.deaths)});
-            else
-                TryAgain(job, 0s);
+            DecideByDeath(job, m_filters.ErrorText(ConversionFailed));
             work.isToBeTold = true;
         }
         work.job = std::move(job);
@@ -200,64 +178,22 @@ void WatchWork::EndJobs() {
     }
 }
 
-/// What the worker's outcome means for the document.
+/// What the worker's outcome means for the document and its folder.
 void WatchWork::Decide(UnderWay& work) {
     Job& job = work.job;
-    job.seconds = work.outcome->seconds.value_or(0);
-    job.text = work.outcome->text;
-    if (work.outcome->state == State::Changed) {
-        DecideChange(work);
-    } else if (work.outcome->state == State::Converted) {
-        if (WatchedFolder* const folder = Find(job.folder))
-            folder->Unblock();
-        job.fault.reset();
-        job.workplace = work.outcome->made.parent_path();
-        job.product = ToText(work.outcome->made.filename());
-        job.state = JobState::Delivering;
-    } else {
-        DecideFailure(work);
-    }
-    work.isToBeTold = job.state != JobState::Delivering; // which its delivery begins with
-}
-
-/// A file that is another by now is found anew.
-void WatchWork::DecideChange(UnderWay& work) {
-    Job& job = work.job;
-    if (WatchedFolder* const folder = Find(job.folder))
-        folder->Free();
-    std::error_code error;
-    if (!fs::is_directory(work.folder->in, error)) { // nobody can say what is in it
-        GiveBack(job);
-        return;
-    }
-    job.state = JobState::Vanished;
-    job.open = false;
-    job.ended = std::chrono::system_clock::now();
-}
-
-void WatchWork::DecideFailure(UnderWay& work) {
-    Job& job = work.job;
-    const Fault& fault = *work.outcome->fault;
+    const FolderNews news = DecideByOutcome(job, *work.outcome, *work.folder);
     WatchedFolder* const folder = Find(job.folder);
-    job.fault = fault;
-    if (fault.blame == Blame::Machine || fault.blame == Blame::Usage) {
-        if (folder)
-            folder->Block(fault);
-        m_pool.Retire(0s); // the machine may be mended before the next one
-        GiveBack(job);
-        return;
-    }
-    if (folder)
+    if (folder && news == FolderNews::Works)
         folder->Unblock();
-    const auto attempt = static_cast<std::size_t>(std::max(job.attempts, 1));
-    const std::vector<std::chrono::seconds>& retries = work.folder->retries;
-    if (work.outcome->state == State::Refused || attempt > retries.size()) {
-        Fail(job, fault);
-        return;
-    }
-    TryAgain(job, retries[attempt - 1]);
-    if (m_means.onRetry)
+    if (folder && news == FolderNews::None)
+        folder->Free();
+    if (folder && news == FolderNews::Blocked)
+        folder->Block(*job.fault);
+    if (news == FolderNews::Blocked)
+        m_pool.Retire(0s); // the machine may be mended before the next one
+    else if (job.state == JobState::Waiting && m_means.onRetry)
         m_means.onRetry(job);
+    work.isToBeTold = job.state != JobState::Delivering; // which its delivery begins with
 }
 
 /// @return whether no step is left
@@ -298,14 +234,6 @@ void WatchWork::Report(UnderWay& work) const {
     m_means.onEnd(work.job, *work.outcome);
 }
 
-void WatchWork::Fail(Job& job, Fault fault) const {
-    if (job.text.empty())
-        job.text = m_filters.ErrorText(fault.code);
-    job.state = JobState::Failed;
-    job.fault = std::move(fault);
-    job.ended = std::chrono::system_clock::now();
-}
-
 WatchedFolder* WatchWork::Find(const wxString& name) {
     const auto found =
         std::find_if(m_folders.begin(), m_folders.end(),
@@ -326,6 +254,9 @@ void WatchWork::LookAtUpcoming() {
         return;
     m_upcomingKnown = now;
     m_upcoming.clear();
+    m_waiting = 0;
+    for (auto& [folder, counts] : m_journal.Counts())
+        m_waiting += counts.jobs[JobState::Waiting];
     JobQuery query;
     query.state = JobState::Waiting;
     query.limit = MostUpcoming;

@@ -59,6 +59,8 @@ public:
     /// Whether something is under way that does not wait for better times.
     bool IsBusy() const;
     std::vector<RunningDocument> Running() const;
+    /// How many documents could be begun, had they a worker.
+    std::size_t Waiting() const { return m_waiting; }
 
 private:
     struct UnderWay {
@@ -76,12 +78,9 @@ private:
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
     void Sweep(const std::filesystem::path& outputFolder);
     void Decide(UnderWay& work);
-    void DecideFailure(UnderWay& work);
-    void DecideChange(UnderWay& work);
     bool End(UnderWay& work);
     std::optional<Fault> DoLastSteps(UnderWay& work);
     void Report(UnderWay& work) const;
-    void Fail(Job& job, Fault fault) const;
     WatchedFolder* Find(const wxString& name);
     const Texts& TextsFor(const FolderConfiguration& folder) const;
     void LookAtUpcoming();
@@ -100,6 +99,7 @@ private:
     std::map<std::int64_t, UnderWay> m_underWay; ///< with a worker, by the job's id
     std::map<std::int64_t, UnderWay> m_ending;   ///< no longer with one
     std::vector<Input> m_upcoming;               ///< some of those that are waiting
+    std::size_t m_waiting = 0;
     Clock::time_point m_upcomingKnown;
     WorkerPool m_pool;
 };

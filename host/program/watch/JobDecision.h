@@ -1,0 +1,23 @@
+#pragma once
+
+#include "host/program/documents/Outcome.h"
+#include "host/program/journal/Job.h"
+#include "host/program/watch/WatchConfiguration.h"
+
+// What becomes of a job. These change the job alone; the journal is told by whoever calls them.
+
+/// What a document's outcome says of its folder.
+enum class FolderNews {
+    None,
+    Works,   ///< the machine can convert its documents
+    Blocked, ///< it cannot
+};
+
+/// Decides by what came of a document's conversion: it is delivered, tried again when its time
+/// comes, or comes no further. What the machine is to blame for is no attempt of the document's.
+/// @param job Converting; afterwards Delivering, Waiting, Failed or Vanished
+FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder);
+
+/// Decides on a job whose attempt ended the program: it is tried again, but not for ever.
+/// @param text the message of the code with which it may fail
+void DecideByDeath(Job& job, const wxString& text);
