@@ -59,9 +59,10 @@ ExitCode Run(const CommandLine& line) {
                               Shown(FromArgument(*options.logFile))),
              Blame::Usage});
     Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
-    SetUpMachine({options.StandInsFolder(), options.stallSeconds, options.limitSeconds,
-                  options.memoryMegabytes,
-                  command.examinesEngine && options.engineDocuments != 1U});
+    if (command.needsMachine)
+        SetUpMachine({options.StandInsFolder(), options.stallSeconds, options.limitSeconds,
+                      options.memoryMegabytes,
+                      command.examinesEngine && options.engineDocuments != 1U});
     if (command.opensDocuments)
         if (const auto fault = CheckIsolation(options))
             return reporter.Error(*fault);

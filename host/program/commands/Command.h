@@ -8,11 +8,12 @@
 
 /// The command that a command line asks for.
 struct Command {
-    /// Runs it, when the machine is set up.
+    /// Runs it, when what it needs is set up.
     /// @return the code to end with
     std::function<ExitCode(const CommonOptions&, Reporter&)> run;
 
     bool opensDocuments = false; ///< and none without isolation where that is required
+    bool needsMachine = true;    ///< to be set up, with all that documents are converted with
     bool showsWindows = false;
     bool examinesEngine = false; ///< says how the engine can be run
     bool isWorker = false;       ///< another process of this program decides when it ends
@@ -34,9 +35,17 @@ AddCommand AddConvert;
 AddCommand AddSettings;
 /// `quillon watch`: converts what comes into folders.
 AddCommand AddWatch;
+/// `quillon queue`: says what has become of documents in watched folders.
+AddCommand AddQueue;
+/// `quillon retry`: has failed documents tried again.
+AddCommand AddRetry;
+/// `quillon pause`: has no documents begun.
+AddCommand AddPause;
+/// `quillon resume`: has them begun again.
+AddCommand AddResume;
 /// `quillon worker`: converts what another process of this program asks for; see WorkerPool.
 AddCommand AddWorker;
 
 /// All of them, in the order of the help.
-constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen,   AddConvert,
-                                       AddWatch,  AddSettings, AddWorker};
+constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen, AddConvert, AddWatch,    AddQueue,
+                                       AddRetry,  AddPause,  AddResume,  AddSettings, AddWorker};

@@ -40,11 +40,12 @@ Settings
 constexpr const char* ExitCodes = R"(
 Exit codes
   0  done; for status: ready to convert; for settings: saved, or left as they were
-  1  some documents were refused or could not be converted
+  1  some documents were refused or could not be converted; for retry: or cannot be tried again
   2  the machine is at fault: no Office application, no printer, no filter, a full disk, no more
      processes, no isolation where it is required, an engine that was ended from outside, when it was tried again, too; for
-     settings: no display to show them on
-  3  wrong usage: the command line, the settings file or the output folder
+     settings: no display to show them on; for queue and what goes with it: the journal cannot be
+     read or written
+  3  wrong usage: the command line, the settings file, the output folder or the configuration
   4  interrupted: Ctrl-C, or a request to end, came before all was done. What is under way is
      finished first; a second Ctrl-C ends the program at once
 
@@ -54,11 +55,15 @@ Output
   those that stood in. What the program says is in the language of --lang, or else of LC_ALL,
   LC_MESSAGES or LANG. In English are this help, the log, what is wrong with a command line, and
   what the system or an engine's libraries say in their own words.
+  `quillon queue` has a line for each document of a watched folder that waits, is under way or has
+  failed: number, folder, name, state, attempts, next try, reason; then one for each folder, with
+  how many there are in each state.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
-  printer, distiller, isolation, panel, missing, document, summary and error; lines for people then go to
-  stderr. The "code", the "state" and the "fault" (document, machine or null) of a document are the
-  same in every language; "fonts" are those not installed, each with what was "asked" for and "used",
-  and whether both have the "sameMetrics", so that lines break alike.
+  printer, distiller, isolation, panel, missing, document, job, queue, retry, pause, summary and
+  error; lines for people then go to stderr. The "code", the "state" and the "fault" (document,
+  machine or null) of a document or job are the same in every language, and times are UTC; "fonts"
+  are those not installed, each with what was "asked" for and "used", and whether both have the
+  "sameMetrics", so that lines break alike.
 )";
 
 /// The choices in a row, as "1 2 3" or as "this, that or another".

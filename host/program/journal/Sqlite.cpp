@@ -2,6 +2,8 @@
 
 #include <sqlite3.h>
 
+#include <system_error>
+
 namespace {
 
 int PrimaryCode(int code) {
@@ -9,7 +11,12 @@ int PrimaryCode(int code) {
 }
 
 SqliteError ErrorOf(sqlite3* database, int code) {
-    return {code, database ? sqlite3_errmsg(database) : sqlite3_errstr(code)};
+    std::string what = database ? sqlite3_errmsg(database) : sqlite3_errstr(code);
+    const bool isSystems =
+        PrimaryCode(code) == SQLITE_CANTOPEN || PrimaryCode(code) == SQLITE_IOERR;
+    if (const int error = database && isSystems ? sqlite3_system_errno(database) : 0)
+        what.append(": ").append(std::system_category().message(error));
+    return {code, what};
 }
 
 } // namespace

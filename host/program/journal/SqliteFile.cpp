@@ -71,7 +71,8 @@ Fault FaultOf(const fs::path& file, const SqliteError& error) {
                 _("`quillon watch` sets a damaged one aside and begins a new one")};
     return {wxString::Format(_("the journal %s cannot be opened: %s"), Shown(file),
                              wxString::FromUTF8(error.what())),
-            Blame::Machine};
+            Blame::Machine, ConversionFailed,
+            _("It belongs to whoever watches the folders, and its folder must be on a local disk")};
 }
 
 /// @return null when there is a fault, or the file is damaged and is to be begun anew

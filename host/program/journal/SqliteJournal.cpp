@@ -209,7 +209,8 @@ bool SqliteJournal::Retry(std::int64_t id) {
             database,
             "UPDATE job SET state='waiting', open=1, attempts=0, deaths=0, inserted=?2, due=?2, "
             "changed=?2, begun=0, ended=0, seconds=0, workplace=x'', product='', output=x'', "
-            "fault_blame='', fault='', fault_code=0, fault_advice='', text='', token=token+1 "
+            "aside=x'', fault_blame='', fault='', fault_code=0, fault_advice='', text='', "
+            "token=token+1 "
             "WHERE id=?1 AND state='failed' AND open=0 AND NOT EXISTS (SELECT 1 FROM job AS other "
             "WHERE other.open=1 AND other.device=job.device AND other.number=job.number AND "
             "other.size=job.size AND other.modified=job.modified)",
