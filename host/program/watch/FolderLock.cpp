@@ -49,7 +49,9 @@ std::optional<FolderLock> FolderLock::Take(const fs::path& folder, Fault& fault)
     const bool isThere = fs::exists(file, ignored); // its last owner may just have removed it
     if (handle && isThere) {
         WriteOwner(folder);
-        return FolderLock(folder, std::move(handle));
+        FolderLock lock(folder, std::move(handle));
+        lock.m_file = LookAt(file, ignored).identity;
+        return lock;
     }
     fault = isThere
                 ? Fault{wxString::Format(_("%s is watched already, by %s"), Shown(folder),
@@ -71,6 +73,7 @@ std::optional<wxString> FolderLock::HolderOf(const fs::path& folder) {
 FolderLock& FolderLock::operator=(FolderLock&& other) noexcept {
     Release();
     m_folder = std::move(other.m_folder);
+    m_file = other.m_file;
     m_handle = std::move(other.m_handle);
     return *this;
 }
@@ -83,10 +86,13 @@ FolderLock::~FolderLock() {
 void FolderLock::Release() {
     if (!m_handle)
         return;
-    std::error_code ignored;
-    fs::remove(m_folder / OwnerName, ignored);
-    const bool isRemoved = fs::remove(m_folder / LockName, ignored);
+    std::error_code error;
+    const fs::path file = m_folder / LockName;
+    const bool isOurs = LookAt(file, error).identity == m_file && !error;
+    if (isOurs)
+        fs::remove(m_folder / OwnerName, error);
+    const bool isRemoved = isOurs && fs::remove(file, error);
     m_handle.reset();
-    if (!isRemoved)
-        fs::remove(m_folder / LockName, ignored);
+    if (isOurs && !isRemoved)
+        fs::remove(file, error);
 }

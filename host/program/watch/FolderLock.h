@@ -1,6 +1,7 @@
 #pragma once
 
 #include "host/program/base/Fault.h"
+#include "host/program/system/FileIdentity.h"
 
 #include <filesystem>
 #include <memory>
@@ -26,5 +27,6 @@ private:
     void Release();
 
     std::filesystem::path m_folder;
+    FileIdentity m_file;            ///< the lock's, should another folder come to that place
     std::shared_ptr<void> m_handle; ///< null when it is another object's
 };

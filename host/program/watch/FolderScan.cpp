@@ -80,8 +80,10 @@ void FolderScan::ScanFolder(const fs::path& folder, const wxString& inside, int 
         if (names.size() % Often == 0 && m_rules.onProgress)
             m_rules.onProgress();
     }
-    if (error && !(depth > 0 && error == std::errc::no_such_file_or_directory)) {
-        m_error = error;
+    if (error) { // one inside may be gone by now, or be nobody's business
+        if (depth == 0 || (error != std::errc::no_such_file_or_directory &&
+                           error != std::errc::permission_denied))
+            m_error = error;
         return;
     }
     for (const std::string& name : names)

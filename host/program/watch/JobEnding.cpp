@@ -104,10 +104,11 @@ bool Close(Job& job, Journal& journal) {
 
 std::optional<Fault> DeliverProduct(Job& job, const FolderConfiguration& folder, Journal& journal) {
     const Product product(job.workplace / FromText(job.product));
-    const fs::path place = Inside(folder.out, job);
+    const fs::path out = job.workplace.parent_path().parent_path(); // whatever is configured now
+    const fs::path place = Inside(out, job);
     const wxString wanted = wxFileName(ToText(job.source.filename())).GetName();
     while (product.IsThere()) {
-        if (const std::error_code error = MakeFolders(place, folder.out))
+        if (const std::error_code error = MakeFolders(place, out))
             return Fault{wxString::Format(_("%s cannot be made: %s"), Shown(place), Because(error)),
                          Blame::Machine};
         const bool replaces = folder.onSameName == OnSameName::Replace;
@@ -117,7 +118,7 @@ std::optional<Fault> DeliverProduct(Job& job, const FolderConfiguration& folder,
         job.output = product.PlaceIn(place, name);
         if (!journal.Commit(job))
             return std::nullopt; // somebody else has it now
-        const std::optional<Fault> fault = product.MoveTo(place, name, replaces);
+        std::optional<Fault> fault = product.MoveTo(place, name, replaces);
         if (fault && product.IsThere() && (replaces || !IsThere(job.output)))
             return fault;
     }

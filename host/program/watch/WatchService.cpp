@@ -153,7 +153,6 @@ void WatchService::Pass() {
         m_isOver = m_means.once && IsDone();
         m_lastPass = now;
         m_journalFault.clear();
-        ServiceManager::TellAlive();
     } catch (const JournalError& error) {
         const wxString fault = wxString::FromUTF8(error.what());
         if (m_journalFault != fault)
@@ -162,6 +161,7 @@ void WatchService::Pass() {
         m_journalFault = fault;
         m_mustForget = true;
     }
+    ServiceManager::TellAlive(); // a journal on a full disk is not mended by another start
     if (now - m_told > BetweenStatuses)
         TellStatus();
 }

@@ -58,8 +58,10 @@ bool WatchWork::IsBusy() const {
 std::size_t WatchWork::Recover(WatchedFolder& folder) {
     std::size_t count = 0;
     for (Job& job : m_journal.TakeOver(folder.Name(), m_claimant)) {
-        if (m_underWay.count(job.id) != 0 || m_ending.count(job.id) != 0)
-            continue; // the folder was away, its document was not
+        if (UnderWay* const known = FindUnderWay(job.id)) {
+            known->job.token = job.token; // the folder was away, its document was not
+            continue;
+        }
         ++count;
         UnderWay& work = m_ending[job.id];
         work.folder = folder.Configuration();
@@ -74,6 +76,13 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
     EndJobs(); // with what they have in workplaces
     Sweep(folder.Configuration()->out);
     return count;
+}
+
+WatchWork::UnderWay* WatchWork::FindUnderWay(std::int64_t id) {
+    for (auto* const works : {&m_underWay, &m_ending})
+        if (const auto found = works->find(id); found != works->end())
+            return &found->second;
+    return nullptr;
 }
 
 /// Removes abandoned workplaces, unless the journal knows of an output in one of them.

@@ -76,6 +76,7 @@ private:
 
     void Begin(Job job, WatchedFolder& folder);
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
+    UnderWay* FindUnderWay(std::int64_t id);
     void Sweep(const std::filesystem::path& outputFolder);
     void Decide(UnderWay& work);
     bool End(UnderWay& work);

@@ -58,6 +58,20 @@ TEST_P(WatchCrashStepsTest, WhereverItDiesEachDocumentComesOutOnce) {
 
 INSTANTIATE_TEST_SUITE_P(All, WatchCrashStepsTest, testing::Range(1, Shares + 1));
 
+TEST_F(WatchCrashTest, WhatIsUnderWayOutlastsANewConfiguration) {
+    Configure();
+    Put("a.doc", "started=" + Path("started") + "\nwait=" + Path("go"));
+    RunningProgram program(QuillonCommand(Watch()));
+    AwaitFile(m_folder / "started");
+    Configure("on_same_name = 'replace'\n");
+    ASSERT_EQ(std::system(("pkill -HUP -f " + Path("[w]atch.toml")).c_str()), 0);
+    Await("the new configuration",
+          [&program] { return program.Err().find("read anew") != std::string::npos; });
+    m_folder.Write("go", "");
+    AwaitFile(m_folder / "in/processed/a.doc");
+    EXPECT_THAT(FilesIn("out"), ElementsAre("a.ps"));
+}
+
 TEST_F(WatchCrashTest, AndWhereverItDiesWhenItStartsAgain) {
     Configure();
     for (const int first : {20, 25, 30, 35, 40}) {
