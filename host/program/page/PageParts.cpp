@@ -67,12 +67,12 @@ void WriteRetry(Html& html, const PageContent& content, const Job& job) {
 }
 
 void WriteFailedJob(Html& html, const PageContent& content, const Job& job) {
-    html << "<li class=\"card\">\n<div class=\"row\"><div><h3 id=\"job-" << std::to_string(job.id)
-         << "\"><bdi>" << NameOfDocument(job) << "</bdi></h3>\n<p class=\"quiet\"><bdi>"
-         << OneLine(job.folder) << "</bdi>, <time>" << TimeText(job.ended) << "</time></p></div>\n";
-    WriteRetry(html, content, job);
-    html << "</div>\n";
+    html << "<li class=\"card row\">\n<div><h3 id=\"job-" << std::to_string(job.id) << "\"><bdi>"
+         << NameOfDocument(job) << "</bdi></h3>\n<p class=\"quiet\"><bdi>" << OneLine(job.folder)
+         << "</bdi>, <time>" << TimeText(job.ended) << "</time></p>\n";
     WriteReason(html, job, content.texts);
+    html << "</div>\n";
+    WriteRetry(html, content, job);
     html << "</li>\n";
 }
 

@@ -44,6 +44,8 @@ section { margin-top: 1.5rem; outline-offset: .4rem; }
 .sums dd { font-size: 1.6rem; line-height: 1.3; }
 .row { display: flex; flex-wrap: wrap; gap: .3rem 1rem; align-items: baseline; justify-content: space-between; }
 .row > :first-child { flex: 1 1 14rem; min-width: 0; }
+time { white-space: nowrap; }
+#away:not([hidden]) { position: sticky; top: .5rem; }
 progress { width: 100%; height: .6rem; accent-color: var(--accent); display: block; margin-top: .4rem; }
 button { font: inherit; color: var(--ink); background: var(--card); border: 1px solid var(--quiet);
   border-radius: .4rem; padding: .3rem .9rem; min-height: 2.2rem; cursor: pointer; }
