@@ -40,6 +40,15 @@ std::int64_t JobIn(const Request& request) {
     return error == std::errc() && end == text.data() + text.size() ? id : 0;
 }
 
+void LogException(const std::exception_ptr& thrown) {
+    try {
+        std::rethrow_exception(thrown);
+    } catch (const std::exception& error) {
+        SetLevelAndGetLogger(LevelError, __FILE__, __func__, __LINE__)
+            << "A request for the page has failed: " << error.what();
+    }
+}
+
 class Server : public PageServer {
 public:
     Server(const PageAddress& address, JournalOpener journal, const StatusBoard& board,
@@ -102,9 +111,11 @@ void Server::SetRoutes() {
                                              "that the configuration names.")));
         return httplib::Server::HandlerResponse::Handled;
     });
-    m_web.set_exception_handler([](const Request&, Response& response, const std::exception_ptr&) {
-        Refuse(response, 500, "internal error");
-    });
+    m_web.set_exception_handler(
+        [](const Request&, Response& response, const std::exception_ptr& thrown) {
+            LogException(thrown);
+            Refuse(response, 500, "internal error");
+        });
     m_web.set_error_handler([](const Request&, Response& response) {
         if (response.body.empty())
             response.set_content(std::to_string(response.status) + '\n', Plain);
