@@ -15,6 +15,3 @@ struct Clash {
 /// Places that are there are compared as they are, links followed; others by their names.
 /// @return the first one
 std::optional<Clash> FindClash(const WatchConfiguration& configuration);
-
-/// Whether it is the folder, or in it, links followed.
-bool LiesIn(const std::filesystem::path& path, const std::filesystem::path& folder);
