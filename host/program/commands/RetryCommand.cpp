@@ -3,6 +3,7 @@
 #include <wx/intl.h>
 
 #include <CLI/CLI.hpp>
+#include <limits>
 
 namespace {
 
