@@ -44,6 +44,7 @@ private:
 std::vector<Place> PlacesOf(const std::vector<FolderConfiguration>& folders,
                             fs::path FolderConfiguration::*place) {
     std::vector<Place> places;
+    places.reserve(folders.size());
     for (const FolderConfiguration& folder : folders)
         places.emplace_back(folder.*place);
     return places;
