@@ -15,8 +15,15 @@ using testing::IsEmpty;
 
 namespace {
 
-/// Opens a journal in a folder of the test's.
-using Opener = std::unique_ptr<Journal> (*)(const fs::path& folder, const JournalTime& now);
+/// What keeps journals.
+struct Implementation {
+    const char* name;
+    std::unique_ptr<Journal> (*open)(const fs::path& folder, const JournalTime& now);
+};
+
+std::ostream& operator<<(std::ostream& stream, const Implementation& implementation) {
+    return stream << implementation.name;
+}
 
 SqliteJournal::Options OptionsFor(const JournalTime& now) {
     SqliteJournal::Options options;
@@ -46,9 +53,9 @@ const Claimant Us = {"us", 30s};
 const std::vector<ClaimableFolder> Both = {{"letters"}, {"bills"}};
 
 /// What every journal does, whatever keeps it.
-class JournalTest : public testing::TestWithParam<Opener> {
+class JournalTest : public testing::TestWithParam<Implementation> {
 protected:
-    std::unique_ptr<Journal> Open() const { return GetParam()(m_folder.Path(), m_now); }
+    std::unique_ptr<Journal> Open() const { return GetParam().open(m_folder.Path(), m_now); }
 
     Job Claim() const { return m_journal->Claim(Both, Us).value_or(Job()); }
     bool HasNone() const { return !m_journal->Claim(Both, Us); }
@@ -233,7 +240,7 @@ TEST_P(JournalTest, ListsWhatIsAskedFor) {
     EXPECT_EQ(counts.oldestWaiting, m_now - 2s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Sqlite, JournalTest, testing::Values(OpenSqlite));
+INSTANTIATE_TEST_SUITE_P(Each, JournalTest, testing::Values(Implementation{"sqlite", OpenSqlite}));
 
 /// A journal in a file, to which things happen.
 class JournalFileTest : public testing::Test {
