@@ -2,9 +2,9 @@
 
 #include "host/program/system/ServiceManager.h"
 
-#include "tests/support/TemporaryFolder.h"
+#include "tests/host/WatchRun.h"
 
-#include <gmock/gmock.h>
+#include <poll.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 #include <unistd.h>
@@ -18,7 +18,7 @@ using testing::MatchesRegex;
 
 namespace {
 
-class ServiceManagerTest : public testing::Test {
+class ServiceManagerTest : public WatchRun {
 protected:
     void SetUp() override {
         sockaddr_un address = {};
@@ -43,8 +43,19 @@ protected:
         return text;
     }
 
+    /// Waits until it is told what begins so, and nothing but signs of life and words before.
+    testing::AssertionResult Await(const std::string& beginning) const {
+        for (pollfd look = {m_socket, POLLIN, 0}; poll(&look, 1, 20000) == 1;) {
+            const std::string received = Received();
+            if (received.rfind(beginning, 0) == 0)
+                return testing::AssertionSuccess();
+            if (received.rfind("STATUS=", 0) != 0 && received != "WATCHDOG=1")
+                return testing::AssertionFailure() << received;
+        }
+        return testing::AssertionFailure() << "silence";
+    }
+
 private:
-    TemporaryFolder m_folder;
     int m_socket = socket(AF_UNIX, SOCK_DGRAM | SOCK_CLOEXEC, 0);
 };
 
@@ -79,6 +90,17 @@ TEST_F(ServiceManagerTest, WantsASignOfLifeOfTheProcessThatItStarted) {
     EXPECT_EQ(ServiceManager::WatchdogPeriod(), 0s);
     unsetenv("WATCHDOG_USEC");
     EXPECT_EQ(ServiceManager::WatchdogPeriod(), 0s);
+}
+
+TEST_F(ServiceManagerTest, IsToldOfAWatchFromItsBeginningToItsEnd) {
+    Configure();
+    Put("slow.doc", "wait=" + Path("go"));
+    const RunningProgram program(QuillonCommand(Watch()));
+    EXPECT_TRUE(Await("READY=1"));
+    EXPECT_TRUE(Await("WATCHDOG=1"));
+    EXPECT_TRUE(Await("STATUS=1 under way"));
+    program.Terminate();
+    EXPECT_TRUE(Await("STOPPING=1\nEXTEND_TIMEOUT_USEC="));
 }
 
 } // namespace
