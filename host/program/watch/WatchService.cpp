@@ -136,9 +136,10 @@ void WatchService::Pass() {
             Reload();
         m_paused = m_journal.Paused();
         LookAfterFolders();
-        m_work.EndJobs();
         if (!m_isDraining)
             m_work.BeginJobs();
+        const bool hasEnded = m_work.EndJob();
+        m_work.Rest();
         if (now - m_heartbeat > BetweenHeartbeats) {
             m_work.Heartbeat();
             m_heartbeat = now;
@@ -150,7 +151,7 @@ void WatchService::Pass() {
                 RemoveOldDocuments(*folder.Configuration(), m_journal);
             m_removedOld = now;
         }
-        m_isOver = m_means.once && IsDone();
+        m_isOver = m_means.once && !hasEnded && IsDone();
         m_lastPass = now;
         m_journalFault.clear();
     } catch (const JournalError& error) {

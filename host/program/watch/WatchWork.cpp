@@ -20,6 +20,9 @@ namespace {
 /// Before a document's end is tried again.
 constexpr std::chrono::seconds BetweenEnds = 30s;
 
+/// After which nothing is kept ready for another document.
+constexpr std::chrono::seconds QuietAfter = 60s;
+
 constexpr std::chrono::seconds UpcomingLasts = 1s;
 constexpr std::size_t MostUpcoming = 64;
 
@@ -50,9 +53,16 @@ WatchWork::~WatchWork() {
 }
 
 bool WatchWork::IsBusy() const {
-    return !m_underWay.empty() ||
-           std::any_of(m_ending.begin(), m_ending.end(),
+    return !m_underWay.empty() || HasEndings();
+}
+
+bool WatchWork::HasEndings() const {
+    return std::any_of(m_ending.begin(), m_ending.end(),
                        [](const auto& entry) { return entry.second.next == Clock::time_point(); });
+}
+
+void WatchWork::Step() {
+    m_pool.Step(HasEndings() ? 0ms : BetweenSignsOfLife);
 }
 
 std::size_t WatchWork::Recover(WatchedFolder& folder) {
@@ -73,7 +83,6 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
         }
         work.job = std::move(job);
     }
-    EndJobs(); // with what they have in workplaces
     Sweep(folder.Configuration()->out);
     return count;
 }
@@ -174,17 +183,18 @@ void WatchWork::OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) {
     m_ending.insert(std::move(work));
 }
 
-void WatchWork::EndJobs() {
+bool WatchWork::EndJob() {
     const Clock::time_point now = Now();
-    for (auto entry = m_ending.begin(); entry != m_ending.end();) {
-        UnderWay& work = entry->second;
-        if (work.outcome && work.job.state == JobState::Converting)
-            Decide(work);
-        if (work.next <= now && End(work))
-            entry = m_ending.erase(entry);
-        else
-            ++entry;
-    }
+    const auto entry = std::find_if(m_ending.begin(), m_ending.end(),
+                                    [now](const auto& each) { return each.second.next <= now; });
+    if (entry == m_ending.end())
+        return false;
+    UnderWay& work = entry->second;
+    if (work.outcome && work.job.state == JobState::Converting)
+        Decide(work);
+    if (End(work))
+        m_ending.erase(entry);
+    return true;
 }
 
 /// What the worker's outcome means for the document and its folder.
@@ -283,9 +293,24 @@ std::size_t WatchWork::WorthwhileJobs() const {
     return WorthwhileWorkers(inputs);
 }
 
-unsigned WatchWork::EngineDocuments() const {
-    return m_means.engineDocuments.value_or(
-        WorthwhileEngineDocuments(m_upcoming.size(), m_pool.Busy() + 1));
+/// Engines are kept when many documents wait, and from then on; so they are while one comes after
+/// the other, until it is quiet.
+unsigned WatchWork::EngineDocuments() {
+    const std::size_t documents = std::max(m_waiting + m_pool.Busy() + 1, ++m_begun);
+    m_engineDocuments =
+        std::max(m_engineDocuments, WorthwhileEngineDocuments(documents, WorthwhileJobs()));
+    return m_means.engineDocuments.value_or(m_engineDocuments);
+}
+
+void WatchWork::Rest() {
+    const Clock::time_point now = Now();
+    if (!m_underWay.empty())
+        m_lastWork = now;
+    if (now - m_lastWork < QuietAfter)
+        return;
+    m_pool.Retire(0s);
+    m_begun = 0;
+    m_engineDocuments = 1;
 }
 
 std::vector<RunningDocument> WatchWork::Running() const {

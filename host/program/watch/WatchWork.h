@@ -38,20 +38,25 @@ public:
     /// @return how many documents there were
     std::size_t Recover(WatchedFolder& folder);
 
-    /// Brings those to their ends that workers are done with, or that could not be before.
-    void EndJobs();
+    /// Brings one to its end that a worker is done with, or that could not be before. One at a
+    /// time: it takes as long as the disk does, and workers are not to wait for that.
+    /// @return whether there was one
+    bool EndJob();
 
     /// Begins documents, as many as there are workers for.
     /// @return whether there may be more, but no worker
     void BeginJobs();
+
+    /// When nothing has been under way for some time: lets go of what was kept ready.
+    void Rest();
 
     /// Says that there are more documents than there were.
     void Expect() { m_upcomingKnown = {}; }
 
     void Heartbeat() { m_journal.Heartbeat(m_claimant); }
 
-    /// Waits for something to happen.
-    void Step() { m_pool.Step(); }
+    /// Waits for something to happen, if there is nothing to do.
+    void Step();
     /// From any thread.
     void Wake() { m_pool.Wake(); }
     void Close() { m_pool.Close(); }
@@ -74,6 +79,7 @@ private:
         Clock::time_point next; ///< when its end may be tried again
     };
 
+    bool HasEndings() const;
     void Begin(Job job, WatchedFolder& folder);
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
     UnderWay* FindUnderWay(std::int64_t id);
@@ -86,7 +92,7 @@ private:
     const Texts& TextsFor(const FolderConfiguration& folder) const;
     void LookAtUpcoming();
     std::size_t WorthwhileJobs() const;
-    unsigned EngineDocuments() const;
+    unsigned EngineDocuments();
 
     void OnProgress(WorkerPool::Ticket ticket, const wxString& step, int percent) override;
     void OnOutcome(WorkerPool::Ticket ticket, Outcome outcome) override;
@@ -102,5 +108,8 @@ private:
     std::vector<Input> m_upcoming;               ///< some of those that are waiting
     std::size_t m_waiting = 0;
     Clock::time_point m_upcomingKnown;
+    Clock::time_point m_lastWork;
+    std::size_t m_begun = 0; ///< since it was quiet
+    unsigned m_engineDocuments = 1;
     WorkerPool m_pool;
 };

@@ -1,5 +1,6 @@
 #include "tests/host/WatchRun.h"
 
+#include <csignal>
 #include <cstdlib>
 
 namespace {
@@ -64,7 +65,9 @@ TEST_F(WatchCrashTest, WhatIsUnderWayOutlastsANewConfiguration) {
     RunningProgram program(QuillonCommand(Watch()));
     AwaitFile(m_folder / "started");
     Configure("on_same_name = 'replace'\n");
-    ASSERT_EQ(std::system(("pkill -HUP -f " + Path("[w]atch.toml")).c_str()), 0);
+    const std::string owner = ReadBytes(m_folder / "in/.quillon-watch-owner");
+    const int process = std::stoi(owner.substr(owner.rfind(' ')));
+    ASSERT_EQ(kill(process, SIGHUP), 0) << owner;
     Await("the new configuration",
           [&program] { return program.Err().find("read anew") != std::string::npos; });
     m_folder.Write("go", "");
