@@ -130,7 +130,10 @@ void WatchService::Reload() {
 /// pass.
 void WatchService::Pass() {
     const Clock::time_point now = Clock::now();
-    m_isDraining = m_isDraining || Interruption::Requested();
+    if (!m_isDraining && Interruption::Requested()) {
+        m_isDraining = true;
+        ServiceManager::TellStopping(DrainingTakes);
+    }
     try {
         if (!m_isDraining && Interruption::ReloadRequested())
             Reload();
