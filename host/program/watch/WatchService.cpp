@@ -194,7 +194,7 @@ void WatchService::LookAfterFolders() {
 void WatchService::Insert(WatchedFolder& folder) {
     std::vector<NewJob> jobs;
     for (SettledFile& file : folder.Watcher().Take())
-        jobs.push_back({folder.Name(), std::move(file.path), std::move(file.inside), file.identity,
+        jobs.push_back({folder.Name(), std::move(file.path), file.inside, file.identity,
                         folder.Configuration()->priority});
     if (jobs.empty())
         return;
