@@ -160,9 +160,13 @@ ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Repor
         };
         page = PageServer::Start(
             configuration->http, openJournal, board, [&service] { service.Wake(); }, fault);
-        if (!page)
+        if (!page && watch.http)
             return reporter.Error(fault);
-        service.SetAudience(&audience.emplace(*page));
+        if (!page) // documents are printed all the same
+            reporter.Error(
+                {wxString::Format(_("there is no page: %s"), fault.Text()), fault.blame});
+        else
+            service.SetAudience(&audience.emplace(*page));
     }
     if (watch.configuration)
         Interruption::ReloadOnHangUp();
