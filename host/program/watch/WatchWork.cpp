@@ -68,12 +68,12 @@ void WatchWork::Step() {
 std::size_t WatchWork::Recover(WatchedFolder& folder) {
     std::size_t count = 0;
     for (Job& job : m_journal.TakeOver(folder.Name(), m_claimant)) {
-        if (UnderWay* const known = FindUnderWay(job.id)) {
+        if (UnderWay* const known = FindUnderWay(job)) {
             known->job.token = job.token; // the folder was away, its document was not
             continue;
         }
         ++count;
-        UnderWay& work = m_ending[job.id];
+        UnderWay& work = m_ending[++m_lastTicket];
         work.folder = folder.Configuration();
         if (!job.workplace.empty())
             work.workplace = Workplace::TakeOver(job.workplace.parent_path());
@@ -87,10 +87,11 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
     return count;
 }
 
-WatchWork::UnderWay* WatchWork::FindUnderWay(std::int64_t id) {
+WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
     for (auto* const works : {&m_underWay, &m_ending})
-        if (const auto found = works->find(id); found != works->end())
-            return &found->second;
+        for (auto& [ticket, work] : *works)
+            if (work.job.id == job.id && work.job.identity == job.identity)
+                return &work;
     return nullptr;
 }
 
@@ -99,8 +100,7 @@ void WatchWork::Sweep(const fs::path& outputFolder) {
     JobQuery query;
     query.state = JobState::Delivering;
     for (const Job& job : m_journal.List(query))
-        if (m_ending.count(job.id) == 0 &&
-            job.workplace.parent_path().parent_path() == outputFolder)
+        if (!FindUnderWay(job) && job.workplace.parent_path().parent_path() == outputFolder)
             return; // its folder's turn comes, or it is watched no more
     Workplace::RemoveAbandoned(outputFolder, Workplace::Kind::OfWatch);
 }
@@ -129,17 +129,17 @@ void WatchWork::Begin(Job job, WatchedFolder& folder) {
     work.shown = {job.id, job.folder, Shown(job.source.filename()), {}, 0, Now()};
     work.job = std::move(job);
     Assignment assignment;
-    const std::int64_t id = work.job.id;
+    const WorkerPool::Ticket ticket = ++m_lastTicket;
     if (const std::optional<Fault> fault = Prepare(work, folder, assignment)) {
         work.outcome.emplace();
         work.outcome->input = work.job.source;
         work.outcome->End(fault->blame == Blame::Document ? State::Refused : State::Failed, *fault,
                           m_filters.ErrorText(fault->code));
-        m_ending.insert_or_assign(id, std::move(work));
+        m_ending.emplace(ticket, std::move(work));
         return;
     }
-    m_underWay.insert_or_assign(id, std::move(work));
-    m_pool.Give(id, std::move(assignment));
+    m_underWay.emplace(ticket, std::move(work));
+    m_pool.Give(ticket, std::move(assignment));
 }
 
 /// Makes what a worker needs.

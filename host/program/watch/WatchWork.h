@@ -82,7 +82,7 @@ private:
     bool HasEndings() const;
     void Begin(Job job, WatchedFolder& folder);
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
-    UnderWay* FindUnderWay(std::int64_t id);
+    UnderWay* FindUnderWay(const Job& job);
     void Sweep(const std::filesystem::path& outputFolder);
     void Decide(UnderWay& work);
     bool End(UnderWay& work);
@@ -103,9 +103,11 @@ private:
     const FilterSet& m_filters;
     const TextsOfLanguages m_texts;
     const Claimant m_claimant;
-    std::map<std::int64_t, UnderWay> m_underWay; ///< with a worker, by the job's id
-    std::map<std::int64_t, UnderWay> m_ending;   ///< no longer with one
-    std::vector<Input> m_upcoming;               ///< some of those that are waiting
+    // By tickets of its own: a journal that is begun anew gives its numbers again.
+    WorkerPool::Ticket m_lastTicket = 0;
+    std::map<WorkerPool::Ticket, UnderWay> m_underWay; ///< with a worker
+    std::map<WorkerPool::Ticket, UnderWay> m_ending;   ///< no longer with one
+    std::vector<Input> m_upcoming;                     ///< some of those that are waiting
     std::size_t m_waiting = 0;
     Clock::time_point m_upcomingKnown;
     Clock::time_point m_lastWork;
