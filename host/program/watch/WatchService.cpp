@@ -62,14 +62,36 @@ ExitCode WatchService::Run() {
             isReady = std::all_of(m_folders.begin(), m_folders.end(),
                                   [](const auto& folder) { return folder.View().hasLooked; });
             if (isReady)
-                ServiceManager::TellReady();
+                TellReady();
         }
+        TellObstacles();
         m_work.Step();
     }
     const ExitCode exitCode = Verdict();
     m_folders.clear();
     m_work.Close();
     return exitCode;
+}
+
+void WatchService::TellReady() {
+    for (const WatchedFolder& folder : m_folders)
+        m_reporter.Line(wxString::Format(_("Watching %s; output goes to %s"),
+                                         Shown(folder.Configuration()->in),
+                                         Shown(folder.Configuration()->out)));
+    ServiceManager::TellReady();
+}
+
+/// Says when a folder's documents wait for something, and when they do no longer.
+void WatchService::TellObstacles() {
+    for (const WatchedFolder& folder : m_folders) {
+        const std::optional<Fault> obstacle = folder.Obstacle();
+        const wxString text = obstacle ? obstacle->Text() : wxString();
+        wxString& told = m_obstacles[folder.Name()];
+        if (text == told)
+            continue;
+        told = text;
+        m_reporter.Line(folder.Name() + ": " + (text.empty() ? _("it goes on") : text));
+    }
 }
 
 /// With a journal that takes nothing, no document comes further.
@@ -207,7 +229,8 @@ void WatchService::TellStatus() {
     WatchStatus status;
     status.started = m_started;
     status.lastPass = m_lastPass;
-    status.journalFault = m_journalFault;
+    if (!m_journalFault.empty())
+        status.journalFault = wxString::Format(_("the journal cannot be used: %s"), m_journalFault);
     status.draining = m_isDraining;
     for (const WatchedFolder& folder : m_folders)
         status.folders.push_back(folder.Status());
@@ -215,7 +238,7 @@ void WatchService::TellStatus() {
     wxString line = wxString::Format(_("%zu under way, %zu done, %zu failed"),
                                      status.running.size(), m_done, m_failed);
     if (!m_journalFault.empty())
-        line << "; " << wxString::Format(_("the journal cannot be used: %s"), m_journalFault);
+        line << "; " << status.journalFault;
     for (const FolderStatus& folder : status.folders)
         if (!folder.obstacle.empty())
             line << "; " << folder.configuration.name << ": " << folder.obstacle;

@@ -49,6 +49,8 @@ private:
     void Pass();
     void LookAfterFolders();
     void Insert(WatchedFolder& folder);
+    void TellReady();
+    void TellObstacles();
     void TellStatus();
     void ShowProgress(const std::vector<RunningDocument>& running);
     bool IsDone() const;
@@ -74,7 +76,8 @@ private:
     Clock::time_point m_told;
     Clock::time_point m_removedOld;
     wxString m_journalFault;
-    bool m_mustForget = false; ///< what was found may not be in the journal
+    std::map<wxString, wxString> m_obstacles; ///< that have been told, by folder
+    bool m_mustForget = false;                ///< what was found may not be in the journal
     bool m_isDraining = false;
     bool m_isOver = false; ///< with `once`
     std::size_t m_done = 0;
