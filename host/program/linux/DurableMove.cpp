@@ -41,7 +41,7 @@ std::error_code SyncFile(const fs::path& file) {
 
 std::error_code MoveWithoutReplacing(const fs::path& from, const fs::path& to) {
     std::error_code error = Sync(from, 0);
-    if (error)
+    if (error && error != std::errc::permission_denied) // not ours to read, nor to write out
         return error;
     if (renameat2(AT_FDCWD, from.c_str(), AT_FDCWD, to.c_str(), RENAME_NOREPLACE) == 0)
         return {};

@@ -13,7 +13,8 @@ std::error_code LastError() {
 }
 
 std::error_code Move(const fs::path& from, const fs::path& to, DWORD flags) {
-    if (const std::error_code error = SyncFile(from))
+    const std::error_code error = SyncFile(from);
+    if (error && error.value() != ERROR_ACCESS_DENIED) // not ours to write, nor to write out
         return error;
     return MoveFileExW(from.c_str(), to.c_str(), flags | MOVEFILE_WRITE_THROUGH) ? std::error_code()
                                                                                  : LastError();
