@@ -101,7 +101,7 @@ void TellFolder(const wxString& folder, const FolderCounts& counts, bool paused,
         record[NameOf(state)] = jobs;
         if (jobs > 0)
             line << (line.empty() ? "" : ", ")
-                 << wxString::Format("%zu %s", jobs, wxGetTranslation(NameOf(state)));
+                 << wxString::Format(_("%zu %s"), jobs, wxGetTranslation(NameOf(state)));
     }
     record["oldestWaiting"] = TimeOf(counts.oldestWaiting.value_or(JournalTime()));
     record["paused"] = paused;

@@ -46,7 +46,8 @@ void WriteReason(Html& html, const Job& job, const Texts& texts) {
     if (!job.fault)
         return;
     if (!job.fault->advice.empty())
-        html << "<p>" << OneLine(job.fault->advice) << ".</p>\n";
+        html << "<p>" << wxString::Format(texts(wxTRANSLATE("%s.")), OneLine(job.fault->advice))
+             << "</p>\n";
     html << "<p class=\"quiet\">"
          << wxString::Format(texts(wxTRANSLATE("Code %d: %s")), job.fault->code, OneLine(job.text))
          << "</p>\n";

@@ -15,12 +15,13 @@ wxString TimeText(JournalTime time) {
 }
 
 /// As a sentence of its own.
-wxString Sentence(const wxString& text) {
+wxString Sentence(const wxString& text, const Texts& texts) {
     wxString sentence = OneLine(text);
     if (sentence.empty())
         return sentence;
     sentence[0] = wxToupper(sentence[0]);
-    return sentence.EndsWith(".") ? sentence : sentence + '.';
+    return sentence.EndsWith(".") ? sentence
+                                  : wxString::Format(texts(wxTRANSLATE("%s.")), sentence);
 }
 
 wxString ReasonOf(const Job& job) {
@@ -42,9 +43,9 @@ std::string NoteFor(const Job& job, const fs::path& in, const Texts& texts) {
     const auto line = [&note, &eol](const wxString& text) { note << text << eol; };
     line(wxString::Format(texts(wxTRANSLATE("%s could not be printed.")), name));
     line({});
-    line(Sentence(ReasonOf(job)));
+    line(Sentence(ReasonOf(job), texts));
     if (job.fault && !job.fault->advice.empty())
-        line(Sentence(job.fault->advice));
+        line(Sentence(job.fault->advice, texts));
     line({});
     line(wxString::Format(
         texts(wxTRANSLATE("What to do: open it in its application, mend it, save it, and put it "
