@@ -50,6 +50,15 @@ TEST_F(WatchCheckTest, SaysThatThePageCannotBeShown) {
     EXPECT_THAT(run.Records("problem")[0]["text"].get<std::string>(), HasSubstr("192.0.2.1:9188"));
 }
 
+TEST_F(WatchCheckTest, WithoutAFilterThereIsNoWatch) {
+    const std::string empty = (m_folder / "kept").u8string();
+    const RunResult run =
+        RunProgram({QUILLON_PROGRAM, "watch", (m_folder / "in").u8string(), "--out",
+                    (m_folder / "out").u8string(), "--once", "--filters", empty});
+    EXPECT_EQ(run.exitCode, 2);
+    EXPECT_THAT(run.err, HasSubstr("no filter could be loaded"));
+}
+
 TEST_F(WatchCheckTest, SaysWhatIsInTheWay) {
     const auto make = [this](const char* name) { m_folder.Write(name, "something else"); };
     const struct {

@@ -1,6 +1,7 @@
 #include "host/program/base/PathText.h"
 #include "host/program/commands/Command.h"
 #include "host/program/page/PageServer.h"
+#include "host/program/report/Readiness.h"
 #include "host/program/system/Interruption.h"
 #include "host/program/watch/ConfigurationCheck.h"
 #include "host/program/watch/FolderLock.h"
@@ -146,6 +147,8 @@ ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Repor
     const FilterSet filters(options.FiltersFolder());
     if (watch.check)
         return TellCheck(*configuration, filters, reporter, FindObstacleOfPage(*configuration));
+    if (const std::optional<Fault> missing = FindMissingFilter(filters))
+        return reporter.Error(*missing);
     const std::unique_ptr<Journal> journal = OpenJournal(configuration->journal, fault);
     if (!journal)
         return reporter.Error(fault);

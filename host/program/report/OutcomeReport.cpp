@@ -2,6 +2,7 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
+#include "host/program/report/Readiness.h"
 #include "host/services/OneLine.h"
 
 #include <wx/intl.h>
@@ -165,10 +166,8 @@ ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
 
 std::optional<ExitCode> EndIdleRun(const FilterSet& filters, const std::vector<Input>& inputs,
                                    Reporter& reporter) {
-    if (filters.Filters().empty())
-        return reporter.Error({_("no filter could be loaded; `quillon status` shows where they are "
-                                 "looked for. Install the program anew"),
-                               Blame::Machine});
+    if (const std::optional<Fault> fault = FindMissingFilter(filters))
+        return reporter.Error(*fault);
     if (inputs.empty()) {
         reporter.Line(_("Nothing to do: there are no files directly in what was named."));
         return ExitCode::Done;

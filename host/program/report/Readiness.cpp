@@ -43,6 +43,14 @@ std::vector<Fault> FindObstacles(const FilterSet& filters) {
 
 } // namespace
 
+std::optional<Fault> FindMissingFilter(const FilterSet& filters) {
+    if (!filters.Filters().empty())
+        return std::nullopt;
+    return Obstacle(
+        _("no filter could be loaded; `quillon status` shows where they are looked for. "
+          "Install the program anew"));
+}
+
 std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation) {
     std::vector<Fault> missing;
     if (ListConvertible(filters).empty())

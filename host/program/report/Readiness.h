@@ -3,6 +3,9 @@
 #include "host/program/filters/FilterSet.h"
 #include "host/program/report/Reporter.h"
 
+/// Whether there is no filter at all, without which no document can be looked at.
+std::optional<Fault> FindMissingFilter(const FilterSet& filters);
+
 /// What is missing to convert documents at all, or to make PDF files of them.
 /// @param requireIsolation whether documents must be kept from the rest of the machine
 std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation);
