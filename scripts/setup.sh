@@ -19,7 +19,10 @@ run_packages=(
     ghostscript
     fonts-liberation fonts-dejavu-core fonts-crosextra-carlito fonts-crosextra-caladea
 )
-test_packages=(libgtest-dev libgmock-dev poppler-utils xvfb xauth)
+test_packages=(
+    libgtest-dev libgmock-dev poppler-utils xvfb xauth
+    cups-daemon cups-client cups-core-drivers cups-filters-core-drivers cups-ipp-utils dbus-daemon
+)
 # The compiler and the zlib for Windows, Wine, and what builds the other libraries from source.
 windows_packages=(
     g++-mingw-w64-x86-64-posix gcc-mingw-w64-x86-64-posix libz-mingw-w64 libz-mingw-w64-dev

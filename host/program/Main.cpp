@@ -50,6 +50,8 @@ std::optional<Fault> CheckIsolation(const CommonOptions& options) {
 ExitCode Run(const CommandLine& line) {
     const auto& [options, command] = line;
     Reporter reporter(options.json, options.quiet);
+    if (command.isFilter)
+        reporter.SpeakToSpooler();
     const bool hasLog = StartLog(options);
     if (const auto fault = StartLanguage(options))
         return reporter.Error(*fault);
@@ -58,7 +60,8 @@ ExitCode Run(const CommandLine& line) {
             {wxString::Format(_("the log file %s cannot be written; choose another one with --log"),
                               Shown(FromArgument(*options.logFile))),
              Blame::Usage});
-    Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
+    if (!command.isFilter)
+        Interruption::SetNote(_("finishing what is under way; a second Ctrl-C ends at once"));
     if (command.needsMachine)
         SetUpMachine({options.StandInsFolder(), options.stallSeconds, options.limitSeconds,
                       options.memoryMegabytes,

@@ -17,6 +17,7 @@ struct Command {
     bool showsWindows = false;
     bool examinesEngine = false; ///< says how the engine can be run
     bool isWorker = false;       ///< another process of this program decides when it ends
+    bool isFilter = false;       ///< a spooler calls it, reads what it says, and ends it at once
 };
 
 /// Adds a command with its options to the program's.
@@ -31,6 +32,10 @@ AddCommand AddStatus;
 AddCommand AddScreen;
 /// `quillon convert`: converts documents into a folder.
 AddCommand AddConvert;
+/// `quillon filter`: converts a document that a print server spools.
+AddCommand AddFilter;
+/// `quillon print-server`: has the print server of the system call that, or not.
+AddCommand AddPrintServer;
 /// `quillon settings`: shows the filters' settings panels in a window, and stores what is chosen.
 AddCommand AddSettings;
 /// `quillon watch`: converts what comes into folders.
@@ -47,5 +52,6 @@ AddCommand AddResume;
 AddCommand AddWorker;
 
 /// All of them, in the order of the help.
-constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen, AddConvert, AddWatch,    AddQueue,
-                                       AddRetry,  AddPause,  AddResume,  AddSettings, AddWorker};
+constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen,      AddConvert,  AddWatch,
+                                       AddQueue,  AddRetry,       AddPause,    AddResume,
+                                       AddFilter, AddPrintServer, AddSettings, AddWorker};

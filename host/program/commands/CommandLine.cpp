@@ -137,6 +137,22 @@ std::vector<std::string> ArgumentsFor(const CLI::App& app, const std::vector<std
     return arguments;
 }
 
+/// Takes the words with which a spooler calls a filter off the arguments: a title is anything, and
+/// no option. Fewer of them are a person's.
+std::vector<std::string> TakeSpoolerWords(const CLI::App& app,
+                                          std::vector<std::string>& arguments) {
+    constexpr std::size_t Fewest = 5;
+    std::size_t command = 0;
+    while (command < arguments.size() && arguments[command].rfind('-', 0) == 0)
+        command += TakesValue(app, arguments[command]) ? 2 : 1;
+    if (command + Fewest >= arguments.size() || arguments[command] != "filter")
+        return {};
+    const auto first = arguments.begin() + static_cast<std::ptrdiff_t>(command + 1);
+    std::vector<std::string> words(first, arguments.end());
+    arguments.erase(first, arguments.end());
+    return words;
+}
+
 /// CLI11 shows the help of the one command that was given; ours is one text, and says it all.
 std::string HelpOf(CLI::App& app) {
     app.clear();
@@ -154,8 +170,7 @@ std::string FirstScreenOf(CLI::App& app) {
 
 } // namespace
 
-std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& arguments,
-                                           int& exitCode) {
+std::optional<CommandLine> ReadCommandLine(std::vector<std::string> arguments, int& exitCode) {
     CommandLine line;
     CLI::App app(Description, "quillon");
     app.set_help_flag("-h,--help", "Print this help");
@@ -163,6 +178,7 @@ std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& argum
     app.footer(Notes + SettingsTable() + ExitCodes);
     AddCommonOptions(app, line.options);
     AddCommands(app, line.command);
+    line.options.spoolerWords = TakeSpoolerWords(app, arguments);
     try {
         if (arguments.empty())
             throw CLI::RequiredError("A command");

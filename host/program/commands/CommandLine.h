@@ -16,5 +16,4 @@ struct CommandLine {
 /// @param arguments without the program's name
 /// @param exitCode receives the code to end with when there is no result
 /// @return nothing when there is no command to run
-std::optional<CommandLine> ReadCommandLine(const std::vector<std::string>& arguments,
-                                           int& exitCode);
+std::optional<CommandLine> ReadCommandLine(std::vector<std::string> arguments, int& exitCode);

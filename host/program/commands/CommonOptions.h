@@ -27,6 +27,8 @@ struct CommonOptions {
     std::optional<unsigned> engineDocuments; ///< until an engine is started anew
     std::optional<std::string> filtersFolder;
     std::optional<std::string> standInsFolder;
+    std::vector<std::string>
+        spoolerWords; ///< what stands behind `filter`, where a spooler calls it
 
     /// The folders to use, absolute.
     std::filesystem::path FiltersFolder() const;

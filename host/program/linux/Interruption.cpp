@@ -61,6 +61,13 @@ void Interruption::Install() {
     IgnoreFailedWrites();
 }
 
+void Interruption::EndAtOnce() {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP})
+        Handle(signal, SIG_DFL);
+    if (Requested())
+        std::raise(SIGTERM);
+}
+
 void Interruption::SetNote(const wxString& note) {
     static std::string s_line;
     g_note = nullptr;

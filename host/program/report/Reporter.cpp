@@ -16,6 +16,14 @@ Reporter::Reporter(bool json, bool quiet)
     : m_json(json), m_quiet(quiet), m_people(json ? stderr : stdout),
       m_forTerminal(IsTerminal(m_people) && !quiet) {}
 
+void Reporter::SpeakToSpooler() {
+    m_json = false;
+    m_people = stderr;
+    m_forTerminal = false;
+    m_lineMark = "INFO: ";
+    m_errorMark = "ERROR: ";
+}
+
 void Reporter::ClearPassing() {
     if (m_passing)
         Write(m_people, "\r\x1b[K");
@@ -26,7 +34,7 @@ void Reporter::Line(const wxString& text) {
     if (m_quiet)
         return;
     ClearPassing();
-    Write(m_people, text.utf8_string() + '\n');
+    Write(m_people, m_lineMark + text.utf8_string() + '\n');
 }
 
 void Reporter::Passing(const wxString& text) {
@@ -46,7 +54,7 @@ void Reporter::Record(const Json& record) {
 ExitCode Reporter::Error(const Fault& fault) {
     const wxString text = fault.Text();
     ClearPassing();
-    Write(stderr, "quillon: " + OneLine(text).utf8_string() + '\n');
+    Write(stderr, m_errorMark + OneLine(text).utf8_string() + '\n');
     Record({{"type", "error"}, {"text", JsonText(text)}});
     return ExitCodeFor(fault);
 }

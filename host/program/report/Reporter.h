@@ -14,6 +14,10 @@ public:
     /// @param quiet whether only errors and records are written
     explicit Reporter(bool json, bool quiet = false);
 
+    /// From now on a spooler reads stderr, and all that is written goes there, marked with what it
+    /// is as spoolers want it.
+    void SpeakToSpooler();
+
     /// A line for people.
     void Line(const wxString& text);
 
@@ -39,6 +43,8 @@ private:
     std::FILE* m_people;
     bool m_forTerminal;
     bool m_passing = false;
+    std::string m_lineMark;
+    std::string m_errorMark = "quillon: ";
 };
 
 /// A text as JSON takes it.

@@ -12,6 +12,10 @@ void Install();
 /// What is said on standard error, in a line of its own, when such a request is noted.
 void SetNote(const wxString& note);
 
+/// From now on, after Install, such a request ends the process at once, as one that has been noted
+/// does now.
+void EndAtOnce();
+
 /// For a process that another one of this program has started: the other one decides, and such
 /// requests, which a terminal sends to both, mean nothing here.
 void LeaveToParent();

@@ -53,6 +53,12 @@ void Interruption::Install() {
     SetConsoleCtrlHandler(OnRequest, TRUE);
 }
 
+void Interruption::EndAtOnce() {
+    SetConsoleCtrlHandler(OnRequest, FALSE);
+    if (Requested())
+        EndThisProcess(static_cast<int>(STATUS_CONTROL_C_EXIT));
+}
+
 void Interruption::SetNote(const wxString& note) {
     static std::string s_line;
     g_note = nullptr;
