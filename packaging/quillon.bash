@@ -14,6 +14,7 @@ _quillon_options() {
     queue) printf '%s ' --config --journal --folder --state --limit ;;
     retry) printf '%s ' --config --journal --folder --failed ;;
     pause | resume) printf '%s ' --config --journal ;;
+    print-server) printf '%s ' --cups-server-root --cups-server-bin ;;
     esac
 }
 
@@ -46,14 +47,15 @@ _quillon_choose_files() {
 
 _quillon() {
     local current=$2 previous=$3 command='' word
-    local commands=$'convert\npause\nqueue\nresume\nretry\nscreen\nsettings\nstatus\nwatch'
+    local commands=$'convert\nfilter\npause\nprint-server\nqueue\nresume\nretry\nscreen'
+    commands+=$'\nsettings\nstatus\nwatch'
     for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
         [[ -n $word && $'\n'$commands$'\n' == *$'\n'"$word"$'\n'* ]] && command=$word && break
     done
 
     case $previous in
     --lang) _quillon_choose $'de\nen\nes\nfr\nja' "$current" ;;
-    --out | -o | --filters | --stand-ins) _quillon_choose_files -d "$current" ;;
+    --out | -o | --filters | --stand-ins | --cups-server-*) _quillon_choose_files -d "$current" ;;
     --config | --journal | --log | --settings) _quillon_choose_files -f "$current" ;;
     --profile)
         compopt -o filenames
@@ -73,6 +75,8 @@ _quillon() {
             _quillon_choose "$(_quillon_options "$command" | tr ' ' '\n')" "$current"
         elif [[ -z $command ]]; then
             _quillon_choose "$commands" "$current"
+        elif [[ $command == print-server ]]; then
+            _quillon_choose $'install\nremove\nstatus' "$current"
         elif [[ $command == @(convert|screen|watch) ]]; then
             _quillon_choose_files -f "$current"
         fi

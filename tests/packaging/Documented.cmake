@@ -6,7 +6,7 @@ execute_process(COMMAND "${QUILLON}" --help OUTPUT_VARIABLE help COMMAND_ERROR_I
 string(REGEX MATCHALL "--[a-z][a-z-]+" options "${help}")
 string(REGEX MATCHALL "\n  [A-Z]+   *" settings "${help}")
 string(REGEX REPLACE ".*\nSubcommands:\n(.*)\n\n\n.*" "\\1" commands "${help}")
-string(REGEX MATCHALL "(^|\n)[a-z]+" commands "${commands}")
+string(REGEX MATCHALL "(^|\n)[a-z-]+" commands "${commands}")
 foreach(list options settings commands)
     list(TRANSFORM ${list} STRIP)
     list(REMOVE_DUPLICATES ${list})

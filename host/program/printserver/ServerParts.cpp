@@ -20,8 +20,8 @@ namespace {
 constexpr const char* Mark =
     "# Made by `quillon print-server install`, and taken out by `quillon print-server remove`.\n";
 
-/// The rules for names with an ending as people write it. CUPS has sets of letters for this, but 2.4
-/// does not take them.
+/// The rules for names with an ending as people write it. CUPS has sets of letters for this,
+/// but 2.4 does not take them.
 std::string RulesFor(const std::string& ending) {
     std::string capital = ending;
     std::string first = ending;

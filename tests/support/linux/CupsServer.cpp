@@ -18,7 +18,7 @@ namespace {
 constexpr const char* Program = "/usr/sbin/cupsd";
 constexpr uid_t Nobody = 65534;
 
-constexpr const char* Configuration = R"(LogLevel debug
+constexpr const char* Configuration = R"(LogLevel info
 MaxLogSize 0
 Listen @/socket
 Browsing No
