@@ -14,7 +14,7 @@ namespace {
 wxString Plain(const wxString& text) {
     wxString plain;
     for (const wxUniChar letter : text.Upper())
-        if (letter != ' ' && letter != '-' && letter != '_')
+        if (wxString(" -_").find(letter) == wxString::npos)
             plain += letter;
     return plain;
 }

@@ -120,6 +120,7 @@ void CupsServer::Start() {
         words.insert(words.begin(), {"/usr/bin/setpriv", "--reuid", user, "--regid", user,
                                      "--clear-groups", "--"});
     std::vector<char*> arguments;
+    arguments.reserve(words.size() + 1);
     for (std::string& word : words)
         arguments.push_back(word.data());
     arguments.push_back(nullptr);
