@@ -19,5 +19,7 @@ Writers AskForWriters(const std::filesystem::path& file) {
 }
 
 WritersKnown WritersKnownIn(const std::filesystem::path& folder) {
-    return IsShare(folder) ? WritersKnown::OfNone : WritersKnown::OfAll;
+    std::error_code error;
+    const bool isLocal = std::filesystem::is_directory(folder, error) && !IsShare(folder);
+    return isLocal ? WritersKnown::OfAll : WritersKnown::OfNone;
 }
