@@ -3,6 +3,8 @@
 #include "host/program/filters/FilterSet.h"
 #include "host/program/report/Reporter.h"
 
+#include <optional>
+
 /// Whether there is no filter at all, without which no document can be looked at.
 std::optional<Fault> FindMissingFilter(const FilterSet& filters);
 
