@@ -45,7 +45,7 @@ std::optional<Fault> FindForeign(const std::vector<ServerPart>& parts) {
     if (foreign == parts.end())
         return std::nullopt;
     return Fault{wxString::Format(_("%s is not this program's"), Shown(foreign->path)),
-                 Blame::Usage, ConversionFailed, _("nothing was changed; move it away first")};
+                 Blame::Usage, ConversionFailed, _("Nothing was changed; move it away first")};
 }
 
 ExitCode TellStatus(const std::vector<ServerPart>& parts, Reporter& reporter) {

@@ -95,7 +95,7 @@ public:
         return Fault{
             wxString::Format(_("the option %s cannot be \"%s\""), Shown(FromArgument(name)),
                              Shown(FromArgument(value)).Left(LongestShown)),
-            Blame::Usage, ConversionFailed, wxString::Format(_("it can be: %s"), ListOf(setting))};
+            Blame::Usage, ConversionFailed, wxString::Format(_("It can be: %s"), ListOf(setting))};
     }
 
     std::vector<std::string> Result() && { return std::move(m_assignments); }

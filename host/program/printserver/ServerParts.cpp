@@ -63,7 +63,7 @@ std::string FilterText(const fs::path& program) {
 Fault NotWritten(const fs::path& path, const std::error_code& error) {
     return {wxString::Format(_("%s cannot be written: %s"), Shown(path), Because(error)),
             Blame::Machine, ConversionFailed,
-            error == std::errc::permission_denied ? _("run it as root") : wxString()};
+            error == std::errc::permission_denied ? _("Run it as root") : wxString()};
 }
 
 std::error_code Write(const fs::path& path, const std::string& text) {
