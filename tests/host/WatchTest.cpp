@@ -18,7 +18,7 @@ TEST_F(WatchTest, WhatIsDroppedInComesOutOnceAndWhatCannotIsToldWhy) {
     Put("bad.doc", "convert=1020");
     Put("notes.txt", "nobody's");
     Put("moved/in/deep.doc");
-    Configure();
+    Configure("retries = ['1h']\n"); // longer than this run takes anywhere
     const RunResult run = WatchOnce();
     EXPECT_EQ(run.exitCode, 1) << run.err;
     EXPECT_THAT(FilesIn("out"), ElementsAre("letter.ps", "moved/in/deep.ps"));
