@@ -193,8 +193,9 @@ void WatchService::Pass() {
 }
 
 void WatchService::LookAfterFolders() {
+    std::error_code none; // then engines have none either, and say so
     const std::optional<Fault> shortage = FindShortage(
-        {fs::temp_directory_path(), FromArgument(m_configuration.journal).parent_path()},
+        {fs::temp_directory_path(none), FromArgument(m_configuration.journal).parent_path()},
         m_configuration.minFree);
     if (std::exchange(m_mustForget, false))
         for (WatchedFolder& folder : m_folders)
