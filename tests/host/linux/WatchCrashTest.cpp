@@ -88,6 +88,8 @@ TEST_F(WatchCrashTest, AndWhereverItDiesWhenItStartsAgain) {
         for (int step = 1; DieAt(step) && !HasFailure(); step += 2)
             ;
         WatchOnce();
+        Ask({"retry", "--failed"}); // a document that has ended it three times waits for a person
+        WatchOnce();
         ExpectAllDoneOnce("ended before step " + std::to_string(first) +
                           ", and then before others");
     }
