@@ -7,7 +7,6 @@ namespace {
 namespace fs = std::filesystem;
 using nlohmann::json;
 using testing::ElementsAre;
-using testing::IsEmpty;
 
 class WatchTest : public WatchRun {};
 

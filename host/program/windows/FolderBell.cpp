@@ -41,9 +41,11 @@ public:
                 return true;
             m_folders.erase(known);
         }
+        if (!error && LiesInWatched(folder))
+            return true;
         if (error || m_folders.size() == MostFolders)
             return false;
-        HANDLE changes = FindFirstChangeNotificationW(folder.c_str(), FALSE, InFolder);
+        HANDLE changes = FindFirstChangeNotificationW(folder.c_str(), TRUE, InFolder);
         if (changes == INVALID_HANDLE_VALUE)
             return false;
         m_folders.emplace(folder, Watched{{changes, FindCloseChangeNotification}, identity});
@@ -68,6 +70,16 @@ public:
     void Ring() { SetEvent(m_rung.get()); }
 
 private:
+    /// Whether a folder above it rings for it. It has no handle of its own then, with which it
+    /// could not be removed.
+    bool LiesInWatched(const fs::path& folder) const {
+        for (fs::path above = folder.parent_path(); above != above.parent_path();
+             above = above.parent_path())
+            if (m_folders.count(above) != 0)
+                return true;
+        return false;
+    }
+
     /// Has all that have rung ready to ring again.
     void TakeChanges() {
         WaitForSingleObject(m_rung.get(), 0);
