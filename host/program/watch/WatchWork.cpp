@@ -296,7 +296,10 @@ std::size_t WatchWork::WorthwhileJobs() const {
 /// Engines are kept when many documents wait, and from then on; so they are while one comes after
 /// the other, until it is quiet.
 unsigned WatchWork::EngineDocuments() {
-    const std::size_t documents = std::max(m_waiting + m_pool.Busy() + 1, ++m_begun);
+    std::size_t coming = m_waiting + m_pool.Busy() + 1;
+    for (const WatchedFolder& folder : m_folders)
+        coming += folder.View().settling;
+    const std::size_t documents = std::max(coming, ++m_begun);
     m_engineDocuments =
         std::max(m_engineDocuments, WorthwhileEngineDocuments(documents, WorthwhileJobs()));
     return m_means.engineDocuments.value_or(m_engineDocuments);
