@@ -36,8 +36,7 @@ public:
     void Wake() { m_work.Wake(); }
 
     /// @return 0 when it was asked to end; with `once` the code that `convert` would end with; 3
-    /// when
-    ///     somebody else watches one of the folders
+    ///     when somebody else watches one of the folders
     ExitCode Run();
 
 private:
