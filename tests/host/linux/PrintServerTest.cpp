@@ -7,7 +7,6 @@
 #include <fstream>
 
 namespace fs = std::filesystem;
-using testing::EndsWith;
 using testing::StartsWith;
 
 namespace {
