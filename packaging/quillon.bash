@@ -66,7 +66,7 @@ _quillon() {
         _quillon_choose "$(_quillon_settings | tr ' ' '\n')" "$current"
         ;;
     --state)
-        _quillon_choose $'waiting\nconverting\ndelivering\nfinished\narchived\nfailed\nvanished' \
+        _quillon_choose $'waiting\nconverting\nsubmitting\nprinting\ndelivering\nfinished\narchived\nfailed\nvanished' \
             "$current"
         ;;
     --engine-* | --folder | --http | --jobs | -j | --limit | --memory-limit | --printer) ;; # only the user knows

@@ -142,7 +142,6 @@ TEST_F(WatchConfigurationTest, AWrongOneIsToldWithItsPlace) {
         {folder + "set = { SLIDESPERPAGE = 5 }\n", ":4:25: ", R"("4", "6", "9")"},
         {folder + "set = { COLOR = \"Pink\" }\n", ":4:17: ", "\"Grayscale\""},
         {folder + "set = \"COLOR=Grayscale\"\n", ":4:7: ", "a table"},
-        {folder + "[folder.print]\nqueue = \"ps0\"\n", ":4:", "not available yet"},
         {folder + folder, ":4:1: ", "another folder with the name \"in\""},
         {folder + folder + "name = \"b\"\n", ":2:6: ", "the folder \"b\" has the same one"},
         {folder + "[[folder]]\nin = \"in/processed\"\nout = \"out\"\n",

@@ -11,8 +11,9 @@
 namespace {
 
 constexpr JobState AllStates[] = {
-    JobState::Waiting,  JobState::Converting, JobState::Delivering, JobState::Finished,
-    JobState::Archived, JobState::Failed,     JobState::Vanished,
+    JobState::Waiting,    JobState::Converting, JobState::Submitting,
+    JobState::Printing,   JobState::Delivering, JobState::Finished,
+    JobState::Archived,   JobState::Failed,     JobState::Vanished,
 };
 
 wxDateTime DateOf(JournalTime time) {
@@ -52,6 +53,11 @@ wxString LineOf(const Job& job) {
         line << ", " << wxString::Format(_("next try %s"), LocalTime(job.due));
     if (job.state == JobState::Converting)
         line << ", " << wxString::Format(_("since %s"), LocalTime(job.begun));
+    if (job.print.number > 0)
+        line << ", "
+             << wxString::Format(_("job %d of %s"), job.print.number, OneLine(job.print.queue));
+    if (!job.print.message.empty())
+        line << ", " << OneLine(job.print.message);
     if (job.fault)
         line << ", " << job.fault->code << ' ' << OneLine(job.text) << " ("
              << OneLine(ReasonOf(job)) << ')';
@@ -62,6 +68,16 @@ Json FaultOf(const Job& job) {
     if (!job.fault)
         return {};
     return job.fault->blame == Blame::Document ? "document" : "machine";
+}
+
+Json PrintOf(const PrintOrder& order) {
+    if (order.number == 0)
+        return {};
+    return {{"server", JsonText(order.server)},
+            {"queue", JsonText(order.queue)},
+            {"job", order.number},
+            {"held", order.held},
+            {"message", JsonText(order.message)}};
 }
 
 Json RecordOf(const Job& job) {
@@ -78,6 +94,7 @@ Json RecordOf(const Job& job) {
             {"ended", TimeOf(job.ended)},
             {"seconds", std::round(job.seconds * 1000.0) / 1000.0},
             {"output", job.output.empty() ? Json() : Json(job.output.u8string())},
+            {"print", PrintOf(job.print)},
             {"code", job.fault ? job.fault->code : 0},
             {"text", JsonText(job.text)},
             {"reason", JsonText(ReasonOf(job))},

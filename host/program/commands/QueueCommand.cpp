@@ -16,8 +16,9 @@ struct QueueOptions {
 };
 
 /// What people wait for comes last, where it is read first.
-constexpr JobState ShownStates[] = {JobState::Waiting, JobState::Converting, JobState::Delivering,
-                                    JobState::Finished, JobState::Failed};
+constexpr JobState ShownStates[] = {JobState::Waiting, JobState::Converting, JobState::Submitting,
+                                    JobState::Printing, JobState::Delivering, JobState::Finished,
+                                    JobState::Failed};
 
 /// Whether a document stays in the state.
 bool IsLast(JobState state) {
@@ -97,8 +98,8 @@ void AddQueue(CLI::App& program, Command& chosen) {
     queue.add_option("--folder", given->folder, "Only this folder")->type_name("NAME");
     queue
         .add_option("--state", given->state,
-                    "Only documents in this state: waiting, converting, delivering, finished,\n"
-                    "archived, failed, vanished")
+                    "Only documents in this state: waiting, converting, submitting,\n"
+                    "printing, delivering, finished, archived, failed, vanished")
         ->type_name("STATE")
         ->check(CheckState);
     queue

@@ -13,6 +13,8 @@
 enum class JobState {
     Waiting,    ///< for its turn
     Converting, ///< a worker has it
+    Submitting, ///< converted; its output is being given to a print server
+    Printing,   ///< the print server has it
     Delivering, ///< converted; its output is being moved from its workplace to its place
     Finished,   ///< its output is in its place; its source is still to be put away
     Archived,   ///< done with
@@ -22,6 +24,16 @@ enum class JobState {
 
 /// The journal's clock: the system's, or that of the server that keeps the journal.
 using JournalTime = std::chrono::system_clock::time_point;
+
+/// What a print server has of a document, or is to have.
+struct PrintOrder {
+    wxString server; ///< its address; with the number
+    wxString queue;  ///< likewise
+    int number = 0;  ///< of the job there; 0 for none yet
+    wxString uuid;   ///< tells it from another one that gets the same number
+    bool held = false; ///< it waits there for a person: the server had lost it once
+    wxString message;  ///< what the server says of it, in its own words; or empty
+};
 
 /// A document that was found in a watched folder, and what has become of it. A value: a change is
 /// in the journal when it is committed.
@@ -49,12 +61,24 @@ struct Job {
 
     std::filesystem::path aside; ///< where its source is to be put away, or has been; or empty
 
+    PrintOrder print;
+
     std::optional<Fault> fault; ///< of its last attempt
     wxString text;              ///< the message of the fault's code
 
     wxString claimedBy;     ///< who has it, or had it last
     std::int64_t token = 0; ///< grows with each claim: whoever has an old one has the job no more
 };
+
+/// Whether it is to be printed by a print server, or there already.
+constexpr bool IsAtPrinter(JobState state) {
+    return state == JobState::Submitting || state == JobState::Printing;
+}
+
+/// Whether its output lies in its workplace yet.
+constexpr bool HasProduct(JobState state) {
+    return IsAtPrinter(state) || state == JobState::Delivering;
+}
 
 /// The state's name, as journal and records have it, and people in their language.
 const char* NameOf(JobState state);

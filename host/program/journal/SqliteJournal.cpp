@@ -8,7 +8,8 @@
 
 namespace {
 
-constexpr const char* IsUnderWay = "state IN ('converting', 'delivering')";
+constexpr const char* IsUnderWay =
+    "state IN ('converting', 'submitting', 'printing', 'delivering')";
 
 /// What the query asks for, after WHERE. States and whether a job is open are written out: by them
 /// SQLite knows which of its indexes serve.
@@ -150,8 +151,8 @@ std::vector<Job> SqliteJournal::TakeOver(const wxString& folder, const Claimant&
         SqliteStatement row(
             database,
             std::string("UPDATE job SET token=token+1, claimed_by=?2, lease_until=?3 WHERE "
-                        "folder=?1 AND state IN ('converting', 'delivering', 'finished', 'failed') "
-                        "AND (open=1 OR ")
+                        "folder=?1 AND state IN ('converting', 'submitting', 'printing', "
+                        "'delivering', 'finished', 'failed') AND (open=1 OR ")
                 .append(IsUnderWay)
                 .append(") RETURNING ")
                 .append(JobColumns),
@@ -209,7 +210,8 @@ bool SqliteJournal::Retry(std::int64_t id) {
             database,
             "UPDATE job SET state='waiting', open=1, attempts=0, deaths=0, inserted=?2, due=?2, "
             "changed=?2, begun=0, ended=0, seconds=0, workplace=x'', product='', output=x'', "
-            "aside=x'', fault_blame='', fault='', fault_code=0, fault_advice='', text='', "
+            "aside=x'', print_server='', print_queue='', print_number=0, print_uuid='', "
+            "print_held=0, print_message='', fault_blame='', fault='', fault_code=0, fault_advice='', text='', "
             "token=token+1 "
             "WHERE id=?1 AND state='failed' AND open=0 AND NOT EXISTS (SELECT 1 FROM job AS other "
             "WHERE other.open=1 AND other.device=job.device AND other.number=job.number AND "

@@ -91,6 +91,13 @@ wxString ConfigurationValue::AsText() const {
     return Text();
 }
 
+bool ConfigurationValue::Flag() const {
+    const auto flag = m_node->value_exact<bool>();
+    if (!flag)
+        Refuse(_("it must be true or false"));
+    return *flag;
+}
+
 std::int64_t ConfigurationValue::Number(std::int64_t least, std::int64_t most) const {
     const auto number = m_node->value_exact<std::int64_t>();
     if (!number || *number < least || *number > most)

@@ -45,6 +45,7 @@ public:
     wxString Word() const;
     /// A text, a number, or true and false as "1" and "0".
     wxString AsText() const;
+    bool Flag() const;
     std::int64_t Number(std::int64_t least, std::int64_t most) const;
     std::chrono::milliseconds Time(std::chrono::milliseconds least,
                                    std::chrono::milliseconds most) const;

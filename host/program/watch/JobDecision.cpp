@@ -29,17 +29,6 @@ void TryAgain(Job& job, std::chrono::seconds delay) {
     job.due = Now() + delay;
 }
 
-/// After an attempt that says nothing of the document.
-void GiveBack(Job& job) {
-    job.attempts = std::max(job.attempts - 1, 0);
-    TryAgain(job, GivenBackFor);
-}
-
-void Fail(Job& job) {
-    job.state = JobState::Failed;
-    job.ended = Now();
-}
-
 /// A file that is another by now is found anew.
 FolderNews DecideChange(Job& job, const FolderConfiguration& folder) {
     std::error_code error;
@@ -61,13 +50,25 @@ FolderNews DecideFailure(Job& job, const Outcome& outcome, const FolderConfigura
     }
     const auto attempt = static_cast<std::size_t>(std::max(job.attempts, 1));
     if (outcome.state == State::Refused || attempt > folder.retries.size())
-        Fail(job);
+        End(job, JobState::Failed);
     else
         TryAgain(job, folder.retries[attempt - 1]);
     return FolderNews::Works;
 }
 
 } // namespace
+
+void GiveBack(Job& job) {
+    job.attempts = std::max(job.attempts - 1, 0);
+    TryAgain(job, GivenBackFor);
+}
+
+void End(Job& job, JobState state) {
+    job.state = state;
+    job.ended = Now();
+    job.workplace.clear();
+    job.product.clear();
+}
 
 FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder) {
     job.seconds = outcome.seconds.value_or(0);
@@ -79,7 +80,7 @@ FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfigu
     job.fault.reset();
     job.workplace = outcome.made.parent_path();
     job.product = ToText(outcome.made.filename());
-    job.state = JobState::Delivering;
+    job.state = folder.print ? JobState::Submitting : JobState::Delivering;
     return FolderNews::Works;
 }
 
@@ -90,5 +91,5 @@ void DecideByDeath(Job& job, const wxString& text) {
     }
     job.fault = {wxString::Format(_("it ended the program %d times"), job.deaths)};
     job.text = text;
-    Fail(job);
+    End(job, JobState::Failed);
 }

@@ -15,8 +15,15 @@ enum class FolderNews {
 
 /// Decides by what came of a document's conversion: it is delivered, tried again when its time
 /// comes, or comes no further. What the machine is to blame for is no attempt of the document's.
-/// @param job Converting; afterwards Delivering, Waiting, Failed or Vanished
+/// @param job Converting; afterwards Submitting, Delivering, Waiting, Failed or Vanished
 FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder);
+
+/// Has a job tried again after an attempt that says nothing of the document.
+void GiveBack(Job& job);
+
+/// Says that a job comes no further.
+/// @param state Finished or Failed
+void End(Job& job, JobState state);
 
 /// Decides on a job whose attempt ended the program: it is tried again, but not for ever.
 /// @param text the message of the code with which it may fail

@@ -5,6 +5,7 @@
 #include "host/program/system/DurableMove.h"
 #include "host/program/watch/FailureNote.h"
 #include "host/program/watch/FolderScan.h"
+#include "host/program/watch/JobDecision.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>
@@ -122,10 +123,7 @@ std::optional<Fault> DeliverProduct(Job& job, const FolderConfiguration& folder,
         if (fault && product.IsThere() && (replaces || !IsThere(job.output)))
             return fault;
     }
-    job.state = JobState::Finished;
-    job.ended = std::chrono::system_clock::now();
-    job.workplace.clear();
-    job.product.clear();
+    End(job, JobState::Finished);
     journal.Commit(job);
     return std::nullopt;
 }

@@ -133,11 +133,6 @@ Others ReadOthers(Value value) {
     return Choices[value.Choice({"leave", "fail", "pass"})];
 }
 
-void RefusePrinting(Value value, Reading& /*reading*/) {
-    throw Misfit{value.KeyAt(), _("printing is not available yet; take this part out, and the "
-                                  "output goes to \"out\"")};
-}
-
 // clang-format off
 const Keys DefaultsKeys = {
     {"keep_processed", [](Value value, Reading& r) { r.folder.keepProcessed = ReadKeeping(value); }},
@@ -157,7 +152,7 @@ const Keys FolderKeys = {
     {"order", [](Value value, Reading& r) { r.folder.byName = value.Choice({"arrival", "name"}) == 1; }},
     {"others", [](Value value, Reading& r) { r.folder.others = ReadOthers(value); }},
     {"out", [](Value value, Reading& r) { r.folder.out = ReadPath(value, r); }},
-    {"print", RefusePrinting},
+    {"print", [](Value value, Reading& r) { r.folder.print = ReadPrinting(value); }},
     {"priority", [](Value value, Reading& r) { r.folder.priority = static_cast<int>(value.Number(1, 100)); }},
     {"retries", DefaultsKeys.at("retries")},
     {"set", ReadSettings},

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "host/program/base/Fault.h"
+#include "host/program/watch/PrintConfiguration.h"
 
 #include <wx/string.h>
 
@@ -39,6 +40,7 @@ struct FolderConfiguration {
     Others others = Others::Leave;
     std::optional<std::chrono::milliseconds>
         settle;                                ///< as long as the file system wants if not given
+    std::optional<PrintConfiguration> print;   ///< otherwise the output goes to `out`
     std::vector<std::chrono::seconds> retries; ///< the time before each further attempt
     std::optional<std::chrono::seconds> keepProcessed; ///< for ever if not given
 };

@@ -163,6 +163,7 @@ void WatchService::Pass() {
         LookAfterFolders();
         if (!m_isDraining)
             m_work.BeginJobs();
+        m_work.PrintJobs();
         const bool hasEnded = m_work.EndJob();
         m_work.Rest();
         if (now - m_heartbeat > BetweenHeartbeats) {
@@ -269,7 +270,7 @@ void WatchService::ShowProgress(const std::vector<RunningDocument>& running) {
 
 /// Whether nothing is left that has settled, or may yet.
 bool WatchService::IsDone() const {
-    if (m_isDraining || m_work.IsBusy())
+    if (m_isDraining || m_work.IsBusy() || m_work.IsPrinting())
         return false;
     for (const WatchedFolder& folder : m_folders) {
         const FolderWatcher::View& view = folder.View();

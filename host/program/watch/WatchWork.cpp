@@ -23,6 +23,9 @@ constexpr std::chrono::seconds BetweenEnds = 30s;
 /// After which nothing is kept ready for another document.
 constexpr std::chrono::seconds QuietAfter = 60s;
 
+/// While documents come to paper.
+constexpr std::chrono::milliseconds BetweenPrints = 200ms;
+
 constexpr std::chrono::seconds UpcomingLasts = 1s;
 constexpr std::size_t MostUpcoming = 64;
 
@@ -44,12 +47,16 @@ WatchWork::Clock::time_point Now() {
 
 WatchWork::WatchWork(Means means, Journal& journal, Folders& folders, const FilterSet& filters)
     : m_means(std::move(means)), m_journal(journal), m_folders(folders), m_filters(filters),
-      m_claimant(ThisProgram()), m_pool(m_means.workerArguments, m_means.workerPatience, *this) {}
+      m_claimant(ThisProgram()), m_pool(m_means.workerArguments, m_means.workerPatience, *this),
+      m_printing(
+          journal, [&filters](int code) { return filters.ErrorText(code); },
+          [this] { m_pool.Wake(); }) {}
 
 WatchWork::~WatchWork() {
-    for (auto& [id, work] : m_ending)
-        if (work.job.state == JobState::Delivering && work.workplace)
-            work.workplace->Leave();
+    for (auto* const works : {&m_atPrinter, &m_ending})
+        for (auto& [ticket, work] : *works)
+            if (HasProduct(work.job.state) && work.workplace)
+                work.workplace->Leave();
 }
 
 bool WatchWork::IsBusy() const {
@@ -62,7 +69,8 @@ bool WatchWork::HasEndings() const {
 }
 
 void WatchWork::Step() {
-    m_pool.Step(HasEndings() ? 0ms : BetweenSignsOfLife);
+    const std::chrono::milliseconds longest = IsPrinting() ? BetweenPrints : BetweenSignsOfLife;
+    m_pool.Step(HasEndings() ? 0ms : longest);
 }
 
 std::size_t WatchWork::Recover(WatchedFolder& folder) {
@@ -88,7 +96,7 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
 }
 
 WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
-    for (auto* const works : {&m_underWay, &m_ending})
+    for (auto* const works : {&m_underWay, &m_atPrinter, &m_ending})
         for (auto& [ticket, work] : *works)
             if (work.job.id == job.id && work.job.identity == job.identity)
                 return &work;
@@ -97,11 +105,13 @@ WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
 
 /// Removes abandoned workplaces, unless the journal knows of an output in one of them.
 void WatchWork::Sweep(const fs::path& outputFolder) {
-    JobQuery query;
-    query.state = JobState::Delivering;
-    for (const Job& job : m_journal.List(query))
-        if (!FindUnderWay(job) && job.workplace.parent_path().parent_path() == outputFolder)
-            return; // its folder's turn comes, or it is watched no more
+    for (const JobState state : {JobState::Submitting, JobState::Printing, JobState::Delivering}) {
+        JobQuery query;
+        query.state = state;
+        for (const Job& job : m_journal.List(query))
+            if (!FindUnderWay(job) && job.workplace.parent_path().parent_path() == outputFolder)
+                return; // its folder's turn comes, or it is watched no more
+    }
     Workplace::RemoveAbandoned(outputFolder, Workplace::Kind::OfWatch);
 }
 
@@ -194,6 +204,8 @@ bool WatchWork::EndJob() {
         Decide(work);
     if (End(work))
         m_ending.erase(entry);
+    else if (IsAtPrinter(work.job.state))
+        m_atPrinter.insert(m_ending.extract(entry));
     return true;
 }
 
@@ -220,6 +232,8 @@ bool WatchWork::End(UnderWay& work) {
     if (work.isToBeTold)
         m_journal.Commit(work.job);
     work.isToBeTold = false;
+    if (IsAtPrinter(work.job.state))
+        return false;
     const std::optional<Fault> fault = DoLastSteps(work);
     if (!fault)
         return true;
@@ -229,6 +243,22 @@ bool WatchWork::End(UnderWay& work) {
         if (WatchedFolder* const folder = Find(work.job.folder))
             folder->Block(*fault);
     return false;
+}
+
+void WatchWork::PrintJobs() {
+    for (auto entry = m_atPrinter.begin(); entry != m_atPrinter.end();) {
+        const auto current = entry++;
+        UnderWay& work = current->second;
+        const WatchedFolder* const folder = Find(work.job.folder);
+        const bool hasOther = folder && folder->Configuration()->print; // a queue's name was mended
+        if (m_printing.Advance(current->first, work.job,
+                               hasOther ? *folder->Configuration() : *work.folder))
+            m_ending.insert(m_atPrinter.extract(current));
+    }
+    for (WatchedFolder& folder : m_folders)
+        if (const auto& print = folder.Configuration()->print)
+            folder.ShowPrinting(m_printing.TroubleOf(folder.Name()),
+                                m_printing.CountOf(folder.Name()) >= print->mostQueued);
 }
 
 std::optional<Fault> WatchWork::DoLastSteps(UnderWay& work) {
@@ -249,6 +279,8 @@ void WatchWork::Report(UnderWay& work) const {
     if (!work.outcome || !isEnd || std::exchange(work.isReported, true))
         return;
     work.outcome->made.clear();
+    if (state == JobState::Failed && work.outcome->state == State::Converted)
+        work.outcome->End(State::Failed, *work.job.fault, work.job.text);
     work.outcome->output = work.job.output;
     m_means.onEnd(work.job, *work.outcome);
 }

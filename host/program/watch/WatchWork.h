@@ -3,6 +3,7 @@
 #include "host/program/documents/Workplace.h"
 #include "host/program/filters/FilterSet.h"
 #include "host/program/watch/JobEnding.h"
+#include "host/program/watch/JobPrinting.h"
 #include "host/program/watch/WatchedFolder.h"
 #include "host/program/workers/WorkerPool.h"
 
@@ -43,6 +44,9 @@ public:
     /// @return whether there was one
     bool EndJob();
 
+    /// Takes documents further that come to paper, without waiting for a print server.
+    void PrintJobs();
+
     /// Begins documents, as many as there are workers for.
     /// @return whether there may be more, but no worker
     void BeginJobs();
@@ -63,6 +67,8 @@ public:
 
     /// Whether something is under way that does not wait for better times.
     bool IsBusy() const;
+    /// Whether documents come to paper, or are to, without anybody's help.
+    bool IsPrinting() const { return m_printing.IsBusy(); }
     std::vector<RunningDocument> Running() const;
     /// How many documents could be begun, had they a worker.
     std::size_t Waiting() const { return m_waiting; }
@@ -105,13 +111,15 @@ private:
     const Claimant m_claimant;
     // By tickets of its own: a journal that is begun anew gives its numbers again.
     WorkerPool::Ticket m_lastTicket = 0;
-    std::map<WorkerPool::Ticket, UnderWay> m_underWay; ///< with a worker
-    std::map<WorkerPool::Ticket, UnderWay> m_ending;   ///< no longer with one
-    std::vector<Input> m_upcoming;                     ///< some of those that are waiting
+    std::map<WorkerPool::Ticket, UnderWay> m_underWay;  ///< with a worker
+    std::map<WorkerPool::Ticket, UnderWay> m_atPrinter; ///< or on the way there
+    std::map<WorkerPool::Ticket, UnderWay> m_ending;    ///< no longer with one
+    std::vector<Input> m_upcoming;                      ///< some of those that are waiting
     std::size_t m_waiting = 0;
     Clock::time_point m_upcomingKnown;
     Clock::time_point m_lastWork;
     std::size_t m_begun = 0; ///< since it was quiet
     unsigned m_engineDocuments = 1;
     WorkerPool m_pool;
+    JobPrinting m_printing; // last: it wakes the pool
 };

@@ -33,7 +33,7 @@ void WatchedFolder::Update(const std::set<wxString>& paused, std::uintmax_t minF
 
 bool WatchedFolder::MayBegin(Clock::time_point now) const {
     return m_view.hasLooked && !m_view.fault && !m_view.awaitsAdmission && !m_isPaused &&
-           !m_shortage && (!m_fault || (!m_isProbing && now >= m_probe));
+           !m_shortage && !m_printTrouble && !m_isPrintingFull && (!m_fault || (!m_isProbing && now >= m_probe));
 }
 
 void WatchedFolder::Block(Fault fault) {
@@ -80,7 +80,9 @@ std::optional<std::string> WatchedFolder::Settings() {
 std::optional<Fault> WatchedFolder::Obstacle() const {
     if (m_view.fault)
         return m_view.fault;
-    return m_shortage ? m_shortage : m_fault;
+    if (m_shortage)
+        return m_shortage;
+    return m_fault ? m_fault : m_printTrouble;
 }
 
 FolderStatus WatchedFolder::Status() const {

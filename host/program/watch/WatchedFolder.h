@@ -36,6 +36,14 @@ public:
     /// Says that one is.
     void Begin() { m_isProbing = m_fault.has_value(); }
 
+    /// Says how its documents come to paper.
+    /// @param trouble why they do not
+    /// @param isFull as many are on their way as may be
+    void ShowPrinting(std::optional<Fault> trouble, bool isFull) {
+        m_printTrouble = std::move(trouble);
+        m_isPrintingFull = isFull;
+    }
+
     /// Says that the machine could not convert a document of it.
     void Block(Fault fault);
     /// Says that it could.
@@ -62,6 +70,8 @@ private:
     std::optional<Fault> m_fault; ///< of the machine, met by its last document
     Clock::time_point m_probe;    ///< when that may be tried again
     bool m_isProbing = false;
+    std::optional<Fault> m_printTrouble;
+    bool m_isPrintingFull = false;
 
     std::optional<std::string> m_settings;
     FileIdentity m_settingsFile; ///< that they are of

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "host/program/system/Spooler.h"
+
+// The steps by which a document comes to a print server. Between any two of them this program may
+// be ended, or the server, so that each is told before the next one is done.
+
+/// What came of a step.
+struct PrintReply {
+    std::optional<Fault> fault; ///< then nothing is known of the job
+    std::optional<SpooledJob> job;
+};
+
+/// How a document is submitted.
+struct Submission {
+    PrintTicket ticket;
+    wxString name;        ///< the job's, which no other document has
+    std::size_t most = 0; ///< jobs of this user's in the queue, beyond which none is made
+    std::filesystem::path document; ///< PostScript or PDF; the other kind may lie beside it
+};
+
+/// Makes the job, without its document. One that was made before, by a program that was ended
+/// before it could write down the number, is taken away.
+PrintReply MakePrintJob(Spooler& spooler, const Submission& submission);
+
+/// Gives the job its document. To be asked for once: a print server takes a second one, too.
+PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int number);
+
+/// Looks for a job.
+/// @return without a job when the server has none of that number
+PrintReply FindPrintJob(Spooler& spooler, int number);
