@@ -12,6 +12,7 @@ _quillon_options() {
             --out --printer --settings --ps --pdf --profile --jobs --set
         ;;
     queue) printf '%s ' --config --journal --folder --state --limit ;;
+    cancel) printf '%s ' --config --journal ;;
     retry) printf '%s ' --config --journal --folder --failed ;;
     pause | resume) printf '%s ' --config --journal ;;
     print-server) printf '%s ' --cups-server-root --cups-server-bin ;;
@@ -47,7 +48,7 @@ _quillon_choose_files() {
 
 _quillon() {
     local current=$2 previous=$3 command='' word
-    local commands=$'convert\nfilter\npause\nprint-server\nqueue\nresume\nretry\nscreen'
+    local commands=$'cancel\nconvert\nfilter\npause\nprint-server\nqueue\nresume\nretry\nscreen'
     commands+=$'\nsettings\nstatus\nwatch'
     for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
         [[ -n $word && $'\n'$commands$'\n' == *$'\n'"$word"$'\n'* ]] && command=$word && break

@@ -44,6 +44,8 @@ AddCommand AddWatch;
 AddCommand AddQueue;
 /// `quillon retry`: has failed documents tried again.
 AddCommand AddRetry;
+/// `quillon cancel`: has print servers cancel documents.
+AddCommand AddCancel;
 /// `quillon pause`: has no documents begun.
 AddCommand AddPause;
 /// `quillon resume`: has them begun again.
@@ -52,6 +54,6 @@ AddCommand AddResume;
 AddCommand AddWorker;
 
 /// All of them, in the order of the help.
-constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen,      AddConvert,  AddWatch,
-                                       AddQueue,  AddRetry,       AddPause,    AddResume,
-                                       AddFilter, AddPrintServer, AddSettings, AddWorker};
+constexpr AddCommand* AllCommands[] = {
+    AddStatus, AddScreen, AddConvert, AddWatch,       AddQueue,    AddRetry, AddCancel,
+    AddPause,  AddResume, AddFilter,  AddPrintServer, AddSettings, AddWorker};

@@ -40,8 +40,8 @@ Settings
 constexpr const char* ExitCodes = R"(
 Exit codes
   0  done; for status: ready to convert; for settings: saved, or left as they were
-  1  some documents were refused or could not be converted; for retry: or cannot be tried again;
-     for print-server status: not installed
+  1  some documents were refused or could not be converted; for retry and cancel: or cannot be
+     tried again, or cancelled; for print-server status: not installed
   2  the machine is at fault: no Office application, no printer, no filter, a full disk, no more
      processes, no isolation where it is required, an engine that was ended from outside, when it was tried again, too; for
      settings: no display to show them on; for queue and what goes with it: the journal cannot be
@@ -60,8 +60,8 @@ Output
   failed: number, folder, name, state, attempts, next try, reason; then one for each folder, with
   how many there are in each state.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
-  printer, distiller, isolation, panel, missing, document, job, queue, retry, pause, part, summary
-  and error; lines for people then go to stderr. The "code", the "state" and the "fault" (document,
+  printer, distiller, isolation, panel, missing, document, job, queue, retry, cancel, pause, part,
+  summary and error; lines for people then go to stderr. The "code", the "state" and the "fault" (document,
   machine or null) of a document or job are the same in every language, and times are UTC; "fonts"
   are those not installed, each with what was "asked" for and "used", and whether both have the
   "sameMetrics", so that lines break alike.

@@ -11,9 +11,9 @@
 namespace {
 
 constexpr JobState AllStates[] = {
-    JobState::Waiting,    JobState::Converting, JobState::Submitting,
-    JobState::Printing,   JobState::Delivering, JobState::Finished,
-    JobState::Archived,   JobState::Failed,     JobState::Vanished,
+    JobState::Waiting,  JobState::Converting, JobState::Submitting,
+    JobState::Printing, JobState::Delivering, JobState::Finished,
+    JobState::Archived, JobState::Failed,     JobState::Vanished,
 };
 
 wxDateTime DateOf(JournalTime time) {

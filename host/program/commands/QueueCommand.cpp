@@ -16,7 +16,7 @@ struct QueueOptions {
 };
 
 /// What people wait for comes last, where it is read first.
-constexpr JobState ShownStates[] = {JobState::Waiting, JobState::Converting, JobState::Submitting,
+constexpr JobState ShownStates[] = {JobState::Waiting,  JobState::Converting, JobState::Submitting,
                                     JobState::Printing, JobState::Delivering, JobState::Finished,
                                     JobState::Failed};
 

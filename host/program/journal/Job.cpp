@@ -9,9 +9,9 @@ namespace {
 
 /// In the order of the states.
 constexpr const char* Names[] = {
-    wxTRANSLATE("waiting"),    wxTRANSLATE("converting"), wxTRANSLATE("submitting"),
-    wxTRANSLATE("printing"),   wxTRANSLATE("delivering"), wxTRANSLATE("finished"),
-    wxTRANSLATE("archived"),   wxTRANSLATE("failed"),     wxTRANSLATE("vanished"),
+    wxTRANSLATE("waiting"),  wxTRANSLATE("converting"), wxTRANSLATE("submitting"),
+    wxTRANSLATE("printing"), wxTRANSLATE("delivering"), wxTRANSLATE("finished"),
+    wxTRANSLATE("archived"), wxTRANSLATE("failed"),     wxTRANSLATE("vanished"),
 };
 
 } // namespace

@@ -27,10 +27,10 @@ using JournalTime = std::chrono::system_clock::time_point;
 
 /// What a print server has of a document, or is to have.
 struct PrintOrder {
-    wxString server; ///< its address; with the number
-    wxString queue;  ///< likewise
-    int number = 0;  ///< of the job there; 0 for none yet
-    wxString uuid;   ///< tells it from another one that gets the same number
+    wxString server;   ///< its address; with the number
+    wxString queue;    ///< likewise
+    int number = 0;    ///< of the job there; 0 for none yet
+    wxString uuid;     ///< tells it from another one that gets the same number
     bool held = false; ///< it waits there for a person: the server had lost it once
     wxString message;  ///< what the server says of it, in its own words; or empty
 };

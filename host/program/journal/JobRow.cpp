@@ -57,7 +57,8 @@ FileIdentity ReadIdentity(SqliteStatement& row) {
 const char* const JobColumns =
     "id, folder, source, inside, device, number, size, modified, priority, state, open, "
     "attempts, deaths, inserted, due, begun, ended, seconds, workplace, product, output, aside, "
-    "print_server, print_queue, print_number, print_uuid, print_held, print_message, fault_blame, fault, fault_code, fault_advice, text, claimed_by, token";
+    "print_server, print_queue, print_number, print_uuid, print_held, print_message, fault_blame, "
+    "fault, fault_code, fault_advice, text, claimed_by, token";
 
 Job ReadJob(SqliteStatement& row) {
     Job job;

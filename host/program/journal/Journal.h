@@ -79,8 +79,8 @@ public:
     /// @return false when somebody else has claimed it since, or it is gone: nothing is stored then
     virtual bool Commit(const Job& job) = 0;
 
-    /// The jobs of a folder that its last watcher left under way, from Converting to Delivering, and
-    /// those whose sources are to be put away. Each is the claimant's from here on.
+    /// The jobs of a folder that its last watcher left under way, from Converting to Delivering,
+    /// and those whose sources are to be put away. Each is the claimant's from here on.
     virtual std::vector<Job> TakeOver(const wxString& folder, const Claimant& claimant) = 0;
 
     virtual std::vector<Job> List(const JobQuery& query) = 0;

@@ -29,8 +29,8 @@ bool IsAmong(ipp_attribute_t* supported, const std::string& option, const std::s
 
 /// Values of which a printer names only some: sizes of one's own, times, and pairs of sheets.
 bool IsOpenEnded(const std::string& option, const std::string& value) {
-    return (option == "media" && (value.find("ustom") != std::string::npos ||
-                                  value.find(',') != std::string::npos)) ||
+    return (option == "media" &&
+            (value.find("ustom") != std::string::npos || value.find(',') != std::string::npos)) ||
            (option == "job-hold-until" && value.find(':') != std::string::npos) ||
            (option == "job-sheets" && value.find(',') != std::string::npos);
 }

@@ -11,10 +11,13 @@ constexpr int ConnectingTakes = 5000; // milliseconds
 constexpr double AnswerTakes = 10;    // seconds
 
 /// Of a job.
-constexpr const char* JobAttributes[] = {
-    "job-id",    "job-name",          "job-uuid",
-    "job-state", "job-state-reasons", "job-printer-state-message",
-    "number-of-documents"};
+constexpr const char* JobAttributes[] = {"job-id",
+                                         "job-name",
+                                         "job-uuid",
+                                         "job-state",
+                                         "job-state-reasons",
+                                         "job-printer-state-message",
+                                         "number-of-documents"};
 
 http_t* Http(const std::shared_ptr<void>& connection) {
     return static_cast<http_t*>(connection.get());
@@ -108,14 +111,15 @@ std::shared_ptr<void> Spooler::Connection(Fault& fault) {
     cupsSetPasswordCB2([](const char*, http_t*, const char*, const char*,
                           void*) -> const char* { return nullptr; },
                        nullptr);
-    http_t* const http = httpConnect2(cupsServer(), ippPort(), nullptr, AF_UNSPEC,
-                                      cupsEncryption(), 1, ConnectingTakes, nullptr);
+    http_t* const http = httpConnect2(cupsServer(), ippPort(), nullptr, AF_UNSPEC, cupsEncryption(),
+                                      1, ConnectingTakes, nullptr);
     if (!http) {
         fault = {wxString::Format(_("the print server %s cannot be reached"), Address()),
                  Blame::Machine};
         return nullptr;
     }
-    httpSetTimeout(http, AnswerTakes, [](http_t*, void*) { return 0; }, nullptr);
+    httpSetTimeout(
+        http, AnswerTakes, [](http_t*, void*) { return 0; }, nullptr);
     m_connection.reset(http, httpClose);
     return m_connection;
 }
@@ -134,8 +138,8 @@ std::optional<Fault> Spooler::Check(const PrintTicket& ticket) {
     const auto connection = Connection(fault);
     if (!connection)
         return fault;
-    const IppMessage printer = Ask(
-        Http(connection), RequestAbout(ticket.queue, IPP_OP_GET_PRINTER_ATTRIBUTES), fault);
+    const IppMessage printer =
+        Ask(Http(connection), RequestAbout(ticket.queue, IPP_OP_GET_PRINTER_ATTRIBUTES), fault);
     if (!printer) {
         LetGo();
         return WasNotFound() ? NoQueue(ticket.queue, Address()) : fault;
@@ -164,10 +168,10 @@ std::optional<std::string> Spooler::Choose(const wxString& queue,
     for (const std::string& type : types)
         if (supported && ippContainsString(supported, type.c_str()))
             return type;
-    fault = {wxString::Format(_("the queue \"%s\" does not take what was made of the document"),
-                              queue),
-             Blame::Usage, ConversionFailed,
-             _("Have PDF made as well, by the settings, or choose another queue")};
+    fault = {
+        wxString::Format(_("the queue \"%s\" does not take what was made of the document"), queue),
+        Blame::Usage, ConversionFailed,
+        _("Have PDF made as well, by the settings, or choose another queue")};
     return std::nullopt;
 }
 

@@ -55,9 +55,9 @@ IppMessage Ask(http_t* server, IppMessage request, Fault& fault, const char* fil
     const ipp_status_t status = cupsLastError();
     if (answer && status < IPP_STATUS_ERROR_BAD_REQUEST)
         return answer;
-    fault = {wxString::Format(_("the print server says: %s"),
-                              wxString::FromUTF8(cupsLastErrorString())),
-             BlameFor(status)};
+    fault = {
+        wxString::Format(_("the print server says: %s"), wxString::FromUTF8(cupsLastErrorString())),
+        BlameFor(status)};
     return {nullptr, ippDelete};
 }
 

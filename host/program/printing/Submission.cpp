@@ -63,9 +63,8 @@ PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int num
     const auto type = spooler.Choose(submission.ticket.queue, types, fault);
     if (!type)
         return {fault, {}};
-    const auto* const kind =
-        std::find_if(std::begin(Kinds), std::end(Kinds),
-                     [&type](const Kind& each) { return *type == each.type; });
+    const auto* const kind = std::find_if(std::begin(Kinds), std::end(Kinds),
+                                          [&type](const Kind& each) { return *type == each.type; });
     return {spooler.Send(submission.ticket.queue, number, FileOf(submission, *kind), *type), {}};
 }
 

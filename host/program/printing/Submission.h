@@ -14,8 +14,8 @@ struct PrintReply {
 /// How a document is submitted.
 struct Submission {
     PrintTicket ticket;
-    wxString name;        ///< the job's, which no other document has
-    std::size_t most = 0; ///< jobs of this user's in the queue, beyond which none is made
+    wxString name;                  ///< the job's, which no other document has
+    std::size_t most = 0;           ///< jobs of this user's in the queue, beyond which none is made
     std::filesystem::path document; ///< PostScript or PDF; the other kind may lie beside it
 };
 

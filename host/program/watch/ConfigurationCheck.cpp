@@ -101,20 +101,28 @@ void Check::Tell(const FolderConfiguration& folder) {
     }
     lines.insert(lines.end(), {HowKept(folder), SettingsOf(folder),
                                wxString::Format(_("output in %s"), Shown(folder.out))});
+    if (folder.print)
+        lines.push_back(
+            wxString::Format(_("printed in the queue %s"), OneLine(folder.print->ticket.queue)));
     for (const wxString& line : lines)
         m_reporter.Line("  " + line);
     const std::chrono::duration<double> settle =
         SettleTime(folder, check.sight && check.sight->isOnShare);
-    m_reporter.Record({{"type", "folder"},
-                       {"name", JsonText(folder.name)},
-                       {"in", folder.in.u8string()},
-                       {"out", folder.out.u8string()},
-                       {"settings", folder.settings ? Json(folder.settings->u8string()) : Json()},
-                       {"set", folder.assignments},
-                       {"settle", settle.count()},
-                       {"sight", check.sight ? RecordOf(*check.sight) : Json()}});
+    m_reporter.Record(
+        {{"type", "folder"},
+         {"name", JsonText(folder.name)},
+         {"in", folder.in.u8string()},
+         {"out", folder.out.u8string()},
+         {"queue", folder.print ? Json(JsonText(folder.print->ticket.queue)) : Json()},
+         {"settings", folder.settings ? Json(folder.settings->u8string()) : Json()},
+         {"set", folder.assignments},
+         {"settle", settle.count()},
+         {"sight", check.sight ? RecordOf(*check.sight) : Json()}});
     for (const Fault& problem : check.problems)
         Tell(problem, folder.name);
+    if (folder.print)
+        if (const auto problem = Spooler(folder.print->ticket.server).Check(folder.print->ticket))
+            Tell(*problem, folder.name);
 }
 
 void Check::Tell(const Fault& problem, const wxString& folder) {

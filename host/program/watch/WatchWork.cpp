@@ -23,9 +23,6 @@ constexpr std::chrono::seconds BetweenEnds = 30s;
 /// After which nothing is kept ready for another document.
 constexpr std::chrono::seconds QuietAfter = 60s;
 
-/// While documents come to paper.
-constexpr std::chrono::milliseconds BetweenPrints = 200ms;
-
 constexpr std::chrono::seconds UpcomingLasts = 1s;
 constexpr std::size_t MostUpcoming = 64;
 
@@ -69,8 +66,7 @@ bool WatchWork::HasEndings() const {
 }
 
 void WatchWork::Step() {
-    const std::chrono::milliseconds longest = IsPrinting() ? BetweenPrints : BetweenSignsOfLife;
-    m_pool.Step(HasEndings() ? 0ms : longest);
+    m_pool.Step(HasEndings() ? 0ms : BetweenSignsOfLife);
 }
 
 std::size_t WatchWork::Recover(WatchedFolder& folder) {

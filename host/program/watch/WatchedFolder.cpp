@@ -33,7 +33,8 @@ void WatchedFolder::Update(const std::set<wxString>& paused, std::uintmax_t minF
 
 bool WatchedFolder::MayBegin(Clock::time_point now) const {
     return m_view.hasLooked && !m_view.fault && !m_view.awaitsAdmission && !m_isPaused &&
-           !m_shortage && !m_printTrouble && !m_isPrintingFull && (!m_fault || (!m_isProbing && now >= m_probe));
+           !m_shortage && !m_printTrouble && !m_isPrintingFull &&
+           (!m_fault || (!m_isProbing && now >= m_probe));
 }
 
 void WatchedFolder::Block(Fault fault) {
