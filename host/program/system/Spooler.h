@@ -44,7 +44,7 @@ public:
     static bool IsAvailable();
 
     /// @param server see PrintTicket
-    explicit Spooler(wxString server) : m_server(std::move(server)) {}
+    explicit Spooler(const wxString& server) : m_server(server) {}
 
     /// What is asked for in vain: a queue, or what its printer cannot do.
     std::optional<Fault> Check(const PrintTicket& ticket);
