@@ -59,6 +59,9 @@ void WriteFigures(Html& html, const PageContent& content, const FolderStatus& fo
     WriteFigure(html, texts(wxTRANSLATE("Waiting")), NumberText(of(JobState::Waiting)));
     WriteFigure(html, texts(wxTRANSLATE("Under way")),
                 NumberText(static_cast<std::size_t>(running)));
+    if (folder.configuration.print)
+        WriteFigure(html, texts(wxTRANSLATE("At the printer")),
+                    NumberText(of(JobState::Submitting) + of(JobState::Printing)));
     WriteFigure(html, texts(wxTRANSLATE("Done")),
                 NumberText(of(JobState::Finished) + of(JobState::Archived)));
     WriteFigure(html, texts(wxTRANSLATE("Failed")), NumberText(failed),

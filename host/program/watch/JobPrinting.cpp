@@ -101,6 +101,8 @@ bool JobPrinting::Advance(std::int64_t ticket, Job& job, const FolderConfigurati
 
 /// What was to be submitted may have gone, or is not to be printed any more.
 void JobPrinting::Reconsider(Order& order, Job& job, const FolderConfiguration& folder) {
+    if (job.print.number > 0 && !order.isEmpty)
+        return; // the server may have it
     if (!IsProductThere(job)) {
         Forget(job.print);
         GiveBack(job);
