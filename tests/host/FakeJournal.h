@@ -21,11 +21,12 @@ public:
     std::optional<Job> Claim(const std::vector<ClaimableFolder>&, const Claimant&) override {
         return std::nullopt;
     }
-    void Heartbeat(const Claimant&) override {}
+    void Heartbeat(const Claimant&, const std::vector<std::int64_t>&) override {}
     bool Commit(const Job&) override { return false; }
     std::vector<Job> TakeOver(const wxString&, const Claimant&) override { return {}; }
     void Remove(std::int64_t) override {}
     bool HasNews() override { return true; }
+    JournalTime Now() override { return std::chrono::system_clock::now(); }
 
     std::vector<Job> List(const JobQuery& query) override {
         std::vector<Job> found;

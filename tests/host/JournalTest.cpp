@@ -158,7 +158,7 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     EXPECT_EQ(m_journal->TakeOver("letters", Us)[0].state, JobState::Finished);
     EXPECT_FALSE(other->Commit(theirs));
     EXPECT_THAT(m_journal->TakeOver("bills", Us), IsEmpty());
-    m_journal->Heartbeat(Us);
+    m_journal->Heartbeat(Us, {job.id});
     m_journal->HasNews();
     EXPECT_FALSE(m_journal->HasNews());
     other->Remove(job.id);

@@ -42,7 +42,10 @@ struct Job {
     wxString folder;              ///< the watched folder's name
     std::filesystem::path source; ///< where the file is, absolute; follows it when it is put away
     wxString inside; ///< the folder inside the watched one that it was found in, with '/'; or empty
-    FileIdentity identity; ///< of the source
+    FileIdentity identity; ///< of the source, as its finder saw it
+    /// The source's SHA-256, in hexadecimal digits, where machines share the journal; or empty. By
+    /// it another machine knows the file, to which device and number say nothing.
+    std::string digest;
     int priority = 50;     ///< 1 to 100
     JobState state = JobState::Waiting;
     bool open = true; ///< its source is where it was found; no other job has that file then

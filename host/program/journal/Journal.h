@@ -1,6 +1,7 @@
 #pragma once
 
 #include "host/program/journal/Job.h"
+#include "host/program/journal/PathMap.h"
 
 #include <map>
 #include <memory>
@@ -23,6 +24,7 @@ struct NewJob {
     wxString inside;
     FileIdentity identity;
     int priority = 50;
+    std::string digest; ///< see Job
 };
 
 /// A watched folder whose documents may be begun.
@@ -35,6 +37,9 @@ struct ClaimableFolder {
 struct Claimant {
     wxString name;                  ///< one for each program that is running
     std::chrono::seconds lease{30}; ///< for how long without a heartbeat
+    /// Extensions of documents that it has nothing to convert with; in lower case, without dots.
+    /// Only a shared journal has anybody else for them.
+    std::set<std::string> cannot;
 };
 
 /// Which jobs are asked for; what is not set asks for all.
@@ -52,6 +57,8 @@ struct FolderCounts {
     std::map<JobState, std::size_t> jobs;
     std::optional<JournalTime> oldestWaiting; ///< inserted
 };
+
+class SharedJournal;
 
 /// What is known of the documents of watched folders, kept where it survives. Each call is one
 /// transaction, which is on the disk when the call returns. All throw JournalError. An object is
@@ -72,15 +79,19 @@ public:
     virtual std::optional<Job> Claim(const std::vector<ClaimableFolder>& folders,
                                      const Claimant& claimant) = 0;
 
-    /// Says that the claimant still has its jobs.
-    virtual void Heartbeat(const Claimant& claimant) = 0;
+    /// Says that the claimant still has jobs.
+    /// @param jobs the numbers of all that it knows of: what it was given without hearing of it, as
+    ///     the connection broke, is let go
+    virtual void Heartbeat(const Claimant& claimant, const std::vector<std::int64_t>& jobs) = 0;
 
     /// Stores all that has changed of a job, but what it is of.
     /// @return false when somebody else has claimed it since, or it is gone: nothing is stored then
     virtual bool Commit(const Job& job) = 0;
 
-    /// The jobs of a folder that its last watcher left under way, from Converting to Delivering,
-    /// and those whose sources are to be put away. Each is the claimant's from here on.
+    /// The jobs of a folder that somebody left under way, from Converting to Delivering, and those
+    /// whose sources are to be put away. Each is the claimant's from here on. Where nobody but the
+    /// folder's watcher works on them, all there are were left; in a shared journal, those whose
+    /// lease has run out.
     virtual std::vector<Job> TakeOver(const wxString& folder, const Claimant& claimant) = 0;
 
     virtual std::vector<Job> List(const JobQuery& query) = 0;
@@ -102,6 +113,13 @@ public:
 
     /// Whether another object or program may have changed anything since the last call.
     virtual bool HasNews() = 0;
+
+    /// What its clock says.
+    virtual JournalTime Now() = 0;
+
+    /// What programs on several machines say to each other by it.
+    /// @return null when it is this machine's alone. It lives as long as the journal.
+    virtual SharedJournal* Shared() { return nullptr; }
 };
 
 /// What becomes of a journal that is not there, or damaged.
@@ -111,11 +129,16 @@ enum class JournalNeed {
 };
 
 /// Opens a journal.
-/// @param where a file's path, UTF-8
+/// @param where a file's path, UTF-8, or the URL of a queue (IsQueueUrl)
 /// @param fault receives why it cannot be opened. One of a later version of the program is left
 ///     alone.
+/// @param map how the paths of a queue are called on this machine
 std::unique_ptr<Journal> OpenJournal(const std::string& where, Fault& fault,
-                                     JournalNeed need = JournalNeed::Make);
+                                     JournalNeed need = JournalNeed::Make,
+                                     const PathMap& map = {});
+
+/// Whether a journal is one that machines share, on a PostgreSQL server: postgres://…
+bool IsQueueUrl(const std::string& where);
 
 /// The user's journal, where no other is named. UTF-8.
 std::string StandardJournal();

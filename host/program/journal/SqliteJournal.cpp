@@ -132,7 +132,8 @@ std::optional<Job> SqliteJournal::Claim(const std::vector<ClaimableFolder>& fold
     });
 }
 
-void SqliteJournal::Heartbeat(const Claimant& claimant) {
+void SqliteJournal::Heartbeat(const Claimant& claimant,
+                              const std::vector<std::int64_t>& /*jobs: nobody else takes them*/) {
     With([&](SqliteDatabase& database) {
         SqliteStatement(database,
                         std::string("UPDATE job SET lease_until=?2 WHERE claimed_by=?1 AND ") +

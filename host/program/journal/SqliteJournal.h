@@ -21,7 +21,7 @@ public:
     std::size_t Insert(const std::vector<NewJob>& jobs) override;
     std::optional<Job> Claim(const std::vector<ClaimableFolder>& folders,
                              const Claimant& claimant) override;
-    void Heartbeat(const Claimant& claimant) override;
+    void Heartbeat(const Claimant& claimant, const std::vector<std::int64_t>& jobs) override;
     bool Commit(const Job& job) override;
     std::vector<Job> TakeOver(const wxString& folder, const Claimant& claimant) override;
     std::vector<Job> List(const JobQuery& query) override;
@@ -31,6 +31,7 @@ public:
     void SetPaused(const wxString& folder, bool paused) override;
     std::set<wxString> Paused() override;
     bool HasNews() override;
+    JournalTime Now() override { return m_options.now(); }
 
 private:
     SqliteJournal(std::filesystem::path file, Options options)

@@ -295,6 +295,14 @@ const Texts& WatchWork::TextsFor(const FolderConfiguration& folder) const {
     return texts ? *texts : m_texts.Choose({});
 }
 
+void WatchWork::Heartbeat() {
+    std::vector<std::int64_t> jobs;
+    for (const auto* const works : {&m_underWay, &m_atPrinter, &m_ending})
+        for (const auto& [ticket, work] : *works)
+            jobs.push_back(work.job.id);
+    m_journal.Heartbeat(m_claimant, jobs);
+}
+
 void WatchWork::LookAtUpcoming() {
     const Clock::time_point now = Now();
     if (now - m_upcomingKnown < UpcomingLasts)

@@ -57,7 +57,7 @@ public:
     /// Says that there are more documents than there were.
     void Expect() { m_upcomingKnown = {}; }
 
-    void Heartbeat() { m_journal.Heartbeat(m_claimant); }
+    void Heartbeat();
 
     /// Waits for something to happen, if there is nothing to do.
     void Step();
