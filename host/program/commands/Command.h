@@ -40,6 +40,8 @@ AddCommand AddPrintServer;
 AddCommand AddSettings;
 /// `quillon watch`: converts what comes into folders.
 AddCommand AddWatch;
+/// `quillon serve`: converts what watches on other machines find.
+AddCommand AddServe;
 /// `quillon queue`: says what has become of documents in watched folders.
 AddCommand AddQueue;
 /// `quillon retry`: has failed documents tried again.
@@ -54,6 +56,6 @@ AddCommand AddResume;
 AddCommand AddWorker;
 
 /// All of them, in the order of the help.
-constexpr AddCommand* AllCommands[] = {
-    AddStatus, AddScreen, AddConvert, AddWatch,       AddQueue,    AddRetry, AddCancel,
-    AddPause,  AddResume, AddFilter,  AddPrintServer, AddSettings, AddWorker};
+constexpr AddCommand* AllCommands[] = {AddStatus, AddScreen,      AddConvert,  AddWatch, AddServe,
+                                       AddQueue,  AddRetry,       AddCancel,   AddPause, AddResume,
+                                       AddFilter, AddPrintServer, AddSettings, AddWorker};

@@ -7,6 +7,7 @@
 
 #include <wx/intl.h>
 
+#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <fstream>
 
@@ -15,10 +16,11 @@ namespace fs = std::filesystem;
 namespace {
 
 std::optional<NamedJournal> JournalOf(const fs::path& configuration, Fault& fault) {
-    const std::optional<WatchConfiguration> watch = ReadWatchConfiguration(configuration, fault);
+    const std::optional<WatchConfiguration> watch =
+        ReadWatchConfiguration(configuration, fault, FoldersNeed::None);
     if (!watch)
         return std::nullopt;
-    NamedJournal named = {fs::u8path(watch->journal), {}};
+    NamedJournal named = {watch->journal, watch->map, {}};
     for (const FolderConfiguration& folder : watch->folders)
         named.folders.push_back(folder.name);
     return named;
@@ -31,13 +33,13 @@ fs::path ReadableMachineConfiguration() {
 }
 
 /// Where it cannot be looked, opening it says why.
-bool IsMissing(const fs::path& file) {
+bool IsMissing(const std::string& where) {
     std::error_code error;
-    return !fs::exists(file, error) && !error;
+    return !IsQueueUrl(where) && !fs::exists(fs::u8path(where), error) && !error;
 }
 
-Fault NoJournal(const fs::path& file) {
-    return {wxString::Format(_("there is no journal %s"), Shown(file)), Blame::Usage,
+Fault NoJournal(const std::string& where) {
+    return {wxString::Format(_("there is no journal %s"), ShownJournal(where)), Blame::Usage,
             ConversionFailed,
             _("`quillon watch` makes it; name another one with --journal or --config")};
 }
@@ -46,22 +48,33 @@ Fault NoJournal(const fs::path& file) {
 
 void AddJournalOptions(CLI::App& command, JournalOptions& options) {
     AddOption(command, "--journal", "FILE", "The journal", options.journal);
+    AddQueueUrl(command, options.queue);
     AddOption(command, "--config", "FILE.toml",
               "The configuration of the folders, which names the journal; without both, that of\n"
               "the machine's service, or else the user's own journal",
               options.configuration);
 }
 
+void AddQueueUrl(CLI::App& command, std::optional<std::string>& url) {
+    command.add_option("--queue", url, "In place of a journal: the queue that machines share")
+        ->type_name("postgres://…")
+        ->check([](const std::string& text) {
+            return IsQueueUrl(text) ? std::string() : "It must begin with postgres://";
+        });
+}
+
 std::optional<NamedJournal> FindJournal(const JournalOptions& options, Fault& fault) {
-    const fs::path configuration = options.configuration
-                                       ? fs::absolute(FromArgument(*options.configuration))
-                                   : options.journal ? fs::path()
-                                                     : ReadableMachineConfiguration();
+    const fs::path configuration =
+        options.configuration              ? fs::absolute(FromArgument(*options.configuration))
+        : options.journal || options.queue ? fs::path()
+                                           : ReadableMachineConfiguration();
     std::optional<NamedJournal> named = configuration.empty()
-                                            ? NamedJournal{fs::u8path(StandardJournal()), {}}
+                                            ? NamedJournal{StandardJournal(), {}, {}}
                                             : JournalOf(configuration, fault);
     if (named && options.journal)
-        named->file = fs::absolute(FromArgument(*options.journal));
+        named->where = fs::absolute(FromArgument(*options.journal)).u8string();
+    if (named && options.queue)
+        named->where = *options.queue;
     return named;
 }
 
@@ -71,17 +84,17 @@ ExitCode WorkOnJournal(const JournalOptions& options, Reporter& reporter, const 
     const std::optional<NamedJournal> named = FindJournal(options, fault);
     if (!named)
         return reporter.Error(fault);
-    if (IsMissing(named->file))
-        return withNone ? withNone(*named) : reporter.Error(NoJournal(named->file));
+    if (IsMissing(named->where))
+        return withNone ? withNone(*named) : reporter.Error(NoJournal(named->where));
     const std::unique_ptr<Journal> journal =
-        OpenJournal(named->file.u8string(), fault, JournalNeed::Visit);
+        OpenJournal(named->where, fault, JournalNeed::Visit, named->map);
     if (!journal)
         return reporter.Error(fault);
     try {
         return work(*journal, *named);
     } catch (const JournalError& error) {
         return reporter.Error(
-            {wxString::Format(_("the journal %s cannot be used: %s"), Shown(named->file),
+            {wxString::Format(_("the journal %s cannot be used: %s"), ShownJournal(named->where),
                               wxString::FromUTF8(error.what())),
              Blame::Machine});
     }

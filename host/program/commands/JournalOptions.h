@@ -6,17 +6,22 @@
 /// Which journal a command works on, as it was given.
 struct JournalOptions {
     std::optional<std::string> journal;
+    std::optional<std::string> queue;
     std::optional<std::string> configuration;
 };
 
 /// A journal, and the folders that are configured with it, if they are known.
 struct NamedJournal {
-    std::filesystem::path file;
+    std::string where; ///< for OpenJournal
+    PathMap map;
     std::vector<wxString> folders;
 };
 
 /// @param options receives what is given, and outlives the parsing
 void AddJournalOptions(CLI::App& command, JournalOptions& options);
+
+/// Adds the option that names a queue, which machines share.
+void AddQueueUrl(CLI::App& command, std::optional<std::string>& url);
 
 /// The journal that is named, or that of the configuration that is; otherwise that of the folders
 /// which this machine watches, or the user's.

@@ -69,7 +69,7 @@ ExitCode Run(const QueueOptions& options, Journal& journal, const NamedJournal& 
 ExitCode TellNone(const NamedJournal& named, Reporter& reporter) {
     reporter.Line(wxString::Format(
         _("The queue is empty: there is no journal %s, so nothing has been found yet."),
-        Shown(named.file)));
+        ShownJournal(named.where)));
     return ExitCode::Done;
 }
 

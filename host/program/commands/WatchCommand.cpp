@@ -1,16 +1,13 @@
 #include "host/program/base/PathText.h"
-#include "host/program/commands/Command.h"
+#include "host/program/commands/JournalOptions.h"
+#include "host/program/commands/ServiceRun.h"
 #include "host/program/page/PageServer.h"
 #include "host/program/report/Readiness.h"
-#include "host/program/system/Interruption.h"
 #include "host/program/watch/ConfigurationCheck.h"
 #include "host/program/watch/FolderLock.h"
 #include "host/program/watch/FolderPlaces.h"
-#include "host/program/watch/WatchService.h"
-#include "machine/OfficeApplication.h"
 #include "plugin/settings/FilterSettings.h"
 
-#include <wx/filename.h>
 #include <wx/intl.h>
 
 #include <algorithm>
@@ -24,6 +21,7 @@ struct WatchOptions {
     std::optional<std::string> out;
     std::optional<std::string> configuration; ///< a file
     std::optional<std::string> journal;
+    std::optional<std::string> queue;
     std::optional<std::string> http;
     SettingsOptions settings;
     std::optional<unsigned> jobs;
@@ -84,6 +82,8 @@ std::optional<WatchConfiguration> ReadConfiguration(const WatchOptions& options,
         return std::nullopt;
     if (options.journal)
         configuration->journal = fs::absolute(FromArgument(*options.journal)).u8string();
+    if (options.queue)
+        configuration->journal = *options.queue;
     if (options.http)
         configuration->http = *options.http;
     if (options.jobs)
@@ -93,36 +93,6 @@ std::optional<WatchConfiguration> ReadConfiguration(const WatchOptions& options,
         return std::nullopt;
     }
     return configuration;
-}
-
-/// Tells the page's figures what becomes of documents.
-class PageAudience : public WatchService::Audience {
-public:
-    explicit PageAudience(PageServer& page) : m_page(page) {}
-
-    void OnEnd(const Job& job, const Outcome& outcome) override {
-        const auto application =
-            ApplicationForExtension(wxFileName(job.source.u8string()).GetExt());
-        m_page.Count(job.folder, NameOf(outcome.state), outcome.fault ? outcome.fault->code : 0,
-                     application ? NameOf(*application) : "", outcome.seconds.value_or(0));
-    }
-
-    void OnRetry(const Job& job) override { m_page.CountRetry(job.folder); }
-
-private:
-    PageServer& m_page;
-};
-
-WatchService::Means MeansOf(const WatchOptions& watch, const CommonOptions& options) {
-    WatchService::Means means;
-    means.workerArguments = WorkerArguments(options);
-    means.workerPatience = WorkerPatience(options);
-    means.language = options.language;
-    means.engineDocuments = options.engineDocuments;
-    means.once = watch.once;
-    if (watch.configuration)
-        means.reload = [watch](Fault& fault) { return ReadConfiguration(watch, fault); };
-    return means;
 }
 
 /// Whether the page could be shown; while the watch runs, it is.
@@ -149,31 +119,14 @@ ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Repor
         return TellCheck(*configuration, filters, reporter, FindObstacleOfPage(*configuration));
     if (const std::optional<Fault> missing = FindMissingFilter(filters))
         return reporter.Error(*missing);
-    const std::unique_ptr<Journal> journal = OpenJournal(configuration->journal, fault);
-    if (!journal)
-        return reporter.Error(fault);
-    StatusBoard board;
-    WatchService service(*configuration, MeansOf(watch, options), *journal, filters, board,
-                         reporter);
-    std::unique_ptr<PageServer> page;
-    std::optional<PageAudience> audience;
-    if (!configuration->http.empty()) {
-        const auto openJournal = [where = configuration->journal](Fault& why) {
-            return OpenJournal(where, why);
-        };
-        page = PageServer::Start(
-            configuration->http, openJournal, board, [&service] { service.Wake(); }, fault);
-        if (!page && watch.http)
-            return reporter.Error(fault);
-        if (!page) // documents are printed all the same
-            reporter.Error(
-                {wxString::Format(_("there is no page: %s"), fault.Text()), fault.blame});
-        else
-            service.SetAudience(&audience.emplace(*page));
+    ServiceRun run = {*configuration, MeansOf(options)};
+    run.means.once = watch.once;
+    run.pageIsAsked = watch.http.has_value();
+    if (watch.configuration) {
+        run.means.reload = [watch](Fault& why) { return ReadConfiguration(watch, why); };
+        run.obeysHangUp = true;
     }
-    if (watch.configuration)
-        Interruption::ReloadOnHangUp();
-    return service.Run();
+    return RunService(std::move(run), filters, reporter);
 }
 
 } // namespace
@@ -196,6 +149,7 @@ void AddWatch(CLI::App& program, Command& chosen) {
     AddFlag(watch, "--once", "End when all that has settled is done", given->once);
     AddOption(watch, "--journal", "FILE", "Where it is kept what is known of documents",
               given->journal);
+    AddQueueUrl(watch, given->queue);
     AddOption(watch, "--http", "HOST:PORT", "Where to show a page", given->http);
     AddSettingsOptions(watch, given->settings);
     AddJobs(watch, given->jobs);

@@ -17,6 +17,13 @@ public:
     using std::runtime_error::runtime_error; ///< UTF-8, in the library's words
 };
 
+/// Somebody else has claimed a job since, or it is gone: whoever had it has nothing to do with it
+/// any more.
+class JobLost : public std::runtime_error {
+public:
+    JobLost() : std::runtime_error("the job is somebody else's, or gone") {}
+};
+
 /// A document that has settled in a watched folder.
 struct NewJob {
     wxString folder;
@@ -122,6 +129,10 @@ public:
     virtual SharedJournal* Shared() { return nullptr; }
 };
 
+/// Stores all that has changed of a job.
+/// @throw JobLost when nothing is stored
+void Store(const Job& job, Journal& journal);
+
 /// What becomes of a journal that is not there, or damaged.
 enum class JournalNeed {
     Make,  ///< it is begun anew; a damaged one is set aside before, under a name that says so
@@ -134,11 +145,13 @@ enum class JournalNeed {
 ///     alone.
 /// @param map how the paths of a queue are called on this machine
 std::unique_ptr<Journal> OpenJournal(const std::string& where, Fault& fault,
-                                     JournalNeed need = JournalNeed::Make,
-                                     const PathMap& map = {});
+                                     JournalNeed need = JournalNeed::Make, const PathMap& map = {});
 
 /// Whether a journal is one that machines share, on a PostgreSQL server: postgres://…
 bool IsQueueUrl(const std::string& where);
+
+/// A journal's name for people: a password in it is left out.
+wxString ShownJournal(const std::string& where);
 
 /// The user's journal, where no other is named. UTF-8.
 std::string StandardJournal();

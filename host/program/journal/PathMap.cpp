@@ -53,6 +53,10 @@ fs::path PathMap::ToLocal(const std::string& shared) const {
     return rest.empty() ? share->second : share->second / fs::u8path(rest);
 }
 
+bool PathMap::IsName(const std::string& name) {
+    return name.size() > 1 && name.find_first_of("/:\\") == std::string::npos;
+}
+
 bool PathMap::Has(const std::string& shared) const {
     const std::size_t length = LengthOfName(shared);
     return length == std::string::npos || m_shares.count(shared.substr(0, length)) != 0;

@@ -20,6 +20,10 @@ public:
     /// @return the path itself when it is on no share, or one that this machine does not have
     std::filesystem::path ToLocal(const std::string& shared) const;
 
+    /// Whether a share can be called so: nothing else is taken for it, a drive's letter least of
+    /// all.
+    static bool IsName(const std::string& name);
+
     /// Whether this machine has it, whatever is there.
     bool Has(const std::string& shared) const;
 

@@ -128,6 +128,8 @@ std::optional<Settings> MakeRunSettings(const SettingsOptions& options, Fault& f
         if (!settings)
             fault = UnusableSettings(FromArgument(*options.file), fault);
     }
+    if (!options.file && options.text)
+        settings = Settings::FromXml(*options.text, fault);
     if (!settings)
         return std::nullopt;
     for (const std::string& assignment : options.assignments)

@@ -20,6 +20,7 @@ Fault UnusableSettings(const std::filesystem::path& file, const Fault& fault);
 /// What a command line says of the settings. Texts and paths are as they were given.
 struct SettingsOptions {
     std::optional<std::string> file;
+    std::optional<std::string> text;      ///< what it says, where the file is not there
     std::vector<std::string> assignments; ///< KEY=VALUE
     std::optional<std::string> printer;
     std::optional<bool> pdf; ///< true for PDF, false for PostScript only

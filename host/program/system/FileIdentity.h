@@ -18,6 +18,14 @@ struct FileIdentity {
     bool operator!=(const FileIdentity& other) const { return !(*this == other); }
 };
 
+/// Whether two machines may mean the same file. Each numbers devices and files in its own way, and
+/// file systems keep times more or less exactly.
+inline bool MayBeSame(const FileIdentity& one, const FileIdentity& other) {
+    constexpr std::int64_t Coarsest = 2'000'000'000; // of file systems that are in use
+    const std::int64_t apart = one.modified - other.modified;
+    return one.size == other.size && apart > -Coarsest && apart < Coarsest;
+}
+
 /// What a name stands for; a link is looked at itself, not followed.
 struct FileLook {
     FileIdentity identity;

@@ -157,6 +157,20 @@ fs::path NearestOf(fs::path folder) {
 }
 
 /// Why nothing could be kept of what is known of documents.
+std::optional<Fault> FindObstacleOfQueue(const WatchConfiguration& configuration) {
+    Fault fault; // one without tables will have them made by the watch
+    try {
+        const std::unique_ptr<Journal> queue =
+            OpenJournal(configuration.journal, fault, JournalNeed::Make, configuration.map);
+        return queue ? std::nullopt : std::optional(fault);
+    } catch (const JournalError& error) {
+        return Fault{
+            wxString::Format(_("the journal cannot be used: %s"), wxString::FromUTF8(error.what())),
+            Blame::Machine};
+    }
+}
+
+/// The same of a journal in a file.
 std::optional<Fault> FindObstacleOfJournal(const fs::path& journal) {
     const fs::path folder = NearestOf(journal.parent_path());
     if (!wxFileName::IsDirWritable(ToText(folder)))
@@ -179,8 +193,9 @@ std::optional<Fault> FindObstacleOfJournal(const fs::path& journal) {
 /// Where documents need room.
 std::vector<fs::path> PlacesOf(const WatchConfiguration& configuration) {
     std::error_code ignored;
-    std::vector<fs::path> places = {fs::temp_directory_path(ignored),
-                                    NearestOf(FromArgument(configuration.journal).parent_path())};
+    std::vector<fs::path> places = {fs::temp_directory_path(ignored)};
+    if (!IsQueueUrl(configuration.journal))
+        places.push_back(NearestOf(FromArgument(configuration.journal).parent_path()));
     for (const FolderConfiguration& folder : configuration.folders)
         places.push_back(NearestOf(folder.out));
     return places;
@@ -197,7 +212,9 @@ ExitCode TellCheck(const WatchConfiguration& configuration, const FilterSet& fil
         check.Tell(problem);
     for (const Fault& missing : FindMissing(filters, false))
         check.Tell(missing);
-    if (const auto obstacle = FindObstacleOfJournal(FromArgument(configuration.journal)))
+    const bool isShared = IsQueueUrl(configuration.journal);
+    if (const auto obstacle = isShared ? FindObstacleOfQueue(configuration)
+                                       : FindObstacleOfJournal(FromArgument(configuration.journal)))
         check.Tell(*obstacle);
     if (const auto shortage = FindShortage(PlacesOf(configuration), configuration.minFree))
         check.Tell(*shortage);

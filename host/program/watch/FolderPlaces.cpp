@@ -1,6 +1,7 @@
 #include "host/program/watch/FolderPlaces.h"
 
 #include "host/program/base/PathText.h"
+#include "host/program/journal/Journal.h"
 #include "host/program/system/FileIdentity.h"
 
 #include <wx/intl.h>
@@ -56,7 +57,8 @@ std::optional<Clash> FindClash(const WatchConfiguration& configuration) {
     const auto& folders = configuration.folders;
     const std::vector<Place> ins = PlacesOf(folders, &FolderConfiguration::in);
     const std::vector<Place> outs = PlacesOf(folders, &FolderConfiguration::out);
-    const Place journal(FromArgument(configuration.journal));
+    const Place journal(IsQueueUrl(configuration.journal) ? fs::path()
+                                                          : FromArgument(configuration.journal));
     const auto clash = [&](std::size_t folder, Clash::Place place, const wxString& format,
                            std::size_t other) {
         return Clash{folder, place, wxString::Format(format, folders[other].name)};

@@ -59,7 +59,7 @@ ScanResult FolderScan::Scan(Clock::time_point now) {
         if (!file.hasSettled || file.told || waits)
             continue;
         file.told = true;
-        result.settled.push_back({path, file.inside, file.look.identity});
+        result.settled.push_back({path, file.inside, file.look.identity, {}});
     }
     return result;
 }

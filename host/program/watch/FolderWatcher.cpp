@@ -2,6 +2,7 @@
 
 #include "host/program/base/PathText.h"
 #include "host/program/documents/OutputFolder.h"
+#include "host/program/system/Digest.h"
 #include "host/program/system/FileSystemKind.h"
 
 #include <wx/intl.h>
@@ -42,10 +43,10 @@ std::optional<Fault> MakeFolder(const fs::path& folder) {
 } // namespace
 
 FolderWatcher::FolderWatcher(const FolderConfiguration& configuration,
-                             std::set<std::string> extensions, bool wasUsed,
+                             std::set<std::string> extensions, bool digests, bool wasUsed,
                              std::function<void()> onNews)
-    : m_configuration(configuration), m_extensions(std::move(extensions)),
-      m_onNews(std::move(onNews)), m_wasUsed(wasUsed),
+    : m_configuration(configuration), m_extensions(std::move(extensions)), m_digests(digests),
+      m_onNews(std::move(onNews)), m_wasUsed(wasUsed || configuration.isOthers),
       m_alive(Clock::now().time_since_epoch().count()), m_thread([this] { Run(); }) {}
 
 FolderWatcher::~FolderWatcher() {
@@ -99,7 +100,20 @@ void FolderWatcher::Run() {
     }
 }
 
-/// Takes possession of the folder, where it is there.
+/// Has the folder for this program alone.
+/// @return why it has not
+std::optional<Fault> FolderWatcher::TakePossession() {
+    Fault fault;
+    m_lock = FolderLock::Take(m_configuration.in, fault);
+    if (!m_lock)
+        return fault;
+    for (const char* const name : {ProcessedFolder, FailedFolder})
+        if (auto obstacle = MakeFolder(m_configuration.in / name))
+            return obstacle;
+    return std::nullopt;
+}
+
+/// Begins with the folder, where it is there.
 /// @return why it is not
 std::optional<Fault> FolderWatcher::Open() {
     std::error_code error;
@@ -118,11 +132,8 @@ std::optional<Fault> FolderWatcher::Open() {
     if (!OutputFolder::Open(m_configuration.out, fault))
         return Away(wxString::Format(_("the output folder %s cannot be used: %s"),
                                      Shown(m_configuration.out), fault.what));
-    m_lock = FolderLock::Take(in, fault);
-    if (!m_lock)
-        return fault;
-    for (const char* const name : {ProcessedFolder, FailedFolder})
-        if (auto obstacle = MakeFolder(in / name))
+    if (!m_configuration.isOthers)
+        if (std::optional<Fault> obstacle = TakePossession())
             return obstacle;
     m_device = look.identity.device;
     m_isShare = IsShare(in);
@@ -141,16 +152,37 @@ std::optional<Fault> FolderWatcher::Open() {
     return std::nullopt;
 }
 
+/// @return nothing new where another machine does that
+ScanResult FolderWatcher::LookForDocuments(Clock::time_point now) {
+    if (m_configuration.isOthers)
+        return {};
+    ScanResult result = m_scan->Scan(now);
+    if (!m_digests)
+        return result;
+    std::error_code error;
+    for (SettledFile& file : std::exchange(result.settled, {})) {
+        file.digest = DigestOf(file.path, error, [this] { StayAlive(); });
+        if (error) // it is found anew, unless it has gone
+            m_forgetful = true;
+        else
+            result.settled.push_back(std::move(file));
+    }
+    return result;
+}
+
 void FolderWatcher::Scan() {
     std::error_code error;
     const FileLook look = LookAt(fs::canonical(m_configuration.in, error), error);
     if (!error && look.identity.device != m_device)
         return Close(Away(
             wxString::Format(_("%s is on another device than before"), Shown(m_configuration.in))));
+    if (error && m_configuration.isOthers)
+        return Close(Away(wxString::Format(_("%s cannot be seen: %s"), Shown(m_configuration.in),
+                                           Because(error))));
     if (m_forgetful.exchange(false))
         m_scan->Forget();
     const Clock::time_point start = Clock::now();
-    ScanResult result = m_scan->Scan(start);
+    ScanResult result = LookForDocuments(start);
     const fs::space_info space = fs::space(m_configuration.out, error);
     if (result.error || error)
         return Close(

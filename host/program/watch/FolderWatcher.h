@@ -9,15 +9,17 @@
 #include <thread>
 
 /// Watches one folder in a thread of its own, since a share may take its time to answer, or never
-/// do. It touches nothing but the folders' names: what is found is handed on.
+/// do. It touches nothing but the folders' names: what is found is handed on. Where another machine
+/// finds the documents, it only looks whether the folder can be reached from this one.
 class FolderWatcher {
 public:
     /// @param extensions of documents, in lower case, without dots
+    /// @param digests whether other machines are to know what is found
     /// @param wasUsed whether the folder had documents before: then it is not the right one, but
     ///     the place where a share is to be mounted, when nothing in it says so
     /// @param onNews called in the thread when there is something to take
     FolderWatcher(const FolderConfiguration& configuration, std::set<std::string> extensions,
-                  bool wasUsed, std::function<void()> onNews);
+                  bool digests, bool wasUsed, std::function<void()> onNews);
     ~FolderWatcher();
     FolderWatcher(const FolderWatcher&) = delete;
     FolderWatcher& operator=(const FolderWatcher&) = delete;
@@ -47,7 +49,9 @@ private:
 
     void Run();
     std::optional<Fault> Open();
+    std::optional<Fault> TakePossession();
     void Scan();
+    ScanResult LookForDocuments(Clock::time_point now);
     void Close(Fault fault);
     FolderScan::Rules MakeRules();
     void AwaitNextLook();
@@ -55,6 +59,7 @@ private:
 
     const FolderConfiguration m_configuration;
     const std::set<std::string> m_extensions;
+    const bool m_digests;
     const std::function<void()> m_onNews;
 
     // The thread's own.

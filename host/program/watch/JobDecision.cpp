@@ -18,65 +18,74 @@ constexpr int MostDeaths = 3;
 /// waits, so that another one comes first, in case it is this one that the machine cannot do.
 constexpr std::chrono::seconds GivenBackFor = 40s;
 
-JournalTime Now() {
-    return std::chrono::system_clock::now();
-}
+/// For how long a machine may not see what another one has found: what a share's client knows of a
+/// folder is some seconds old.
+constexpr std::chrono::seconds SharesAreLateFor = 60s;
+constexpr std::chrono::seconds BetweenLooks = 5s;
 
-void TryAgain(Job& job, std::chrono::seconds delay) {
+void TryAgain(Job& job, std::chrono::seconds delay, JournalTime now) {
     job.state = JobState::Waiting;
     job.workplace.clear();
     job.product.clear();
-    job.due = Now() + delay;
+    job.due = now + delay;
 }
 
 /// A file that is another by now is found anew.
-FolderNews DecideChange(Job& job, const FolderConfiguration& folder) {
+FolderNews DecideChange(Job& job, const FolderConfiguration& folder,
+                        const Circumstances& circumstances) {
     std::error_code error;
     if (!fs::is_directory(folder.in, error)) { // nobody can say what is in it
-        GiveBack(job);
+        GiveBack(job, circumstances);
+        return FolderNews::None;
+    }
+    if (circumstances.isShared && circumstances.now - job.inserted < SharesAreLateFor) {
+        GiveBack(job, circumstances);
+        job.due = circumstances.now + BetweenLooks;
         return FolderNews::None;
     }
     job.state = JobState::Vanished;
     job.open = false;
-    job.ended = Now();
+    job.ended = circumstances.now;
     return FolderNews::None;
 }
 
-FolderNews DecideFailure(Job& job, const Outcome& outcome, const FolderConfiguration& folder) {
+FolderNews DecideFailure(Job& job, const Outcome& outcome, const FolderConfiguration& folder,
+                         const Circumstances& circumstances) {
     job.fault = outcome.fault.value_or(Fault());
     if (job.fault->blame == Blame::Machine || job.fault->blame == Blame::Usage) {
-        GiveBack(job);
+        GiveBack(job, circumstances);
         return FolderNews::Blocked;
     }
     const auto attempt = static_cast<std::size_t>(std::max(job.attempts, 1));
     if (outcome.state == State::Refused || attempt > folder.retries.size())
-        End(job, JobState::Failed);
+        End(job, JobState::Failed, circumstances.now);
     else
-        TryAgain(job, folder.retries[attempt - 1]);
+        TryAgain(job, folder.retries[attempt - 1], circumstances.now);
     return FolderNews::Works;
 }
 
 } // namespace
 
-void GiveBack(Job& job) {
+void GiveBack(Job& job, const Circumstances& circumstances) {
     job.attempts = std::max(job.attempts - 1, 0);
-    TryAgain(job, GivenBackFor);
+    TryAgain(job, circumstances.isShared ? 0s : GivenBackFor, circumstances.now);
 }
 
-void End(Job& job, JobState state) {
+void End(Job& job, JobState state, JournalTime now) {
     job.state = state;
-    job.ended = Now();
+    job.ended = now;
     job.workplace.clear();
     job.product.clear();
 }
 
-FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder) {
+FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder,
+                           const Circumstances& circumstances) {
     job.seconds = outcome.seconds.value_or(0);
     job.text = outcome.text;
     if (outcome.state == State::Changed)
-        return DecideChange(job, folder);
+        return DecideChange(job, folder, circumstances);
     if (outcome.state != State::Converted)
-        return DecideFailure(job, outcome, folder);
+        return DecideFailure(job, outcome, folder, circumstances);
     job.fault.reset();
     job.workplace = outcome.made.parent_path();
     job.product = ToText(outcome.made.filename());
@@ -84,12 +93,12 @@ FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfigu
     return FolderNews::Works;
 }
 
-void DecideByDeath(Job& job, const wxString& text) {
+void DecideByDeath(Job& job, const wxString& text, JournalTime now) {
     if (++job.deaths < MostDeaths) {
-        TryAgain(job, 0s);
+        TryAgain(job, 0s, now);
         return;
     }
     job.fault = {wxString::Format(_("it ended the program %d times"), job.deaths)};
     job.text = text;
-    End(job, JobState::Failed);
+    End(job, JobState::Failed, now);
 }

@@ -59,7 +59,8 @@ bool IsSource(const Job& job, const fs::path& path) {
     std::error_code error;
     FileIdentity identity = LookAt(path, error).identity;
     identity.device = job.identity.device;
-    return !error && identity == job.identity;
+    return !error &&
+           (job.digest.empty() ? identity == job.identity : MayBeSame(identity, job.identity));
 }
 
 std::error_code WriteDurably(const fs::path& file, const std::string& text) {
@@ -94,11 +95,11 @@ Fault NotPutAway(const Job& job, const fs::path& to, const std::error_code& erro
             Blame::Machine};
 }
 
-bool Close(Job& job, Journal& journal) {
+void Close(Job& job, Journal& journal) {
     job.open = false;
     if (job.state == JobState::Finished)
         job.state = JobState::Archived;
-    return journal.Commit(job);
+    Store(job, journal);
 }
 
 } // namespace
@@ -116,15 +117,16 @@ std::optional<Fault> DeliverProduct(Job& job, const FolderConfiguration& folder,
         const wxString name = FreeName(wanted, job, [&](const wxString& base) {
             return !replaces && product.IsTaken(place, base);
         });
-        job.output = product.PlaceIn(place, name);
-        if (!journal.Commit(job))
-            return std::nullopt; // somebody else has it now
+        const fs::path before = std::exchange(job.output, product.PlaceIn(place, name));
+        Store(job, journal);
         std::optional<Fault> fault = product.MoveTo(place, name, replaces);
+        if (fault && !product.IsThere() && !before.empty())
+            job.output = before; // whoever had the job before was slow, and has moved it after all
         if (fault && product.IsThere() && (replaces || !IsThere(job.output)))
             return fault;
     }
-    End(job, JobState::Finished);
-    journal.Commit(job);
+    End(job, JobState::Finished, journal.Now());
+    Store(job, journal);
     return std::nullopt;
 }
 
@@ -137,8 +139,7 @@ std::optional<Fault> PutSourceAway(Job& job, const FolderConfiguration& folder, 
         if (const std::error_code error = MakeFolders(to, folder.in))
             return NotPutAway(job, to, error);
         job.aside = PlaceIn(to, job);
-        if (!journal.Commit(job))
-            return std::nullopt;
+        Store(job, journal);
         const std::error_code error = MoveWithoutReplacing(from, job.aside);
         if (error && error != std::errc::file_exists)
             return NotPutAway(job, to, error);

@@ -6,7 +6,7 @@
 
 // The last steps of a document's way. Each is told to the journal before it is done, so that
 // whoever finds the journal after the program was ended between any two of them knows what is left
-// to do, and does it by the same functions. They throw JournalError.
+// to do, and does it by the same functions. They throw JournalError and JobLost.
 
 /// Moves what was made of a document to its place, and makes the job Finished.
 /// @param job Delivering, with its workplace and its product

@@ -88,7 +88,7 @@ bool JobPrinting::Advance(std::int64_t ticket, Job& job, const FolderConfigurati
     if (job.state == JobState::Submitting && !order.reply.valid())
         Reconsider(order, job, folder);
     if (order.isToBeTold)
-        m_journal.Commit(job);
+        Store(job, m_journal);
     order.isToBeTold = false;
     if (!IsAtPrinter(job.state)) {
         m_orders.erase(ticket);
@@ -105,7 +105,7 @@ void JobPrinting::Reconsider(Order& order, Job& job, const FolderConfiguration& 
         return; // the server may have it
     if (!IsProductThere(job)) {
         Forget(job.print);
-        GiveBack(job);
+        GiveBack(job, {m_journal.Now(), m_journal.Shared() != nullptr});
         order.isToBeTold = true;
     } else if (job.print.number == 0 && !folder.print) {
         job.state = JobState::Delivering;
@@ -213,7 +213,7 @@ void JobPrinting::TakeEnd(const SpooledJob& found, Order& order, Job& job,
     job.text.clear();
     job.state = JobState::Delivering;
     if (!folder.print || !folder.print->keepsFiles)
-        End(job, JobState::Finished);
+        End(job, JobState::Finished, m_journal.Now());
     order.isToBeTold = true;
 }
 
@@ -232,7 +232,7 @@ void JobPrinting::TakeLoss(Order& order, Job& job, const FolderConfiguration& fo
 void JobPrinting::Fail(Order& order, Job& job, const Fault& fault) {
     job.fault = fault;
     job.text = m_errorText(fault.code);
-    End(job, JobState::Failed);
+    End(job, JobState::Failed, m_journal.Now());
     order.isToBeTold = true;
 }
 

@@ -15,12 +15,15 @@ public:
                 std::function<void()> onNews)
         : m_journal(journal), m_errorText(std::move(errorText)), m_onNews(std::move(onNews)) {}
 
-    /// Takes a job further, if its server has answered. Throws JournalError; the next call goes on
-    /// from there.
+    /// Takes a job further, if its server has answered. Throws JournalError, and JobLost; the next
+    /// call goes on from there.
     /// @param ticket tells the job from all others, as a journal may give its numbers again
     /// @param job Submitting or Printing; afterwards also Delivering, Finished, Failed or Waiting
     /// @return whether it is one of the latter, and the journal knows
     bool Advance(std::int64_t ticket, Job& job, const FolderConfiguration& folder);
+
+    /// Lets go of a job that somebody else has now.
+    void LetGo(std::int64_t ticket) { m_orders.erase(ticket); }
 
     /// Whether anything comes further without somebody's help, or that of time.
     bool IsBusy() const;
@@ -47,7 +50,7 @@ private:
         std::chrono::milliseconds delay{};
     };
 
-    static void Reconsider(Order& order, Job& job, const FolderConfiguration& folder);
+    void Reconsider(Order& order, Job& job, const FolderConfiguration& folder);
     void Begin(Order& order, Job& job, const FolderConfiguration& folder);
     void Take(const PrintReply& reply, Order& order, Job& job, const FolderConfiguration& folder);
     void TakeFault(const Fault& fault, Order& order, Job& job);

@@ -24,7 +24,7 @@ void RemoveOldDocuments(const FolderConfiguration& folder, Journal& journal) {
         JobQuery query;
         query.folder = folder.name;
         query.state = state;
-        query.endedBefore = std::chrono::system_clock::now() - lasts;
+        query.endedBefore = journal.Now() - lasts;
         query.limit = MostAtATime;
         for (const Job& job : journal.List(query)) {
             if (folder.keepProcessed && state == JobState::Archived && !job.aside.empty())

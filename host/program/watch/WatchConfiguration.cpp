@@ -28,6 +28,7 @@ struct Reading {
     WatchConfiguration watch = StandardWatchConfiguration();
     FolderConfiguration folder = StandardFolderConfiguration(); ///< or what holds for all
     std::vector<ConfigurationValue> folders{};                  ///< those of the configuration
+    std::string queue{};
 };
 
 using Keys = std::map<std::string, void (*)(Value, Reading&)>;
@@ -74,6 +75,27 @@ std::optional<std::chrono::seconds> ReadKeeping(Value value) {
                ? std::nullopt
                : std::optional(
                      std::chrono::duration_cast<std::chrono::seconds>(value.Time(0s, Longest)));
+}
+
+std::string ReadQueue(Value value) {
+    std::string url = value.Word().utf8_string();
+    if (!IsQueueUrl(url))
+        value.Refuse(_("it must be the URL of a database, such as "
+                       "\"postgres://quillon@server/quillon\""));
+    return url;
+}
+
+PathMap ReadMap(Value table, const Reading& reading) {
+    std::map<std::string, fs::path> shares;
+    for (const ConfigurationValue& value : table.Values()) {
+        if (!PathMap::IsName(value.Key()))
+            value.RefuseKey(
+                _("\"%s\" is no name for a share: it must have two letters at least, and "
+                  "no slash or colon"),
+                {});
+        shares[value.Key()] = ReadPath(value, reading);
+    }
+    return PathMap(std::move(shares));
 }
 
 std::string ReadAddress(Value value) {
@@ -197,6 +219,11 @@ const Keys RootKeys = {
     {"http", [](Value value, Reading& r) { r.watch.http = ReadAddress(value); }},
     {"jobs", [](Value value, Reading& r) { r.watch.jobs = static_cast<unsigned>(value.Number(0, MostWorkers)); }},
     {"journal", [](Value value, Reading& r) { r.watch.journal = ReadPath(value, r).u8string(); }},
+    {"lease", [](Value value, Reading& r) {
+         r.watch.lease = std::chrono::duration_cast<std::chrono::seconds>(value.Time(ShortestLease, LongestLease));
+     }},
+    {"map", [](Value value, Reading& r) { r.watch.map = ReadMap(value, r); }},
+    {"queue", [](Value value, Reading& r) { r.queue = ReadQueue(value); }},
 };
 // clang-format on
 
@@ -211,7 +238,23 @@ void CheckPlaces(Value root, const Reading& reading) {
         clash->what};
 }
 
-WatchConfiguration Read(const std::string& bytes, const fs::path& base) {
+/// A queue takes the place of the journal.
+void TakeQueue(Value root, Reading& reading) {
+    for (const ConfigurationValue& value : root.Values()) {
+        const bool isQueues = value.Key() == "map" || value.Key() == "lease";
+        if (isQueues && reading.queue.empty())
+            throw Misfit{value.KeyAt(),
+                         wxString::Format(_("\"%s\" is of use with a \"queue\" only"),
+                                          wxString::FromUTF8(value.Key()))};
+        if (value.Key() == "journal" && !reading.queue.empty())
+            throw Misfit{value.KeyAt(), _("there is a \"queue\", which takes the place of the "
+                                          "\"journal\"; keep one of them")};
+    }
+    if (!reading.queue.empty())
+        reading.watch.journal = reading.queue;
+}
+
+WatchConfiguration Read(const std::string& bytes, const fs::path& base, FoldersNeed need) {
     const toml::table table = toml::parse(bytes);
     const ConfigurationValue root(table);
     Reading reading{base};
@@ -219,7 +262,8 @@ WatchConfiguration Read(const std::string& bytes, const fs::path& base) {
         if (value.Key() == "defaults")
             ReadTable(value, DefaultsKeys, reading);
     ReadTable(root, RootKeys, reading);
-    if (reading.watch.folders.empty())
+    TakeQueue(root, reading);
+    if (reading.watch.folders.empty() && need == FoldersNeed::Some)
         throw Misfit{{1, 1}, _("there is no folder to watch; add one, as [[folder]]")};
     CheckPlaces(root, reading);
     return reading.watch;
@@ -247,7 +291,8 @@ std::chrono::milliseconds SettleTime(const FolderConfiguration& folder, bool isO
     return folder.settle.value_or(isOnShare ? 10s : 2s);
 }
 
-std::optional<WatchConfiguration> ReadWatchConfiguration(const fs::path& file, Fault& fault) {
+std::optional<WatchConfiguration> ReadWatchConfiguration(const fs::path& file, Fault& fault,
+                                                         FoldersNeed need) {
     std::optional<std::string> bytes = ReadBounded(file, fault);
     if (bytes && !bytes->empty() && wxString::FromUTF8(*bytes).empty()) {
         fault = {_("it is not valid UTF-8 text"), Blame::Usage};
@@ -265,7 +310,7 @@ std::optional<WatchConfiguration> ReadWatchConfiguration(const fs::path& file, F
     };
     try {
         std::error_code ignored;
-        return Read(*bytes, fs::absolute(file, ignored).parent_path());
+        return Read(*bytes, fs::absolute(file, ignored).parent_path(), need);
     } catch (const Misfit& misfit) {
         tell(misfit.at, misfit.what);
     } catch (const toml::parse_error& error) {

@@ -2,8 +2,7 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
-#include "host/program/report/OutcomeReport.h"
-#include "host/program/report/Progress.h"
+#include "host/program/machine/MissingParts.h"
 #include "host/program/system/Interruption.h"
 #include "host/program/system/ServiceManager.h"
 #include "host/program/watch/FreeSpace.h"
@@ -20,6 +19,7 @@ namespace {
 
 constexpr std::chrono::seconds BetweenHeartbeats = 10s;
 constexpr std::chrono::seconds BetweenStatuses = 1s;
+constexpr std::chrono::seconds BetweenMeetings = 5s;
 constexpr std::chrono::minutes BetweenRemovals = 1min;
 
 /// How long a document under way may take to be finished before the program ends, beyond what a
@@ -35,13 +35,25 @@ std::set<std::string> ExtensionsOf(const FilterSet& filters) {
     return extensions;
 }
 
+/// Extensions of documents that there is no application for on this machine.
+std::set<std::string> FindUnopenable(const FilterSet& filters) {
+    std::set<std::string> extensions;
+    for (const std::string& extension : ExtensionsOf(filters)) {
+        const auto application = ApplicationForExtension(wxString::FromUTF8(extension));
+        if (application && FindMissingApplication(*application))
+            extensions.insert(extension);
+    }
+    return extensions;
+}
+
 } // namespace
 
 WatchService::WatchService(WatchConfiguration configuration, Means means, Journal& journal,
                            const FilterSet& filters, StatusBoard& board, Reporter& reporter)
     : m_configuration(std::move(configuration)), m_means(std::move(means)), m_journal(journal),
-      m_filters(filters), m_board(board), m_reporter(reporter),
-      m_work({m_means.workerArguments, m_means.workerPatience, m_means.language,
+      m_filters(filters), m_board(board), m_reporter(reporter), m_report(reporter),
+      m_claimant({m_means.self.name, m_configuration.lease, {}}),
+      m_work({m_claimant, m_means.workerArguments, m_means.workerPatience, m_means.language,
               m_means.engineDocuments, m_configuration.jobs,
               [this](const Job& job, const Outcome& outcome) { OnEnd(job, outcome); },
               [this](const Job& job) {
@@ -49,10 +61,15 @@ WatchService::WatchService(WatchConfiguration configuration, Means means, Journa
                       m_audience->OnRetry(job);
               }},
              journal, m_folders, filters),
-      m_started(std::chrono::system_clock::now()) {}
+      m_started(std::chrono::system_clock::now()) {
+    if (SharedJournal* const shared = journal.Shared())
+        m_membership = std::make_unique<QueueMembership>(*shared, m_claimant, m_means.self,
+                                                         m_configuration.map);
+}
 
 ExitCode WatchService::Run() {
-    OpenFolders(m_configuration.folders);
+    if (m_means.self.finds)
+        OpenFolders(m_configuration.folders);
     bool isReady = false;
     while (!m_isOver && !(m_isDraining && IsDrained())) {
         Pass();
@@ -64,34 +81,23 @@ ExitCode WatchService::Run() {
             if (isReady)
                 TellReady();
         }
-        TellObstacles();
+        m_report.TellObstacles(m_folders);
         m_work.Step();
     }
     const ExitCode exitCode = Verdict();
     m_folders.clear();
     m_work.Close();
+    if (m_membership)
+        m_membership->TakeLeave();
     return exitCode;
 }
 
 void WatchService::TellReady() {
-    for (const WatchedFolder& folder : m_folders)
-        m_reporter.Line(wxString::Format(_("Watching %s; output goes to %s"),
-                                         Shown(folder.Configuration()->in),
-                                         Shown(folder.Configuration()->out)));
+    m_report.TellFolders(m_folders);
+    if (m_folders.empty())
+        m_reporter.Line(
+            _("No machine has told of a folder yet; documents are begun when one does."));
     ServiceManager::TellReady();
-}
-
-/// Says when a folder's documents wait for something, and when they do no longer.
-void WatchService::TellObstacles() {
-    for (const WatchedFolder& folder : m_folders) {
-        const std::optional<Fault> obstacle = folder.Obstacle();
-        const wxString text = obstacle ? obstacle->Text() : wxString();
-        wxString& told = m_obstacles[folder.Name()];
-        if (text == told)
-            continue;
-        told = text;
-        m_reporter.Line(folder.Name() + ": " + (text.empty() ? _("it goes on") : text));
-    }
 }
 
 /// With a journal that takes nothing, no document comes further.
@@ -109,7 +115,7 @@ ExitCode WatchService::Verdict() const {
     });
     if (isBlocked)
         return ExitCode::MachineAtFault;
-    return m_failed > 0 ? ExitCode::DocumentsAtFault : ExitCode::Done;
+    return m_report.HasFailures() ? ExitCode::DocumentsAtFault : ExitCode::Done;
 }
 
 void WatchService::OpenFolders(const std::vector<FolderConfiguration>& folders) {
@@ -117,8 +123,8 @@ void WatchService::OpenFolders(const std::vector<FolderConfiguration>& folders) 
     const std::map<wxString, FolderCounts> counts = m_journal.Counts();
     m_folders.clear();
     for (const FolderConfiguration& folder : folders)
-        m_folders.emplace_back(folder, extensions, counts.count(folder.name) != 0,
-                               [this] { m_work.Wake(); });
+        m_folders.emplace_back(folder, extensions, m_membership != nullptr,
+                               counts.count(folder.name) != 0, [this] { m_work.Wake(); });
 }
 
 /// @return why the watch cannot begin
@@ -159,14 +165,15 @@ void WatchService::Pass() {
     try {
         if (!m_isDraining && Interruption::ReloadRequested())
             Reload();
+        MeetOthers(now);
         m_paused = m_journal.Paused();
         LookAfterFolders();
-        if (!m_isDraining)
+        if (!m_isDraining && Works())
             m_work.BeginJobs();
         m_work.PrintJobs();
         const bool hasEnded = m_work.EndJob();
         m_work.Rest();
-        if (now - m_heartbeat > BetweenHeartbeats) {
+        if (now - m_heartbeat > std::min(BetweenHeartbeats, m_claimant.lease / 3)) {
             m_work.Heartbeat();
             m_heartbeat = now;
             if (m_isDraining)
@@ -195,77 +202,89 @@ void WatchService::Pass() {
 
 void WatchService::LookAfterFolders() {
     std::error_code none; // then engines have none either, and say so
-    const std::optional<Fault> shortage = FindShortage(
-        {fs::temp_directory_path(none), FromArgument(m_configuration.journal).parent_path()},
-        m_configuration.minFree);
+    std::vector<fs::path> places = {fs::temp_directory_path(none)};
+    if (!m_membership)
+        places.push_back(FromArgument(m_configuration.journal).parent_path());
+    const std::optional<Fault> shortage = FindShortage(places, m_configuration.minFree);
     if (std::exchange(m_mustForget, false))
         for (WatchedFolder& folder : m_folders)
             folder.Watcher().Forget();
     for (WatchedFolder& folder : m_folders) {
         folder.Update(m_paused, m_configuration.minFree, shortage);
         if (folder.View().awaitsAdmission) {
-            if (const std::size_t count = m_work.Recover(folder))
-                m_reporter.Line(wxString::Format(wxPLURAL("%s: recovered %zu document",
-                                                          "%s: recovered %zu documents",
-                                                          static_cast<unsigned>(count)),
-                                                 folder.Name(), count));
+            Recover(folder);
             folder.Watcher().Admit();
         }
         Insert(folder);
     }
 }
 
+void WatchService::Recover(WatchedFolder& folder) {
+    const std::size_t count = Works() ? m_work.Recover(folder) : 0;
+    if (count > 0)
+        m_reporter.Line(
+            wxString::Format(wxPLURAL("%s: recovered %zu document", "%s: recovered %zu documents",
+                                      static_cast<unsigned>(count)),
+                             folder.Name(), count));
+}
+
+/// Whether it converts documents, too.
+bool WatchService::Works() const {
+    return !m_membership || !m_means.self.finds || m_configuration.jobs > 0;
+}
+
+/// Tells others that have the same journal of this machine, hears of them, and takes over what they
+/// have lost.
+void WatchService::MeetOthers(Clock::time_point now) {
+    if (!m_membership || now - m_met < std::min(BetweenMeetings, m_claimant.lease / 3))
+        return;
+    if (m_means.self.finds)
+        m_untold = m_membership->Announce(m_configuration.folders);
+    else if (const auto folders = m_membership->News())
+        OpenFolders(*folders);
+    if (Works())
+        m_claimant.cannot = FindUnopenable(m_filters);
+    for (WatchedFolder& folder : m_folders)
+        if (folder.MayBegin(now))
+            Recover(folder);
+    m_membership->Report(Status());
+    m_met = now;
+}
+
 void WatchService::Insert(WatchedFolder& folder) {
     std::vector<NewJob> jobs;
     for (SettledFile& file : folder.Watcher().Take())
         jobs.push_back({folder.Name(), std::move(file.path), file.inside, file.identity,
-                        folder.Configuration()->priority});
+                        folder.Configuration()->priority, std::move(file.digest)});
     if (jobs.empty())
         return;
     m_journal.Insert(jobs);
     m_work.Expect();
 }
 
-void WatchService::TellStatus() {
-    m_told = Clock::now();
+WatchStatus WatchService::Status() const {
     WatchStatus status;
     status.started = m_started;
     status.lastPass = m_lastPass;
     if (!m_journalFault.empty())
         status.journalFault = wxString::Format(_("the journal cannot be used: %s"), m_journalFault);
     status.draining = m_isDraining;
-    for (const WatchedFolder& folder : m_folders)
+    for (const WatchedFolder& folder : m_folders) {
         status.folders.push_back(folder.Status());
+        wxString& obstacle = status.folders.back().obstacle;
+        if (const auto untold = m_untold.find(folder.Name()); untold != m_untold.end())
+            obstacle << (obstacle.empty() ? "" : "; ") << untold->second.Text();
+    }
     status.running = m_work.Running();
-    wxString line = wxString::Format(_("%zu under way, %zu done, %zu failed"),
-                                     status.running.size(), m_done, m_failed);
-    if (!m_journalFault.empty())
-        line << "; " << status.journalFault;
-    for (const FolderStatus& folder : status.folders)
-        if (!folder.obstacle.empty())
-            line << "; " << folder.configuration.name << ": " << folder.obstacle;
-    ServiceManager::TellStatus(line);
-    ShowProgress(status.running);
-    m_board.Put(std::move(status));
+    return status;
 }
 
-/// At a terminal: how far what came together has come.
-void WatchService::ShowProgress(const std::vector<RunningDocument>& running) {
-    if (running.empty()) {
-        m_burst = Clock::now();
-        m_doneBefore = m_done + m_failed;
-        return;
-    }
-    if (!m_reporter.ForTerminal() || !m_journalFault.empty())
-        return;
-    const std::size_t done = m_done + m_failed - m_doneBefore;
-    const std::size_t all = done + running.size() + m_work.Waiting();
-    wxString text = wxString::Format(_("%zu of %zu"), done, all) + "  ";
-    const wxString left = TimeLeft(Clock::now() - m_burst, done, all);
-    text << (left.empty() ? left : left + "  ");
-    for (const RunningDocument& document : running)
-        text << document.name << (&document == &running.back() ? "" : ", ");
-    m_reporter.Passing(ProgressLine(static_cast<int>(done * 100 / all), text));
+void WatchService::TellStatus() {
+    m_told = Clock::now();
+    WatchStatus status = Status();
+    ServiceManager::TellStatus(m_report.Line(status));
+    m_report.ShowProgress(status, m_work.Waiting());
+    m_board.Put(std::move(status));
 }
 
 /// Whether nothing is left that has settled, or may yet.
@@ -282,8 +301,7 @@ bool WatchService::IsDone() const {
 }
 
 void WatchService::OnEnd(const Job& job, const Outcome& outcome) {
-    ++(job.state == JobState::Failed ? m_failed : m_done);
-    Tell(outcome, m_reporter);
+    m_report.Tell(job, outcome);
     if (m_audience)
         m_audience->OnEnd(job, outcome);
 }

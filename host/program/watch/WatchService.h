@@ -1,13 +1,17 @@
 #pragma once
 
-#include "host/program/report/Reporter.h"
+#include "host/program/watch/QueueMembership.h"
+#include "host/program/watch/WatchReport.h"
 #include "host/program/watch/WatchWork.h"
 
 /// A watch: finds documents in folders and has them converted, until it is asked to end. What is
-/// under way then is finished.
+/// under way then is finished. Where machines share the journal, one may do the former alone, and
+/// others the latter.
 class WatchService {
 public:
     struct Means {
+        /// This program, as it is told to others that have the same journal.
+        Machine self;
         std::vector<std::string> workerArguments;
         std::chrono::seconds workerPatience{};
         std::optional<std::string> language;
@@ -48,10 +52,12 @@ private:
     void Pass();
     void LookAfterFolders();
     void Insert(WatchedFolder& folder);
+    void MeetOthers(Clock::time_point now);
+    bool Works() const;
+    void Recover(WatchedFolder& folder);
     void TellReady();
-    void TellObstacles();
+    WatchStatus Status() const;
     void TellStatus();
-    void ShowProgress(const std::vector<RunningDocument>& running);
     bool IsDone() const;
     bool IsDrained() const;
     ExitCode Verdict() const;
@@ -63,8 +69,12 @@ private:
     const FilterSet& m_filters;
     StatusBoard& m_board;
     Reporter& m_reporter;
+    WatchReport m_report;
     Audience* m_audience = nullptr;
 
+    Claimant m_claimant;
+    std::unique_ptr<QueueMembership>
+        m_membership; ///< null when the journal is this machine's alone
     std::set<wxString> m_paused;
     WatchWork::Folders m_folders;
     WatchWork m_work;
@@ -73,14 +83,11 @@ private:
     Clock::time_point m_lastPass = Clock::now(); ///< that was whole
     Clock::time_point m_heartbeat;
     Clock::time_point m_told;
+    Clock::time_point m_met;            ///< others
+    std::map<wxString, Fault> m_untold; ///< why folders cannot be told of
     Clock::time_point m_removedOld;
     wxString m_journalFault;
-    std::map<wxString, wxString> m_obstacles; ///< that have been told, by folder
-    bool m_mustForget = false;                ///< what was found may not be in the journal
+    bool m_mustForget = false; ///< what was found may not be in the journal
     bool m_isDraining = false;
     bool m_isOver = false; ///< with `once`
-    std::size_t m_done = 0;
-    std::size_t m_failed = 0;
-    Clock::time_point m_burst; ///< since when something has been under way all the time
-    std::size_t m_doneBefore = 0;
 };

@@ -26,12 +26,6 @@ constexpr std::chrono::seconds QuietAfter = 60s;
 constexpr std::chrono::seconds UpcomingLasts = 1s;
 constexpr std::size_t MostUpcoming = 64;
 
-Claimant ThisProgram() {
-    Claimant claimant;
-    claimant.name = wxString::Format("%s:%lu", wxGetHostName(), wxGetProcessId());
-    return claimant;
-}
-
 Input InputOf(const Job& job) {
     return {job.source, job.source, true};
 }
@@ -44,7 +38,7 @@ WatchWork::Clock::time_point Now() {
 
 WatchWork::WatchWork(Means means, Journal& journal, Folders& folders, const FilterSet& filters)
     : m_means(std::move(means)), m_journal(journal), m_folders(folders), m_filters(filters),
-      m_claimant(ThisProgram()), m_pool(m_means.workerArguments, m_means.workerPatience, *this),
+      m_pool(m_means.workerArguments, m_means.workerPatience, *this),
       m_printing(
           journal, [&filters](int code) { return filters.ErrorText(code); },
           [this] { m_pool.Wake(); }) {}
@@ -71,7 +65,7 @@ void WatchWork::Step() {
 
 std::size_t WatchWork::Recover(WatchedFolder& folder) {
     std::size_t count = 0;
-    for (Job& job : m_journal.TakeOver(folder.Name(), m_claimant)) {
+    for (Job& job : m_journal.TakeOver(folder.Name(), m_means.claimant)) {
         if (UnderWay* const known = FindUnderWay(job)) {
             known->job.token = job.token; // the folder was away, its document was not
             continue;
@@ -82,7 +76,7 @@ std::size_t WatchWork::Recover(WatchedFolder& folder) {
         if (!job.workplace.empty())
             work.workplace = Workplace::TakeOver(job.workplace.parent_path());
         if (job.state == JobState::Converting) {
-            DecideByDeath(job, m_filters.ErrorText(ConversionFailed));
+            DecideByDeath(job, m_filters.ErrorText(ConversionFailed), m_journal.Now());
             work.isToBeTold = true;
         }
         work.job = std::move(job);
@@ -120,7 +114,7 @@ void WatchWork::BeginJobs() {
             if (folder.MayBegin(now))
                 claimable.push_back({folder.Name(), folder.Configuration()->byName});
         std::optional<Job> job =
-            claimable.empty() ? std::nullopt : m_journal.Claim(claimable, m_claimant);
+            claimable.empty() ? std::nullopt : m_journal.Claim(claimable, m_means.claimant);
         if (!job)
             return;
         if (WatchedFolder* const folder = Find(job->folder))
@@ -170,6 +164,13 @@ std::optional<Fault> WatchWork::Prepare(UnderWay& work, WatchedFolder& folder,
         folder.Configuration()->language ? folder.Configuration()->language : m_means.language;
     assignment.engineDocuments = EngineDocuments();
     assignment.identity = work.job.identity;
+    assignment.digest = work.job.digest;
+    if (!work.job.digest.empty()) { // this machine has numbers of its own for it
+        std::error_code error;
+        const FileIdentity seen = LookAt(work.job.source, error).identity;
+        if (MayBeSame(seen, work.job.identity) && !error)
+            assignment.identity = seen;
+    }
     assignment.asItIs = folder.Configuration()->others == Others::Pass &&
                         !m_filters.Claiming(ExtensionOf(assignment.input));
     return std::nullopt;
@@ -198,17 +199,37 @@ bool WatchWork::EndJob() {
     UnderWay& work = entry->second;
     if (work.outcome && work.job.state == JobState::Converting)
         Decide(work);
-    if (End(work))
+    try {
+        if (End(work))
+            m_ending.erase(entry);
+        else if (IsAtPrinter(work.job.state))
+            m_atPrinter.insert(m_ending.extract(entry));
+    } catch (const JobLost&) {
+        Abandon(work);
         m_ending.erase(entry);
-    else if (IsAtPrinter(work.job.state))
-        m_atPrinter.insert(m_ending.extract(entry));
+    }
     return true;
+}
+
+/// Leaves a document to whoever has claimed it while this program gave no signs, and with it what
+/// may have been made of it: that one moves it, or sweeps it.
+void WatchWork::Abandon(UnderWay& work) {
+    SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+        << "Document " << std::to_string(work.job.id) << " of " << work.job.folder
+        << " is somebody else's by now: this program was too slow, or could not be heard";
+    if (work.workplace && HasProduct(work.job.state))
+        work.workplace->Leave();
+}
+
+Circumstances WatchWork::PresentCircumstances() {
+    return {m_journal.Now(), m_journal.Shared() != nullptr};
 }
 
 /// What the worker's outcome means for the document and its folder.
 void WatchWork::Decide(UnderWay& work) {
     Job& job = work.job;
-    const FolderNews news = DecideByOutcome(job, *work.outcome, *work.folder);
+    const FolderNews news =
+        DecideByOutcome(job, *work.outcome, *work.folder, PresentCircumstances());
     WatchedFolder* const folder = Find(job.folder);
     if (folder && news == FolderNews::Works)
         folder->Unblock();
@@ -226,7 +247,7 @@ void WatchWork::Decide(UnderWay& work) {
 /// @return whether no step is left
 bool WatchWork::End(UnderWay& work) {
     if (work.isToBeTold)
-        m_journal.Commit(work.job);
+        Store(work.job, m_journal);
     work.isToBeTold = false;
     if (IsAtPrinter(work.job.state))
         return false;
@@ -247,9 +268,15 @@ void WatchWork::PrintJobs() {
         UnderWay& work = current->second;
         const WatchedFolder* const folder = Find(work.job.folder);
         const bool hasOther = folder && folder->Configuration()->print; // a queue's name was mended
-        if (m_printing.Advance(current->first, work.job,
-                               hasOther ? *folder->Configuration() : *work.folder))
-            m_ending.insert(m_atPrinter.extract(current));
+        try {
+            if (m_printing.Advance(current->first, work.job,
+                                   hasOther ? *folder->Configuration() : *work.folder))
+                m_ending.insert(m_atPrinter.extract(current));
+        } catch (const JobLost&) {
+            Abandon(work);
+            m_printing.LetGo(current->first);
+            m_atPrinter.erase(current);
+        }
     }
     for (WatchedFolder& folder : m_folders)
         if (const auto& print = folder.Configuration()->print)
@@ -299,8 +326,9 @@ void WatchWork::Heartbeat() {
     std::vector<std::int64_t> jobs;
     for (const auto* const works : {&m_underWay, &m_atPrinter, &m_ending})
         for (const auto& [ticket, work] : *works)
-            jobs.push_back(work.job.id);
-    m_journal.Heartbeat(m_claimant, jobs);
+            if (work.next == Clock::time_point()) // otherwise another machine may do better
+                jobs.push_back(work.job.id);
+    m_journal.Heartbeat(m_means.claimant, jobs);
 }
 
 void WatchWork::LookAtUpcoming() {

@@ -2,6 +2,7 @@
 
 #include "host/program/documents/Workplace.h"
 #include "host/program/filters/FilterSet.h"
+#include "host/program/watch/JobDecision.h"
 #include "host/program/watch/JobEnding.h"
 #include "host/program/watch/JobPrinting.h"
 #include "host/program/watch/WatchedFolder.h"
@@ -19,6 +20,7 @@ public:
     using Clock = std::chrono::steady_clock;
 
     struct Means {
+        const Claimant& claimant; ///< this program; outlives the work
         std::vector<std::string> workerArguments;
         std::chrono::seconds workerPatience{};
         std::optional<std::string> language;     ///< where a folder has none
@@ -35,7 +37,7 @@ public:
     WatchWork(const WatchWork&) = delete;
     WatchWork& operator=(const WatchWork&) = delete;
 
-    /// Puts a folder's affairs in order that an earlier program has left.
+    /// Puts a folder's affairs in order that an earlier program has left, or another machine.
     /// @return how many documents there were
     std::size_t Recover(WatchedFolder& folder);
 
@@ -90,8 +92,10 @@ private:
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
     UnderWay* FindUnderWay(const Job& job);
     void Sweep(const std::filesystem::path& outputFolder);
+    Circumstances PresentCircumstances();
     void Decide(UnderWay& work);
     bool End(UnderWay& work);
+    static void Abandon(UnderWay& work);
     std::optional<Fault> DoLastSteps(UnderWay& work);
     void Report(UnderWay& work) const;
     WatchedFolder* Find(const wxString& name);
@@ -108,7 +112,6 @@ private:
     Folders& m_folders;
     const FilterSet& m_filters;
     const TextsOfLanguages m_texts;
-    const Claimant m_claimant;
     // By tickets of its own: a journal that is begun anew gives its numbers again.
     WorkerPool::Ticket m_lastTicket = 0;
     std::map<WorkerPool::Ticket, UnderWay> m_underWay;  ///< with a worker

@@ -17,10 +17,10 @@ constexpr std::chrono::seconds SettingsLast = 60s;
 } // namespace
 
 WatchedFolder::WatchedFolder(const FolderConfiguration& configuration,
-                             std::set<std::string> extensions, bool wasUsed,
+                             std::set<std::string> extensions, bool digests, bool wasUsed,
                              std::function<void()> onNews)
     : m_configuration(std::make_shared<const FolderConfiguration>(configuration)),
-      m_watcher(*m_configuration, std::move(extensions), wasUsed, std::move(onNews)) {}
+      m_watcher(*m_configuration, std::move(extensions), digests, wasUsed, std::move(onNews)) {}
 
 void WatchedFolder::Update(const std::set<wxString>& paused, std::uintmax_t minFree,
                            const std::optional<Fault>& shortage) {
@@ -65,6 +65,7 @@ std::optional<std::string> WatchedFolder::Settings() {
     SettingsOptions options;
     if (m_configuration->settings)
         options.file = m_configuration->settings->u8string();
+    options.text = m_configuration->settingsText;
     options.assignments = m_configuration->assignments;
     Fault fault;
     const auto settings = MakeRunSettings(options, fault);

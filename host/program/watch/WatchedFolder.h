@@ -14,9 +14,9 @@ public:
 
     /// @param extensions of documents, in lower case, without dots
     /// @param wasUsed whether the journal has had documents of it
-    /// @param onNews see FolderWatcher
+    /// @param digests and onNews see FolderWatcher
     WatchedFolder(const FolderConfiguration& configuration, std::set<std::string> extensions,
-                  bool wasUsed, std::function<void()> onNews);
+                  bool digests, bool wasUsed, std::function<void()> onNews);
 
     /// Also for documents that are still under way when the folder is watched no more.
     const std::shared_ptr<const FolderConfiguration>& Configuration() const {

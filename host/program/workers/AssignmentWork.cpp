@@ -3,6 +3,7 @@
 #include "host/program/base/PathText.h"
 #include "host/program/documents/Conversion.h"
 #include "host/program/documents/Delivery.h"
+#include "host/program/system/Digest.h"
 
 #include <wx/intl.h>
 
@@ -13,7 +14,9 @@ namespace {
 /// @return whether the file is not the one that the assignment means
 bool HasChanged(const Assignment& work) {
     std::error_code error;
-    return work.identity && (LookAt(work.input.full, error).identity != *work.identity || error);
+    if (work.identity && (LookAt(work.input.full, error).identity != *work.identity || error))
+        return true;
+    return !work.digest.empty() && (DigestOf(work.input.full, error) != work.digest || error);
 }
 
 Outcome ChangedOutcome(const Assignment& work) {

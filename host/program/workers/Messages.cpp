@@ -111,7 +111,8 @@ std::string Encode(const Assignment& assignment) {
                     {"workplace", assignment.workplace.u8string()},
                     {"settings", assignment.settings},
                     {"engineDocuments", assignment.engineDocuments},
-                    {"asItIs", assignment.asItIs}};
+                    {"asItIs", assignment.asItIs},
+                    {"digest", assignment.digest}};
     if (assignment.language)
         message["language"] = *assignment.language;
     if (assignment.identity)
@@ -136,6 +137,7 @@ std::optional<Assignment> DecodeAssignment(const std::string& line) {
         assignment.settings = message.at("settings");
         assignment.engineDocuments = message.at("engineDocuments");
         assignment.asItIs = message.at("asItIs");
+        assignment.digest = message.at("digest");
         if (message.contains("language"))
             assignment.language = message["language"];
         if (message.contains("identity")) {

@@ -23,6 +23,7 @@ struct Assignment {
     std::optional<std::string> language;  ///< of what is said of it; the program's if not given
     unsigned engineDocuments = 1;         ///< until an engine is started anew
     std::optional<FileIdentity> identity; ///< what the file must be, before and after
+    std::string digest;                   ///< likewise; see Job. Empty when nobody knows
     bool asItIs = false;                  ///< the output is a copy of the file; no filter is asked
 };
 

@@ -1,0 +1,91 @@
+#include "host/program/watch/QueueMembership.h"
+
+#include "common/WQServices.h"
+#include "host/program/watch/FolderAnnouncement.h"
+
+#include <wx/intl.h>
+
+#include <algorithm>
+
+std::map<wxString, Fault>
+QueueMembership::Announce(const std::vector<FolderConfiguration>& folders) {
+    std::vector<AnnouncedFolder> announced;
+    std::map<wxString, Fault> faults;
+    for (const FolderConfiguration& folder : folders) {
+        Fault fault;
+        if (std::optional<AnnouncedFolder> each = AnnouncementOf(folder, m_map, fault))
+            announced.push_back(std::move(*each));
+        else
+            faults[folder.name] = fault;
+    }
+    if (announced != m_announced)
+        m_journal.Announce(announced);
+    m_announced = std::move(announced);
+    return faults;
+}
+
+std::optional<std::vector<FolderConfiguration>> QueueMembership::News() {
+    std::vector<AnnouncedFolder> heard = m_journal.Announced();
+    if (m_heard == heard)
+        return std::nullopt;
+    std::vector<FolderConfiguration> folders;
+    m_refused.clear();
+    for (const AnnouncedFolder& announced : heard) {
+        Fault fault;
+        if (std::optional<FolderConfiguration> folder = FolderOf(announced, m_map, fault)) {
+            folders.push_back(std::move(*folder));
+            continue;
+        }
+        m_refused << (m_refused.empty() ? "" : "; ") << announced.name << ": " << fault.Text();
+        SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
+            << "The folder " << announced.name << " is not worked for: " << fault.Text();
+    }
+    m_heard = std::move(heard);
+    return folders;
+}
+
+void QueueMembership::Report(const WatchStatus& status) {
+    m_self.running = status.running.size();
+    m_self.obstacle = m_refused;
+    for (const FolderStatus& folder : status.folders)
+        if (!folder.obstacle.empty())
+            m_self.obstacle << (m_self.obstacle.empty() ? "" : "; ") << folder.configuration.name
+                            << ": " << folder.obstacle;
+    m_self.cannot = m_claimant.cannot;
+    m_journal.Report(m_self, m_claimant);
+}
+
+void QueueMembership::TakeLeave() {
+    try {
+        m_journal.TakeLeave(m_self.name);
+    } catch (const JournalError& error) {
+        SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__)
+            << "The queue does not know that this machine ends: " << error.what();
+    }
+}
+
+std::optional<Fault> FindMisfit(const PageMakers& makers, const std::vector<Machine>& machines) {
+    const auto measure = std::find_if(machines.begin(), machines.end(), [](const Machine& machine) {
+        return machine.isAlive && !machine.takesAnyVersion && !machine.makers.program.empty();
+    });
+    if (measure == machines.end() || measure->makers == makers)
+        return std::nullopt;
+    const PageMakers& others = measure->makers;
+    wxString differences;
+    const auto compare = [&differences](const wxString& what, const wxString& here,
+                                        const wxString& there) {
+        if (here != there)
+            differences << (differences.empty() ? "" : "; ")
+                        << wxString::Format(_("%s is %s here and %s there"), what, here, there);
+    };
+    const auto shown = [](const wxString& text) { return text.empty() ? _("none") : text; };
+    compare("quillon", shown(makers.program), shown(others.program));
+    compare(_("what opens documents"), shown(makers.office), shown(others.office));
+    compare(_("what makes PDF"), shown(makers.pdf), shown(others.pdf));
+    compare(_("the set of fonts"), shown(makers.fonts.Left(8)), shown(others.fonts.Left(8)));
+    return Fault{wxString::Format(_("pages could look another way from this machine than from %s: "
+                                    "%s"),
+                                  measure->name, differences),
+                 Blame::Usage, ConversionFailed,
+                 _("Install the same on both, or say --any-version")};
+}
