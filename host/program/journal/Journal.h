@@ -31,7 +31,7 @@ struct NewJob {
     wxString inside;
     FileIdentity identity;
     int priority = 50;
-    std::string digest; ///< see Job
+    std::string digest{}; ///< see Job
 };
 
 /// A watched folder whose documents may be begun.
@@ -46,7 +46,7 @@ struct Claimant {
     std::chrono::seconds lease{30}; ///< for how long without a heartbeat
     /// Extensions of documents that it has nothing to convert with; in lower case, without dots.
     /// Only a shared journal has anybody else for them.
-    std::set<std::string> cannot;
+    std::set<std::string> cannot{};
 };
 
 /// Which jobs are asked for; what is not set asks for all.

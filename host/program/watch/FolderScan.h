@@ -13,7 +13,7 @@ struct SettledFile {
     wxString
         inside; ///< the folder inside the watched one, with '/'; empty when it lies directly there
     FileIdentity identity;
-    std::string digest; ///< where other machines are to know it; see Job
+    std::string digest{}; ///< where other machines are to know it; see Job
 };
 
 /// What one scan came to.
