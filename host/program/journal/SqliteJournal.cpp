@@ -1,8 +1,8 @@
 #include "host/program/journal/SqliteJournal.h"
 
-#include "host/program/journal/JobRow.h"
 #include "host/program/journal/SqliteClaim.h"
 #include "host/program/journal/SqliteFile.h"
+#include "host/program/journal/SqliteRow.h"
 
 #include <algorithm>
 
