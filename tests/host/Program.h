@@ -43,6 +43,8 @@ public:
     /// Asks it to end, and when it has taken that in, once more.
     void InterruptTwice() const;
     RunResult Wait();
+    /// Whether it has, by itself or not.
+    bool HasEnded() const;
 
     /// What it has said so far on stderr.
     std::string Err() const { return ReadBytes(m_folder / "err"); }

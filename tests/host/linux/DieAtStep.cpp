@@ -1,5 +1,5 @@
-// Loaded in front of the program's libraries: ends `quillon watch` before its Nth step that a file
-// system keeps, as a power failure does at any moment.
+// Loaded in front of the program's libraries: ends `quillon watch` or `quillon serve` before its Nth
+// step that a file system keeps, as a power failure does at any moment.
 
 #include <dlfcn.h>
 #include <sys/stat.h>
@@ -14,21 +14,21 @@
 namespace {
 
 /// Its workers have the same environment, and are not meant.
-bool IsWatch() {
+bool IsService() {
     char arguments[4096] = {};
     std::FILE* const file = std::fopen("/proc/self/cmdline", "r");
     const std::size_t read = file ? std::fread(arguments, 1, sizeof arguments - 1, file) : 0;
     if (file)
         std::fclose(file);
     for (const char* word = arguments; word < arguments + read; word += std::strlen(word) + 1)
-        if (std::strcmp(word, "watch") == 0)
+        if (std::strcmp(word, "watch") == 0 || std::strcmp(word, "serve") == 0)
             return true;
     return false;
 }
 
 long StepToDieAt() {
     const char* const step = std::getenv("TEST_DIE_AT_STEP");
-    return step && IsWatch() ? std::strtol(step, nullptr, 10) : 0;
+    return step && IsService() ? std::strtol(step, nullptr, 10) : 0;
 }
 
 void Step() {

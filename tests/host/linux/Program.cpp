@@ -47,6 +47,12 @@ void RunningProgram::Terminate() const {
     kill(static_cast<pid_t>(m_process), SIGTERM);
 }
 
+bool RunningProgram::HasEnded() const {
+    siginfo_t ended = {};
+    return waitid(P_PID, static_cast<id_t>(m_process), &ended, WEXITED | WNOHANG | WNOWAIT) == 0 &&
+           ended.si_pid != 0;
+}
+
 int RunningProgram::ExitCode() {
     int status = 0;
     waitpid(static_cast<pid_t>(m_process), &status, 0);

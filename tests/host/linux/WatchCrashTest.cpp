@@ -1,7 +1,7 @@
 #include "tests/host/WatchRun.h"
+#include "tests/host/linux/DyingProgram.h"
 
 #include <csignal>
-#include <cstdlib>
 
 namespace {
 
@@ -9,21 +9,10 @@ using testing::ElementsAre;
 
 class WatchCrashTest : public WatchRun {
 protected:
-    void TearDown() override { unsetenv("TEST_DIE_AT_STEP"); }
-
     /// @return whether it was ended
     bool DieAt(int step) const {
-        setenv("TEST_DIE_AT_STEP", std::to_string(step).c_str(), 1);
-        setenv("LD_PRELOAD", DIE_AT_STEP, 1);
-        const char* const given = std::getenv("ASAN_OPTIONS");
-        const std::string sanitizer = given ? given : "";
-        setenv("ASAN_OPTIONS", (sanitizer + ":verify_asan_link_order=0").c_str(),
-               1); // it is second
-        const RunResult run = WatchOnce();
-        setenv("ASAN_OPTIONS", sanitizer.c_str(), 1);
-        unsetenv("LD_PRELOAD");
-        unsetenv("TEST_DIE_AT_STEP");
-        return run.exitCode == -SIGKILL;
+        const DyingProgram dying(step);
+        return WatchOnce().exitCode == -SIGKILL;
     }
 
     void Begin() const {

@@ -99,6 +99,10 @@ void RunningProgram::Terminate() const {
     Send(RunsOnWine() ? CTRL_C_EVENT : CTRL_BREAK_EVENT, m_process); // Wine lacks the other
 }
 
+bool RunningProgram::HasEnded() const {
+    return WaitForSingleObject(HandleOf(m_process), 0) == WAIT_OBJECT_0;
+}
+
 int RunningProgram::ExitCode() {
     if (m_process == None)
         return -1;
