@@ -9,7 +9,8 @@ build_packages=(
     libpoppler-glib-dev libcairo2-dev libpango1.0-dev libfontconfig-dev libglib2.0-dev libseccomp-dev
     libharfbuzz-dev libreoffice-dev libreofficekit-dev
     libcli11-dev nlohmann-json3-dev gettext
-    libsqlite3-dev libtomlplusplus-dev libcpp-httplib-dev prometheus-cpp-dev libsystemd-dev
+    libsqlite3-dev libtomlplusplus-dev libcpp-httplib-dev libpqxx-dev prometheus-cpp-dev
+    libsystemd-dev
 )
 run_packages=(
     'libreoffice-writer|libreoffice-writer-nogui'
@@ -22,6 +23,7 @@ run_packages=(
 test_packages=(
     libgtest-dev libgmock-dev poppler-utils xvfb xauth
     cups-daemon cups-client cups-core-drivers cups-filters-core-drivers cups-ipp-utils dbus-daemon
+    postgresql-15
 )
 # The compiler and the zlib for Windows, Wine, and what builds the other libraries from source.
 windows_packages=(
@@ -67,11 +69,16 @@ Install them as root: apt-get install --no-install-recommends ${missing[*]}"
     exec 7>"$project/build/.packages.lock"
     lock 7 'installation of packages'
     printf 'Installing %s\n' "${missing[*]}" >&2
+    # Tests start database servers of their own; no other is to be made and started for good.
+    local no_cluster=/etc/postgresql-common/createcluster.d/quillon-tests.conf
+    "${as_root[@]}" mkdir -p "${no_cluster%/*}"
+    echo 'create_main_cluster = false' | "${as_root[@]}" tee "$no_cluster" >/dev/null
     {
         "${as_root[@]}" apt-get -q update &&
             "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive \
                 apt-get -qy -o DPkg::Lock::Timeout=-1 install --no-install-recommends "${missing[@]}"
     } >&2 7>&- || fail "The packages could not be installed. Install them by hand: ${missing[*]}"
+    "${as_root[@]}" rm "$no_cluster"
     flock -u 7
 }
 

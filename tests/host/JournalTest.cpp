@@ -1,4 +1,5 @@
 #include "host/program/journal/SqliteJournal.h"
+#include "tests/host/JournalImplementation.h"
 #include "tests/host/System.h"
 #include "tests/support/TemporaryFolder.h"
 
@@ -6,6 +7,7 @@
 #include <sqlite3.h>
 
 #include <functional>
+#include <thread>
 
 using namespace std::chrono_literals;
 namespace fs = std::filesystem;
@@ -14,16 +16,6 @@ using testing::HasSubstr;
 using testing::IsEmpty;
 
 namespace {
-
-/// What keeps journals.
-struct Implementation {
-    const char* name;
-    std::unique_ptr<Journal> (*open)(const fs::path& folder, const JournalTime& now);
-};
-
-std::ostream& operator<<(std::ostream& stream, const Implementation& implementation) {
-    return stream << implementation.name;
-}
 
 SqliteJournal::Options OptionsFor(const JournalTime& now) {
     SqliteJournal::Options options;
@@ -53,8 +45,15 @@ const Claimant Us = {"us", 30s};
 const std::vector<ClaimableFolder> Both = {{"letters"}, {"bills"}};
 
 /// What every journal does, whatever keeps it.
-class JournalTest : public testing::TestWithParam<Implementation> {
+class JournalTest : public testing::TestWithParam<JournalImplementation> {
 protected:
+    void SetUp() override {
+        if (const std::string obstacle = GetParam().obstacle(); !obstacle.empty())
+            GTEST_SKIP() << obstacle;
+        m_journal = Open();
+        ASSERT_TRUE(m_journal);
+    }
+
     std::unique_ptr<Journal> Open() const { return GetParam().open(m_folder.Path(), m_now); }
 
     Job Claim() const { return m_journal->Claim(Both, Us).value_or(Job()); }
@@ -78,7 +77,7 @@ protected:
 
     TemporaryFolder m_folder;
     JournalTime m_now{std::chrono::hours(500'000)};
-    std::unique_ptr<Journal> m_journal = Open();
+    std::unique_ptr<Journal> m_journal;
 };
 
 TEST_P(JournalTest, BeginsInOrder) {
@@ -147,6 +146,7 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     m_journal->Insert({Document("letters", "a"), Document("letters", "b")});
     Job job = Claim();
     const std::unique_ptr<Journal> other = Open();
+    m_now += 31s; // the lease has run out
     const std::vector<Job> taken = other->TakeOver("letters", {"them"});
     ASSERT_EQ(taken.size(), 1U);
     EXPECT_EQ(taken[0].claimedBy, "them");
@@ -155,6 +155,7 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     Job theirs = taken[0];
     theirs.state = JobState::Finished;
     EXPECT_TRUE(other->Commit(theirs));
+    m_now += 31s;
     EXPECT_EQ(m_journal->TakeOver("letters", Us)[0].state, JobState::Finished);
     EXPECT_FALSE(other->Commit(theirs));
     EXPECT_THAT(m_journal->TakeOver("bills", Us), IsEmpty());
@@ -162,7 +163,8 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     m_journal->HasNews();
     EXPECT_FALSE(m_journal->HasNews());
     other->Remove(job.id);
-    EXPECT_TRUE(m_journal->HasNews());
+    while (!m_journal->HasNews()) // it comes by itself
+        std::this_thread::yield();
     EXPECT_FALSE(m_journal->Commit(job));
 }
 
@@ -240,7 +242,14 @@ TEST_P(JournalTest, ListsWhatIsAskedFor) {
     EXPECT_EQ(counts.oldestWaiting, m_now - 2s);
 }
 
-INSTANTIATE_TEST_SUITE_P(Each, JournalTest, testing::Values(Implementation{"sqlite", OpenSqlite}));
+std::vector<JournalImplementation> Implementations() {
+    std::vector<JournalImplementation> all = SharedImplementations();
+    all.push_back({"sqlite", OpenSqlite, [] { return std::string(); }});
+    return all;
+}
+
+INSTANTIATE_TEST_SUITE_P(Each, JournalTest, testing::ValuesIn(Implementations()),
+                         [](const auto& each) { return std::string(each.param.name); });
 
 /// A journal in a file, to which things happen.
 class JournalFileTest : public testing::Test {

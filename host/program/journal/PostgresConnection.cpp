@@ -29,10 +29,8 @@ wxString OneLine(const std::string& text) {
     return line;
 }
 
-} // namespace
-
 /// Hears what other connections tell.
-class PostgresConnection::Bell : public pqxx::notification_receiver {
+class Bell : public pqxx::notification_receiver {
 public:
     Bell(pqxx::connection& connection, std::uint64_t& news)
         : notification_receiver(connection, "quillon"), m_own(connection.backendpid()),
@@ -47,6 +45,8 @@ private:
     int m_own;
     std::uint64_t& m_news;
 };
+
+} // namespace
 
 bool PostgresConnection::EnsureOpen(Fault& fault) {
     if (m_connection && m_connection->is_open())

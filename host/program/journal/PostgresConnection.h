@@ -35,8 +35,6 @@ public:
     std::uint64_t News();
 
 private:
-    class Bell;
-
     pqxx::result RunWith(const std::string& sql, const Values& values);
     pqxx::connection& Connection();
     bool IsReady(Fault& fault);
@@ -63,8 +61,8 @@ private:
     const std::string m_url; ///< with a password: not for texts
     const JournalNeed m_need;
     const std::function<std::string()> m_clock;
-    std::unique_ptr<pqxx::connection> m_connection; ///< null after an error
-    std::unique_ptr<Bell> m_bell;                   ///< of the connection
+    std::unique_ptr<pqxx::connection> m_connection;      ///< null after an error
+    std::unique_ptr<pqxx::notification_receiver> m_bell; ///< of the connection
     std::uint64_t m_news = 1;
     std::optional<Fault> m_fault; ///< why it could not be connected
     std::chrono::steady_clock::time_point m_tried;

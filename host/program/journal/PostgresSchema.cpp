@@ -175,12 +175,12 @@ void Migrate(pqxx::connection& connection) {
     transaction.commit();
 }
 
-wxString NameOf(const pqxx::connection& connection) {
+wxString NameOf(pqxx::connection& connection) {
     return wxString::FromUTF8(connection.dbname());
 }
 
 /// Why the tables were not made.
-Fault ForbiddenIn(const pqxx::connection& connection) {
+Fault ForbiddenIn(pqxx::connection& connection) {
     return {wxString::Format(_("the user %s may not make the queue's tables in the database %s"),
                              wxString::FromUTF8(connection.username()), NameOf(connection)),
             Blame::Usage, ConversionFailed,

@@ -1,0 +1,5 @@
+#include "tests/host/JournalImplementation.h"
+
+std::vector<JournalImplementation> SharedImplementations() {
+    return {};
+}
