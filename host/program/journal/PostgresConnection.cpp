@@ -15,10 +15,11 @@ namespace {
 /// How long to wait before a server is tried again that could not be reached.
 constexpr auto Pause = 1s;
 
-/// No statement hangs for longer; nobody else keeps rows for himself for as long either.
+/// No statement hangs for longer; nobody else keeps rows for himself for as long either. All of
+/// them are short: compiling them would take longer.
 constexpr const char* Settings = "SET statement_timeout = '10s'; SET lock_timeout = '8s'; "
                                  "SET idle_in_transaction_session_timeout = '10s'; "
-                                 "SET client_min_messages = warning";
+                                 "SET client_min_messages = warning; SET jit = off";
 
 /// The server's or the library's words, in one line.
 wxString OneLine(const std::string& text) {
