@@ -23,7 +23,7 @@ public:
     }
     void Heartbeat(const Claimant&, const std::vector<std::int64_t>&) override {}
     bool Commit(const Job&) override { return false; }
-    std::vector<Job> TakeOver(const wxString&, const Claimant&) override { return {}; }
+    std::vector<Job> TakeOver(const std::vector<wxString>&, const Claimant&) override { return {}; }
     void Remove(std::int64_t) override {}
     bool HasNews() override { return true; }
     JournalTime Now() override { return std::chrono::system_clock::now(); }

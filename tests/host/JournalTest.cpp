@@ -147,7 +147,7 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     Job job = Claim();
     const std::unique_ptr<Journal> other = Open();
     m_now += 31s; // the lease has run out
-    const std::vector<Job> taken = other->TakeOver("letters", {"them"});
+    const std::vector<Job> taken = other->TakeOver({"letters"}, {"them"});
     ASSERT_EQ(taken.size(), 1U);
     EXPECT_EQ(taken[0].claimedBy, "them");
     job.state = JobState::Delivering;
@@ -156,9 +156,9 @@ TEST_P(JournalTest, ObeysWhoClaimedLast) {
     theirs.state = JobState::Finished;
     EXPECT_TRUE(other->Commit(theirs));
     m_now += 31s;
-    EXPECT_EQ(m_journal->TakeOver("letters", Us)[0].state, JobState::Finished);
+    EXPECT_EQ(m_journal->TakeOver({"letters"}, Us)[0].state, JobState::Finished);
     EXPECT_FALSE(other->Commit(theirs));
-    EXPECT_THAT(m_journal->TakeOver("bills", Us), IsEmpty());
+    EXPECT_THAT(m_journal->TakeOver({"bills"}, Us), IsEmpty());
     m_journal->Heartbeat(Us, {job.id});
     m_journal->HasNews();
     EXPECT_FALSE(m_journal->HasNews());

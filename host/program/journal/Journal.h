@@ -95,11 +95,12 @@ public:
     /// @return false when somebody else has claimed it since, or it is gone: nothing is stored then
     virtual bool Commit(const Job& job) = 0;
 
-    /// The jobs of a folder that somebody left under way, from Converting to Delivering, and those
+    /// The jobs of folders that somebody left under way, from Converting to Delivering, and those
     /// whose sources are to be put away. Each is the claimant's from here on. Where nobody but the
     /// folder's watcher works on them, all there are were left; in a shared journal, those whose
     /// lease has run out.
-    virtual std::vector<Job> TakeOver(const wxString& folder, const Claimant& claimant) = 0;
+    virtual std::vector<Job> TakeOver(const std::vector<wxString>& folders,
+                                      const Claimant& claimant) = 0;
 
     virtual std::vector<Job> List(const JobQuery& query) = 0;
     /// By the folders' names.

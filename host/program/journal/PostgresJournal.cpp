@@ -122,20 +122,26 @@ bool PostgresJournal::Commit(const Job& job) {
     return StoreJob(m_connection, m_options.map, job);
 }
 
-std::vector<Job> PostgresJournal::TakeOver(const wxString& folder, const Claimant& claimant) {
+std::vector<Job> PostgresJournal::TakeOver(const std::vector<wxString>& folders,
+                                           const Claimant& claimant) {
+    json names = json::array();
+    for (const wxString& folder : folders)
+        names.push_back(folder.utf8_string());
     ++m_ownChanges;
-    std::vector<Job> jobs = ReadJobs(
-        m_connection.Run(std::string("WITH abandoned AS (SELECT id AS number_left FROM job WHERE "
-                                     "folder=$1 AND lease_until < now() AND ")
-                             .append(IsUnderWay)
-                             .append(" ORDER BY id LIMIT 100 FOR UPDATE SKIP LOCKED) "
-                                     "UPDATE job SET token=token+1, claimed_by=$2, "
-                                     "lease=make_interval(secs => $3), "
-                                     "lease_until=now() + make_interval(secs => $3) "
-                                     "FROM abandoned WHERE job.id=number_left RETURNING ")
-                             .append(PostgresJobColumns),
-                         folder, claimant.name, SecondsOf(claimant)),
-        m_options.map);
+    std::vector<Job> jobs =
+        ReadJobs(m_connection.Run(
+                     std::string("WITH abandoned AS (SELECT id AS number_left FROM job WHERE "
+                                 "folder = ANY (ARRAY(SELECT json_array_elements_text($1::json))) "
+                                 "AND lease_until < now() AND ")
+                         .append(IsUnderWay)
+                         .append(" ORDER BY id LIMIT 100 FOR UPDATE SKIP LOCKED) "
+                                 "UPDATE job SET token=token+1, claimed_by=$2, "
+                                 "lease=make_interval(secs => $3), "
+                                 "lease_until=now() + make_interval(secs => $3) "
+                                 "FROM abandoned WHERE job.id=number_left RETURNING ")
+                         .append(PostgresJobColumns),
+                     names.dump(), claimant.name, SecondsOf(claimant)),
+                 m_options.map);
     std::sort(jobs.begin(), jobs.end(),
               [](const Job& left, const Job& right) { return left.id < right.id; });
     return jobs;

@@ -25,7 +25,8 @@ public:
                              const Claimant& claimant) override;
     void Heartbeat(const Claimant& claimant, const std::vector<std::int64_t>& jobs) override;
     bool Commit(const Job& job) override;
-    std::vector<Job> TakeOver(const wxString& folder, const Claimant& claimant) override;
+    std::vector<Job> TakeOver(const std::vector<wxString>& folders,
+                              const Claimant& claimant) override;
     std::vector<Job> List(const JobQuery& query) override;
     std::map<wxString, FolderCounts> Counts() override;
     bool Retry(std::int64_t id) override;

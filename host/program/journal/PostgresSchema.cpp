@@ -160,7 +160,11 @@ constexpr int Version = 1;
 
 /// @return 0 for none
 int VersionOf(pqxx::transaction_base& transaction) {
-    if (!transaction.exec1("SELECT to_regclass('quillon_schema') IS NOT NULL")[0].as<bool>())
+    // Read from the table itself: to_regclass may still know that there was none before the turn.
+    const pqxx::row row =
+        transaction.exec1("SELECT count(*) FROM pg_class WHERE "
+                          "relname = 'quillon_schema' AND pg_table_is_visible(oid)");
+    if (row[0].as<int>() == 0)
         return 0;
     return transaction.exec1("SELECT max(version) FROM quillon_schema")[0].as<int>(0);
 }

@@ -147,7 +147,8 @@ bool SqliteJournal::Commit(const Job& job) {
     return With([&](SqliteDatabase& database) { return StoreJob(database, job, m_options.now()); });
 }
 
-std::vector<Job> SqliteJournal::TakeOver(const wxString& folder, const Claimant& claimant) {
+std::vector<Job> SqliteJournal::TakeOver(const std::vector<wxString>& folders,
+                                         const Claimant& claimant) {
     return With([&](SqliteDatabase& database) {
         SqliteStatement row(
             database,
@@ -157,10 +158,13 @@ std::vector<Job> SqliteJournal::TakeOver(const wxString& folder, const Claimant&
                 .append(IsUnderWay)
                 .append(") RETURNING ")
                 .append(JobColumns),
-            folder, claimant.name, m_options.now() + claimant.lease);
+            wxString(), claimant.name, m_options.now() + claimant.lease);
         std::vector<Job> jobs;
-        while (row.Next())
-            jobs.push_back(ReadJob(row));
+        for (const wxString& folder : folders) {
+            row.Begin(folder, claimant.name, m_options.now() + claimant.lease);
+            while (row.Next())
+                jobs.push_back(ReadJob(row));
+        }
         std::sort(jobs.begin(), jobs.end(),
                   [](const Job& left, const Job& right) { return left.id < right.id; });
         return jobs;

@@ -20,6 +20,7 @@ namespace {
 constexpr std::chrono::seconds BetweenHeartbeats = 10s;
 constexpr std::chrono::seconds BetweenStatuses = 1s;
 constexpr std::chrono::seconds BetweenMeetings = 5s;
+constexpr std::chrono::minutes BetweenSweeps = 10min;
 constexpr std::chrono::minutes BetweenRemovals = 1min;
 
 /// How long a document under way may take to be finished before the program ends, beyond what a
@@ -181,7 +182,8 @@ void WatchService::Pass() {
         }
         if (now - m_removedOld > BetweenRemovals) {
             for (const WatchedFolder& folder : m_folders)
-                RemoveOldDocuments(*folder.Configuration(), m_journal);
+                if (!folder.Configuration()->isOthers)
+                    RemoveOldDocuments(*folder.Configuration(), m_journal);
             m_removedOld = now;
         }
         m_isOver = m_means.once && !hasEnded && IsDone();
@@ -219,13 +221,30 @@ void WatchService::LookAfterFolders() {
     }
 }
 
+/// Puts a folder's affairs in order before it is begun with.
 void WatchService::Recover(WatchedFolder& folder) {
-    const std::size_t count = Works() ? m_work.Recover(folder) : 0;
-    if (count > 0)
+    if (!Works())
+        return;
+    if (const std::size_t count = m_work.Recover({&folder}))
         m_reporter.Line(
             wxString::Format(wxPLURAL("%s: recovered %zu document", "%s: recovered %zu documents",
                                       static_cast<unsigned>(count)),
                              folder.Name(), count));
+    m_work.Sweep(folder.Configuration()->out);
+}
+
+/// Takes over what other machines have lost, and removes what they have left.
+void WatchService::TakeOver(Clock::time_point now) {
+    std::vector<WatchedFolder*> folders;
+    for (WatchedFolder& folder : m_folders)
+        if (folder.MayBegin(now))
+            folders.push_back(&folder);
+    const bool isSweeping = now - m_swept > BetweenSweeps;
+    if (folders.empty() || (m_work.Recover(folders) == 0 && !isSweeping))
+        return;
+    for (const WatchedFolder* const folder : folders)
+        m_work.Sweep(folder->Configuration()->out);
+    m_swept = now;
 }
 
 /// Whether it converts documents, too.
@@ -242,11 +261,10 @@ void WatchService::MeetOthers(Clock::time_point now) {
         m_untold = m_membership->Announce(m_configuration.folders);
     else if (const auto folders = m_membership->News())
         OpenFolders(*folders);
-    if (Works())
+    if (Works()) {
         m_claimant.cannot = FindUnopenable(m_filters);
-    for (WatchedFolder& folder : m_folders)
-        if (folder.MayBegin(now))
-            Recover(folder);
+        TakeOver(now);
+    }
     m_membership->Report(Status());
     m_met = now;
 }

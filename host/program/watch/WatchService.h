@@ -55,6 +55,7 @@ private:
     void MeetOthers(Clock::time_point now);
     bool Works() const;
     void Recover(WatchedFolder& folder);
+    void TakeOver(Clock::time_point now);
     void TellReady();
     WatchStatus Status() const;
     void TellStatus();
@@ -83,7 +84,8 @@ private:
     Clock::time_point m_lastPass = Clock::now(); ///< that was whole
     Clock::time_point m_heartbeat;
     Clock::time_point m_told;
-    Clock::time_point m_met;            ///< others
+    Clock::time_point m_met; ///< others
+    Clock::time_point m_swept = Clock::now();
     std::map<wxString, Fault> m_untold; ///< why folders cannot be told of
     Clock::time_point m_removedOld;
     wxString m_journalFault;

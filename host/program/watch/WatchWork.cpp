@@ -3,12 +3,10 @@
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
 #include "host/program/watch/JobDecision.h"
-#include "host/program/workers/WorkerCount.h"
 #include "plugin/interface/ResultCodes.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>
-#include <wx/utils.h>
 
 #include <algorithm>
 
@@ -20,16 +18,6 @@ namespace {
 /// Before a document's end is tried again.
 constexpr std::chrono::seconds BetweenEnds = 30s;
 
-/// After which nothing is kept ready for another document.
-constexpr std::chrono::seconds QuietAfter = 60s;
-
-constexpr std::chrono::seconds UpcomingLasts = 1s;
-constexpr std::size_t MostUpcoming = 64;
-
-Input InputOf(const Job& job) {
-    return {job.source, job.source, true};
-}
-
 WatchWork::Clock::time_point Now() {
     return WatchWork::Clock::now();
 }
@@ -38,6 +26,7 @@ WatchWork::Clock::time_point Now() {
 
 WatchWork::WatchWork(Means means, Journal& journal, Folders& folders, const FilterSet& filters)
     : m_means(std::move(means)), m_journal(journal), m_folders(folders), m_filters(filters),
+      m_workload(m_means.jobs, m_means.engineDocuments),
       m_pool(m_means.workerArguments, m_means.workerPatience, *this),
       m_printing(
           journal, [&filters](int code) { return filters.ErrorText(code); },
@@ -63,26 +52,33 @@ void WatchWork::Step() {
     m_pool.Step(HasEndings() ? 0ms : BetweenSignsOfLife);
 }
 
-std::size_t WatchWork::Recover(WatchedFolder& folder) {
+std::size_t WatchWork::Recover(const std::vector<WatchedFolder*>& folders) {
+    std::vector<wxString> names;
+    names.reserve(folders.size());
+    for (const WatchedFolder* const folder : folders)
+        names.push_back(folder->Name());
     std::size_t count = 0;
-    for (Job& job : m_journal.TakeOver(folder.Name(), m_means.claimant)) {
-        if (UnderWay* const known = FindUnderWay(job)) {
-            known->job.token = job.token; // the folder was away, its document was not
-            continue;
-        }
-        ++count;
-        UnderWay& work = m_ending[++m_lastTicket];
-        work.folder = folder.Configuration();
-        if (!job.workplace.empty())
-            work.workplace = Workplace::TakeOver(job.workplace.parent_path());
-        if (job.state == JobState::Converting) {
-            DecideByDeath(job, m_filters.ErrorText(ConversionFailed), m_journal.Now());
-            work.isToBeTold = true;
-        }
-        work.job = std::move(job);
-    }
-    Sweep(folder.Configuration()->out);
+    for (Job& job : m_journal.TakeOver(names, m_means.claimant))
+        count += Adopt(std::move(job)) ? 1 : 0;
     return count;
+}
+
+/// @return whether it is not one that this program has in hand
+bool WatchWork::Adopt(Job job) {
+    if (UnderWay* const known = FindUnderWay(job)) {
+        known->job.token = job.token; // the folder was away, its document was not
+        return false;
+    }
+    UnderWay& work = m_ending[++m_lastTicket];
+    work.folder = Find(job.folder)->Configuration();
+    if (!job.workplace.empty())
+        work.workplace = Workplace::TakeOver(job.workplace.parent_path());
+    if (job.state == JobState::Converting) {
+        DecideByDeath(job, m_filters.ErrorText(ConversionFailed), m_journal.Now());
+        work.isToBeTold = true;
+    }
+    work.job = std::move(job);
+    return true;
 }
 
 WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
@@ -93,7 +89,6 @@ WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
     return nullptr;
 }
 
-/// Removes abandoned workplaces, unless the journal knows of an output in one of them.
 void WatchWork::Sweep(const fs::path& outputFolder) {
     for (const JobState state : {JobState::Submitting, JobState::Printing, JobState::Delivering}) {
         JobQuery query;
@@ -107,8 +102,8 @@ void WatchWork::Sweep(const fs::path& outputFolder) {
 
 void WatchWork::BeginJobs() {
     const Clock::time_point now = Now();
-    LookAtUpcoming();
-    while (m_pool.Busy() < WorthwhileJobs()) {
+    m_workload.Look(m_journal);
+    while (m_pool.Busy() < m_workload.WorthwhileJobs(InputsUnderWay())) {
         std::vector<ClaimableFolder> claimable;
         for (const WatchedFolder& folder : m_folders)
             if (folder.MayBegin(now))
@@ -331,53 +326,24 @@ void WatchWork::Heartbeat() {
     m_journal.Heartbeat(m_means.claimant, jobs);
 }
 
-void WatchWork::LookAtUpcoming() {
-    const Clock::time_point now = Now();
-    if (now - m_upcomingKnown < UpcomingLasts)
-        return;
-    m_upcomingKnown = now;
-    m_upcoming.clear();
-    m_waiting = 0;
-    for (auto& [folder, counts] : m_journal.Counts())
-        m_waiting += counts.jobs[JobState::Waiting];
-    JobQuery query;
-    query.state = JobState::Waiting;
-    query.limit = MostUpcoming;
-    for (const Job& job : m_journal.List(query))
-        m_upcoming.push_back(InputOf(job));
-}
-
-/// How many documents are best under way now.
-std::size_t WatchWork::WorthwhileJobs() const {
-    if (m_means.jobs > 0)
-        return m_means.jobs;
-    std::vector<Input> inputs = m_upcoming;
+/// Those that a worker has.
+std::vector<Input> WatchWork::InputsUnderWay() const {
+    std::vector<Input> inputs;
     for (const auto& [id, work] : m_underWay)
         inputs.push_back(InputOf(work.job));
-    return WorthwhileWorkers(inputs);
+    return inputs;
 }
 
-/// Engines are kept when many documents wait, and from then on; so they are while one comes after
-/// the other, until it is quiet.
 unsigned WatchWork::EngineDocuments() {
-    std::size_t coming = m_waiting + m_pool.Busy() + 1;
+    std::size_t settling = 0;
     for (const WatchedFolder& folder : m_folders)
-        coming += folder.View().settling;
-    const std::size_t documents = std::max(coming, ++m_begun);
-    m_engineDocuments =
-        std::max(m_engineDocuments, WorthwhileEngineDocuments(documents, WorthwhileJobs()));
-    return m_means.engineDocuments.value_or(m_engineDocuments);
+        settling += folder.View().settling;
+    return m_workload.EngineDocuments(InputsUnderWay(), settling);
 }
 
 void WatchWork::Rest() {
-    const Clock::time_point now = Now();
-    if (!m_underWay.empty())
-        m_lastWork = now;
-    if (now - m_lastWork < QuietAfter)
-        return;
-    m_pool.Retire(0s);
-    m_begun = 0;
-    m_engineDocuments = 1;
+    if (m_workload.IsQuiet(!m_underWay.empty()))
+        m_pool.Retire(0s);
 }
 
 std::vector<RunningDocument> WatchWork::Running() const {

@@ -6,6 +6,7 @@
 #include "host/program/watch/JobEnding.h"
 #include "host/program/watch/JobPrinting.h"
 #include "host/program/watch/WatchedFolder.h"
+#include "host/program/watch/Workload.h"
 #include "host/program/workers/WorkerPool.h"
 
 #include <deque>
@@ -37,9 +38,12 @@ public:
     WatchWork(const WatchWork&) = delete;
     WatchWork& operator=(const WatchWork&) = delete;
 
-    /// Puts a folder's affairs in order that an earlier program has left, or another machine.
+    /// Takes over what an earlier program has left of folders, or another machine has lost.
     /// @return how many documents there were
-    std::size_t Recover(WatchedFolder& folder);
+    std::size_t Recover(const std::vector<WatchedFolder*>& folders);
+
+    /// Removes abandoned workplaces, unless the journal knows of an output in one of them.
+    void Sweep(const std::filesystem::path& outputFolder);
 
     /// Brings one to its end that a worker is done with, or that could not be before. One at a
     /// time: it takes as long as the disk does, and workers are not to wait for that.
@@ -57,7 +61,7 @@ public:
     void Rest();
 
     /// Says that there are more documents than there were.
-    void Expect() { m_upcomingKnown = {}; }
+    void Expect() { m_workload.Expect(); }
 
     void Heartbeat();
 
@@ -73,7 +77,7 @@ public:
     bool IsPrinting() const { return m_printing.IsBusy(); }
     std::vector<RunningDocument> Running() const;
     /// How many documents could be begun, had they a worker.
-    std::size_t Waiting() const { return m_waiting; }
+    std::size_t Waiting() const { return m_workload.Waiting(); }
 
 private:
     struct UnderWay {
@@ -90,8 +94,8 @@ private:
     bool HasEndings() const;
     void Begin(Job job, WatchedFolder& folder);
     std::optional<Fault> Prepare(UnderWay& work, WatchedFolder& folder, Assignment& assignment);
+    bool Adopt(Job job);
     UnderWay* FindUnderWay(const Job& job);
-    void Sweep(const std::filesystem::path& outputFolder);
     Circumstances PresentCircumstances();
     void Decide(UnderWay& work);
     bool End(UnderWay& work);
@@ -100,8 +104,7 @@ private:
     void Report(UnderWay& work) const;
     WatchedFolder* Find(const wxString& name);
     const Texts& TextsFor(const FolderConfiguration& folder) const;
-    void LookAtUpcoming();
-    std::size_t WorthwhileJobs() const;
+    std::vector<Input> InputsUnderWay() const;
     unsigned EngineDocuments();
 
     void OnProgress(WorkerPool::Ticket ticket, const wxString& step, int percent) override;
@@ -117,12 +120,7 @@ private:
     std::map<WorkerPool::Ticket, UnderWay> m_underWay;  ///< with a worker
     std::map<WorkerPool::Ticket, UnderWay> m_atPrinter; ///< or on the way there
     std::map<WorkerPool::Ticket, UnderWay> m_ending;    ///< no longer with one
-    std::vector<Input> m_upcoming;                      ///< some of those that are waiting
-    std::size_t m_waiting = 0;
-    Clock::time_point m_upcomingKnown;
-    Clock::time_point m_lastWork;
-    std::size_t m_begun = 0; ///< since it was quiet
-    unsigned m_engineDocuments = 1;
+    Workload m_workload;
     WorkerPool m_pool;
     JobPrinting m_printing; // last: it wakes the pool
 };

@@ -90,15 +90,15 @@ TEST_F(PostgresJournalTest, LeavesAJobToItsClaimantForTheLease) {
     const auto theirs = Open();
     ours->Insert({Document("/in/a")});
     Job job = ours->Claim(Both, Us).value();
-    EXPECT_THAT(theirs->TakeOver("letters", Them), IsEmpty());
+    EXPECT_THAT(theirs->TakeOver({"letters"}, Them), IsEmpty());
     ours->Heartbeat({"us", 0s}, {});
     ours->Heartbeat({"them", 0s}, {job.id});
-    EXPECT_THAT(theirs->TakeOver("letters", Them), IsEmpty());
+    EXPECT_THAT(theirs->TakeOver({"letters"}, Them), IsEmpty());
     ours->Heartbeat({"us", 0s}, {job.id}); // it runs out at once
-    EXPECT_EQ(theirs->TakeOver("letters", Them).size(), 1U);
+    EXPECT_EQ(theirs->TakeOver({"letters"}, Them).size(), 1U);
     EXPECT_FALSE(ours->Commit(job));
     ours->Heartbeat({"us", 0s}, {job.id});
-    EXPECT_THAT(ours->TakeOver("letters", Us), IsEmpty());
+    EXPECT_THAT(ours->TakeOver({"letters"}, Us), IsEmpty());
 }
 
 TEST_F(PostgresJournalTest, KnowsPathsAndKindsOnEveryMachine) {
