@@ -9,6 +9,7 @@
 #include "plugin/settings/FilterSettings.h"
 
 #include <wx/intl.h>
+#include <wx/utils.h>
 
 #include <algorithm>
 
@@ -121,6 +122,9 @@ ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Repor
         return reporter.Error(*missing);
     ServiceRun run = {*configuration, MeansOf(options)};
     run.means.once = watch.once;
+    run.means.finder = wxGetHostName() + ' ' +
+                       Shown(fs::absolute(FromArgument(watch.configuration ? *watch.configuration
+                                                                           : *watch.folder)));
     run.pageIsAsked = watch.http.has_value();
     if (watch.configuration) {
         run.means.reload = [watch](Fault& why) { return ReadConfiguration(watch, why); };

@@ -82,7 +82,8 @@ CREATE TABLE folder (
 CREATE TABLE announcement (
     folder text PRIMARY KEY,
     configuration text NOT NULL,
-    settings text NOT NULL);
+    settings text NOT NULL,
+    finder text NOT NULL);
 
 CREATE TABLE machine (
     name text PRIMARY KEY,
@@ -188,7 +189,7 @@ Fault ForbiddenIn(pqxx::connection& connection) {
     return {wxString::Format(_("the user %s may not make the queue's tables in the database %s"),
                              wxString::FromUTF8(connection.username()), NameOf(connection)),
             Blame::Usage, ConversionFailed,
-            _("Have the database's owner run \"quillon queue --queue\" with its address once; that "
+            _("Have the database's owner run `quillon serve --queue` with its address once; that "
               "makes them")};
 }
 

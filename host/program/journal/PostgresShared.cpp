@@ -42,19 +42,27 @@ std::string TextOf(const json& value) {
 
 } // namespace
 
-void PostgresShared::Announce(const std::vector<AnnouncedFolder>& folders) {
-    json all = json::array();
+void PostgresShared::Announce(const std::vector<AnnouncedFolder>& folders, const wxString& finder,
+                              const std::vector<wxString>& all) {
+    json told = json::array();
     for (const AnnouncedFolder& folder : folders)
-        all.push_back({{"folder", folder.name.utf8_string()},
-                       {"configuration", folder.configuration},
-                       {"settings", folder.settings}});
-    m_connection.Run("INSERT INTO announcement AS known (folder, configuration, settings) "
-                     "SELECT folder, configuration, settings FROM json_to_recordset($1::json) "
-                     "AS told(folder text, configuration text, settings text) "
-                     "ON CONFLICT (folder) DO UPDATE SET configuration=excluded.configuration, "
-                     "settings=excluded.settings WHERE (known.configuration, known.settings) <> "
-                     "(excluded.configuration, excluded.settings)",
-                     TextOf(all));
+        told.push_back({{"folder", folder.name.utf8_string()},
+                        {"configuration", folder.configuration},
+                        {"settings", folder.settings}});
+    json names = json::array();
+    for (const wxString& name : all)
+        names.push_back(name.utf8_string());
+    m_connection.Run(
+        "WITH taken_back AS (DELETE FROM announcement WHERE finder=$2 AND NOT folder = "
+        "ANY (ARRAY(SELECT json_array_elements_text($3::json)))) "
+        "INSERT INTO announcement AS known (folder, configuration, settings, finder) "
+        "SELECT folder, configuration, settings, $2 FROM json_to_recordset($1::json) "
+        "AS told(folder text, configuration text, settings text) "
+        "ON CONFLICT (folder) DO UPDATE SET configuration=excluded.configuration, "
+        "settings=excluded.settings, finder=excluded.finder WHERE "
+        "(known.configuration, known.settings, known.finder) <> "
+        "(excluded.configuration, excluded.settings, excluded.finder)",
+        TextOf(told), finder, TextOf(names));
 }
 
 std::vector<AnnouncedFolder> PostgresShared::Announced() {

@@ -9,7 +9,8 @@ public:
     /// @param connection outlives it
     explicit PostgresShared(PostgresConnection& connection) : m_connection(connection) {}
 
-    void Announce(const std::vector<AnnouncedFolder>& folders) override;
+    void Announce(const std::vector<AnnouncedFolder>& folders, const wxString& finder,
+                  const std::vector<wxString>& all) override;
     std::vector<AnnouncedFolder> Announced() override;
     void Report(const Machine& machine, const Claimant& claimant) override;
     void TakeLeave(const wxString& machine) override;

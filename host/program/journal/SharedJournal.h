@@ -51,7 +51,12 @@ public:
     virtual ~SharedJournal() = default;
 
     /// Tells of folders, in place of what was told of those of the same names.
-    virtual void Announce(const std::vector<AnnouncedFolder>& folders) = 0;
+    /// @param finder who tells, by a name that it has each time it runs
+    /// @param all names of its folders, also of those that it does not tell of now: what it has
+    /// told
+    ///     of others is taken back
+    virtual void Announce(const std::vector<AnnouncedFolder>& folders, const wxString& finder,
+                          const std::vector<wxString>& all) = 0;
     /// All that have been told of, by their names.
     virtual std::vector<AnnouncedFolder> Announced() = 0;
 

@@ -7,8 +7,17 @@
 
 #include <algorithm>
 
-std::map<wxString, Fault>
-QueueMembership::Announce(const std::vector<FolderConfiguration>& folders) {
+QueueMembership::~QueueMembership() {
+    try {
+        m_journal.TakeLeave(m_self.name);
+    } catch (const JournalError& error) {
+        SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__)
+            << "The queue does not know that this machine ends: " << error.what();
+    }
+}
+
+std::map<wxString, Fault> QueueMembership::Announce(const std::vector<FolderConfiguration>& folders,
+                                                    const std::vector<wxString>& all) {
     std::vector<AnnouncedFolder> announced;
     std::map<wxString, Fault> faults;
     for (const FolderConfiguration& folder : folders) {
@@ -18,9 +27,10 @@ QueueMembership::Announce(const std::vector<FolderConfiguration>& folders) {
         else
             faults[folder.name] = fault;
     }
-    if (announced != m_announced)
-        m_journal.Announce(announced);
+    if (announced != m_announced || all != m_all)
+        m_journal.Announce(announced, m_finder, all);
     m_announced = std::move(announced);
+    m_all = all;
     return faults;
 }
 
@@ -53,15 +63,6 @@ void QueueMembership::Report(const WatchStatus& status) {
                             << ": " << folder.obstacle;
     m_self.cannot = m_claimant.cannot;
     m_journal.Report(m_self, m_claimant);
-}
-
-void QueueMembership::TakeLeave() {
-    try {
-        m_journal.TakeLeave(m_self.name);
-    } catch (const JournalError& error) {
-        SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__)
-            << "The queue does not know that this machine ends: " << error.what();
-    }
 }
 
 std::optional<Fault> FindMisfit(const PageMakers& makers, const std::vector<Machine>& machines) {

@@ -9,13 +9,22 @@ class QueueMembership {
 public:
     /// @param journal outlives this object
     /// @param self what others are told of it; how it fares comes by Report
-    QueueMembership(SharedJournal& journal, const Claimant& claimant, Machine self, PathMap map)
-        : m_journal(journal), m_claimant(claimant), m_self(std::move(self)), m_map(std::move(map)) {
-    }
+    /// @param finder see SharedJournal::Announce
+    QueueMembership(SharedJournal& journal, const Claimant& claimant, Machine self, wxString finder,
+                    PathMap map)
+        : m_journal(journal), m_claimant(claimant), m_self(std::move(self)),
+          m_finder(std::move(finder)), m_map(std::move(map)) {}
+
+    /// Says that it ends. What cannot be said now will be seen when its lease has run out.
+    ~QueueMembership();
+    QueueMembership(const QueueMembership&) = delete;
+    QueueMembership& operator=(const QueueMembership&) = delete;
 
     /// Tells of folders whose documents this machine finds, where anything has changed.
+    /// @param all that it is to find documents in, also those that it does not have at the moment
     /// @return why some cannot be told of
-    std::map<wxString, Fault> Announce(const std::vector<FolderConfiguration>& folders);
+    std::map<wxString, Fault> Announce(const std::vector<FolderConfiguration>& folders,
+                                       const std::vector<wxString>& all);
 
     /// The folders that others have told of, when they have changed since the last call.
     std::optional<std::vector<FolderConfiguration>> News();
@@ -23,15 +32,14 @@ public:
     /// Says how this machine is.
     void Report(const WatchStatus& status);
 
-    /// Says that it ends. What cannot be said now will be seen when its lease has run out.
-    void TakeLeave();
-
 private:
     SharedJournal& m_journal;
     const Claimant& m_claimant;
     Machine m_self;
+    const wxString m_finder;
     const PathMap m_map;
     std::vector<AnnouncedFolder> m_announced; ///< last, by this machine
+    std::vector<wxString> m_all;              ///< likewise
     std::optional<std::vector<AnnouncedFolder>> m_heard;
     wxString m_refused; ///< why some of those cannot be worked for
 };

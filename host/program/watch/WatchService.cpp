@@ -65,22 +65,22 @@ WatchService::WatchService(WatchConfiguration configuration, Means means, Journa
       m_started(std::chrono::system_clock::now()) {
     if (SharedJournal* const shared = journal.Shared())
         m_membership = std::make_unique<QueueMembership>(*shared, m_claimant, m_means.self,
-                                                         m_configuration.map);
+                                                         m_means.finder, m_configuration.map);
 }
 
 ExitCode WatchService::Run() {
-    if (m_means.self.finds)
-        OpenFolders(m_configuration.folders);
     bool isReady = false;
     while (!m_isOver && !(m_isDraining && IsDrained())) {
         Pass();
-        if (!isReady) {
+        if (!isReady && (m_isOpen || !m_means.self.finds)) {
             if (const std::optional<Fault> other = FindOtherWatcher())
                 return m_reporter.Error(*other);
             isReady = std::all_of(m_folders.begin(), m_folders.end(),
                                   [](const auto& folder) { return folder.View().hasLooked; });
-            if (isReady)
+            if (isReady) {
                 TellReady();
+                m_met = {};
+            }
         }
         m_report.TellObstacles(m_folders);
         m_work.Step();
@@ -88,8 +88,6 @@ ExitCode WatchService::Run() {
     const ExitCode exitCode = Verdict();
     m_folders.clear();
     m_work.Close();
-    if (m_membership)
-        m_membership->TakeLeave();
     return exitCode;
 }
 
@@ -122,6 +120,7 @@ ExitCode WatchService::Verdict() const {
 void WatchService::OpenFolders(const std::vector<FolderConfiguration>& folders) {
     const std::set<std::string> extensions = ExtensionsOf(m_filters);
     const std::map<wxString, FolderCounts> counts = m_journal.Counts();
+    m_isOpen = true;
     m_folders.clear();
     for (const FolderConfiguration& folder : folders)
         m_folders.emplace_back(folder, extensions, m_membership != nullptr,
@@ -164,6 +163,8 @@ void WatchService::Pass() {
         ServiceManager::TellStopping(DrainingTakes);
     }
     try {
+        if (!m_isOpen && m_means.self.finds)
+            OpenFolders(m_configuration.folders);
         if (!m_isDraining && Interruption::ReloadRequested())
             Reload();
         MeetOthers(now);
@@ -252,13 +253,26 @@ bool WatchService::Works() const {
     return !m_membership || !m_means.self.finds || m_configuration.jobs > 0;
 }
 
+/// Tells others of the folders that are this machine's: one that another one watches is not.
+void WatchService::Announce() {
+    std::vector<FolderConfiguration> folders;
+    std::vector<wxString> all;
+    for (const WatchedFolder& folder : m_folders) {
+        all.push_back(folder.Name());
+        if (folder.View().hasLooked && !folder.View().fault)
+            folders.push_back(*folder.Configuration());
+    }
+    if (m_isOpen)
+        m_untold = m_membership->Announce(folders, all);
+}
+
 /// Tells others that have the same journal of this machine, hears of them, and takes over what they
 /// have lost.
 void WatchService::MeetOthers(Clock::time_point now) {
     if (!m_membership || now - m_met < std::min(BetweenMeetings, m_claimant.lease / 3))
         return;
     if (m_means.self.finds)
-        m_untold = m_membership->Announce(m_configuration.folders);
+        Announce();
     else if (const auto folders = m_membership->News())
         OpenFolders(*folders);
     if (Works()) {

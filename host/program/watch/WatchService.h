@@ -12,6 +12,7 @@ public:
     struct Means {
         /// This program, as it is told to others that have the same journal.
         Machine self;
+        wxString finder; ///< see SharedJournal::Announce
         std::vector<std::string> workerArguments;
         std::chrono::seconds workerPatience{};
         std::optional<std::string> language;
@@ -52,6 +53,7 @@ private:
     void Pass();
     void LookAfterFolders();
     void Insert(WatchedFolder& folder);
+    void Announce();
     void MeetOthers(Clock::time_point now);
     bool Works() const;
     void Recover(WatchedFolder& folder);
@@ -90,6 +92,7 @@ private:
     Clock::time_point m_removedOld;
     wxString m_journalFault;
     bool m_mustForget = false; ///< what was found may not be in the journal
+    bool m_isOpen = false;     ///< the folders
     bool m_isDraining = false;
     bool m_isOver = false; ///< with `once`
 };

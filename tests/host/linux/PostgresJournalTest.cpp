@@ -210,10 +210,12 @@ TEST_F(PostgresJournalTest, CarriesWordFromOneToAnother) {
     Await([&] { return finder->Paused().count("bills") == 1; });
 
     worker->HasNews();
-    finder->Shared()->Announce({{"letters", "{}", "<a/>"}, {"bills", "{}", ""}});
+    finder->Shared()->Announce({{"letters", "{}", "<a/>"}, {"bills", "{}", ""}}, "us",
+                               {"letters", "bills"});
     Await([&] { return worker->HasNews(); });
     const AnnouncedFolder letters = {"letters", R"({"in": "office:/in"})", "<b/>"};
-    finder->Shared()->Announce({letters});
+    finder->Shared()->Announce({letters}, "us", {"letters", "bills"});
+    finder->Shared()->Announce({}, "them", {"others"}); // it has told of none of these
     EXPECT_THAT(worker->Shared()->Announced(),
                 ElementsAre(AnnouncedFolder{"bills", "{}", ""}, letters));
 
