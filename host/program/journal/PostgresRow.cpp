@@ -29,9 +29,9 @@ std::string Escaped(const std::string& bytes) {
 std::string Unescaped(const std::string& text) {
     std::string bytes;
     for (std::size_t at = 0; at < text.size(); ++at) {
-        if (text[at] != '\\' || at + 1 == text.size()) {
-            bytes += text[at];
-        } else if (text[++at] == 'x' && at + 2 < text.size()) {
+        const bool isEscaped = text[at] == '\\' && at + 1 < text.size();
+        at += isEscaped ? 1 : 0;
+        if (isEscaped && text[at] == 'x' && at + 2 < text.size()) {
             bytes += static_cast<char>(DigitOf(text[at + 1]) * 16 + DigitOf(text[at + 2]));
             at += 2;
         } else {
