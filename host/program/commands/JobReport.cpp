@@ -22,23 +22,11 @@ wxDateTime DateOf(JournalTime time) {
     return wxDateTime(wxLongLong(milliseconds));
 }
 
-/// For people, by the clock on their wall.
-wxString LocalTime(JournalTime time) {
-    return DateOf(time).FormatISOCombined(' ');
-}
-
-/// ISO 8601, UTC; null for no time.
-Json TimeOf(JournalTime time) {
-    if (time == JournalTime())
-        return {};
-    return JsonText(DateOf(time).ToUTC().FormatISOCombined() + 'Z');
-}
-
 wxString ReasonOf(const Job& job) {
     return job.fault ? job.fault->Text() : wxString();
 }
 
-wxString LineOf(const Job& job) {
+wxString LineOf(const Job& job, bool tellsMachine) {
     wxString line;
     line << job.id << ' ' << OneLine(job.folder) << '/';
     if (!job.inside.empty())
@@ -53,6 +41,8 @@ wxString LineOf(const Job& job) {
         line << ", " << wxString::Format(_("next try %s"), LocalTime(job.due));
     if (job.state == JobState::Converting)
         line << ", " << wxString::Format(_("since %s"), LocalTime(job.begun));
+    if (tellsMachine && (job.state == JobState::Converting || HasProduct(job.state)))
+        line << ", " << wxString::Format(_("by %s"), OneLine(job.claimedBy));
     if (job.print.number > 0)
         line << ", "
              << wxString::Format(_("job %d of %s"), job.print.number, OneLine(job.print.queue));
@@ -89,22 +79,33 @@ Json RecordOf(const Job& job) {
             {"state", NameOf(job.state)},
             {"attempts", job.attempts},
             {"priority", job.priority},
-            {"due", TimeOf(job.due)},
-            {"begun", TimeOf(job.begun)},
-            {"ended", TimeOf(job.ended)},
+            {"due", RecordTime(job.due)},
+            {"begun", RecordTime(job.begun)},
+            {"ended", RecordTime(job.ended)},
             {"seconds", std::round(job.seconds * 1000.0) / 1000.0},
             {"output", job.output.empty() ? Json() : Json(job.output.u8string())},
             {"print", PrintOf(job.print)},
             {"code", job.fault ? job.fault->code : 0},
             {"text", JsonText(job.text)},
+            {"machine", JsonText(job.claimedBy)},
             {"reason", JsonText(ReasonOf(job))},
             {"fault", FaultOf(job)}};
 }
 
 } // namespace
 
-void TellJob(const Job& job, Reporter& reporter) {
-    reporter.Line(LineOf(job));
+wxString LocalTime(JournalTime time) {
+    return DateOf(time).FormatISOCombined(' ');
+}
+
+Json RecordTime(JournalTime time) {
+    if (time == JournalTime())
+        return {};
+    return JsonText(DateOf(time).ToUTC().FormatISOCombined() + 'Z');
+}
+
+void TellJob(const Job& job, Reporter& reporter, bool tellsMachine) {
+    reporter.Line(LineOf(job, tellsMachine));
     reporter.Record(RecordOf(job));
 }
 
@@ -120,7 +121,7 @@ void TellFolder(const wxString& folder, const FolderCounts& counts, bool paused,
             line << (line.empty() ? "" : ", ")
                  << wxString::Format(_("%zu %s"), jobs, wxGetTranslation(NameOf(state)));
     }
-    record["oldestWaiting"] = TimeOf(counts.oldestWaiting.value_or(JournalTime()));
+    record["oldestWaiting"] = RecordTime(counts.oldestWaiting.value_or(JournalTime()));
     record["paused"] = paused;
     if (line.empty())
         line = _("nothing yet");

@@ -1,6 +1,7 @@
 #include "host/program/base/PathText.h"
 #include "host/program/commands/JobReport.h"
 #include "host/program/commands/JournalOptions.h"
+#include "host/program/commands/MachineReport.h"
 
 #include <wx/intl.h>
 
@@ -33,7 +34,7 @@ void TellJobs(const QueueOptions& options, JobState state, Journal& journal, Rep
     query.newestFirst = IsLast(state);
     query.limit = options.limit;
     for (const Job& job : journal.List(query))
-        TellJob(job, reporter);
+        TellJob(job, reporter, journal.Shared() != nullptr);
 }
 
 void TellFolders(const QueueOptions& options, Journal& journal, const NamedJournal& named,
@@ -63,6 +64,8 @@ ExitCode Run(const QueueOptions& options, Journal& journal, const NamedJournal& 
         for (const JobState state : ShownStates)
             TellJobs(options, state, journal, reporter);
     TellFolders(options, journal, named, reporter);
+    if (SharedJournal* const shared = journal.Shared())
+        TellMachines(*shared, reporter);
     return ExitCode::Done;
 }
 
