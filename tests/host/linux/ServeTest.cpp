@@ -23,7 +23,8 @@ protected:
         const std::string obstacle = PostgresServer::Obstacle();
         if (!obstacle.empty())
             GTEST_SKIP() << obstacle;
-        m_url = Server().Url("serve");
+        static int s_tests = 0;
+        m_url = Server().Url("serve" + std::to_string(++s_tests));
         fs::create_directory_symlink(m_folder.Path(), m_folder / "elsewhere");
         ConfigureQueue();
     }
@@ -41,7 +42,11 @@ protected:
         return std::make_unique<RunningProgram>(QuillonCommand(arguments));
     }
 
-    Program StartFinder() const { return Start(Watch()); }
+    Program StartFinder() const {
+        Program finder = Start(Watch());
+        AwaitFile(m_folder / "in/processed");
+        return finder;
+    }
 
     /// @param share where it has what the finder has in the test's folder
     Arguments Serve(const std::string& share = "elsewhere", const Arguments& more = {}) const {
@@ -146,7 +151,6 @@ constexpr int Shares = 4;
 
 TEST_P(ServeCrashTest, WhereverOneDiesAnotherGoesOn) {
     const Program finder = StartFinder();
-    AwaitFile(m_folder / "in/processed");
     int step = GetParam();
     for (bool died = true; died && !HasFailure(); step += Shares) {
         for (const char* const name : {"in/processed", "in/failed", "out"})
@@ -200,10 +204,11 @@ TEST_F(ServeTest, WhatIsUnderWayOutlastsTheDatabase) {
     const Program worker = Start(Serve("elsewhere", {"-j", "1"}));
     Put("a.doc", "started=" + Path("started") + "\nwait=" + Path("go"));
     AwaitFile(m_folder / "started");
-    Server().Kill();
+    PostgresServer& server = Server();
+    server.Kill();
     m_folder.Write("go", "");
     Put("b.doc");
-    Server().Start();
+    server.Start();
     AwaitOutputs(2);
     Await("an end of all", [this] { return !HasOpenJobs(); });
     EXPECT_THAT(FilesIn("out"), ElementsAre("a.ps", "b.ps"));
@@ -212,7 +217,6 @@ TEST_F(ServeTest, WhatIsUnderWayOutlastsTheDatabase) {
 
 TEST_F(ServeTest, OneWithoutTheShareLeavesItToAnother) {
     const Program finder = StartFinder();
-    AwaitFile(m_folder / "in/processed");
     const Program without = Start(Serve("elsewhere", {"-j", "1"}));
     Put("a.doc");
     AwaitOutputs(1);
