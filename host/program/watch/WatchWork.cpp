@@ -89,14 +89,24 @@ WatchWork::UnderWay* WatchWork::FindUnderWay(const Job& job) {
     return nullptr;
 }
 
-void WatchWork::Sweep(const fs::path& outputFolder) {
+/// Whether the journal knows of an output that is not in its place, and of which this holds.
+bool WatchWork::HasJobWithProduct(const std::function<bool(const Job&)>& isMeant) {
     for (const JobState state : {JobState::Submitting, JobState::Printing, JobState::Delivering}) {
         JobQuery query;
         query.state = state;
-        for (const Job& job : m_journal.List(query))
-            if (!FindUnderWay(job) && job.workplace.parent_path().parent_path() == outputFolder)
-                return; // its folder's turn comes, or it is watched no more
+        const std::vector<Job> jobs = m_journal.List(query);
+        if (std::any_of(jobs.begin(), jobs.end(), isMeant))
+            return true;
     }
+    return false;
+}
+
+void WatchWork::Sweep(const fs::path& outputFolder) {
+    const auto isOthers = [&](const Job& job) {
+        return !FindUnderWay(job) && job.workplace.parent_path().parent_path() == outputFolder;
+    };
+    if (HasJobWithProduct(isOthers))
+        return; // its folder's turn comes, or it is watched no more
     Workplace::RemoveAbandoned(outputFolder, Workplace::Kind::OfWatch);
 }
 
@@ -207,12 +217,15 @@ bool WatchWork::EndJob() {
 }
 
 /// Leaves a document to whoever has claimed it while this program gave no signs, and with it what
-/// may have been made of it: that one moves it, or sweeps it.
+/// has been made of it, if the journal knows of that: that one moves it.
 void WatchWork::Abandon(UnderWay& work) {
     SetLevelAndGetLogger(LevelWarning, __FILE__, __func__, __LINE__)
         << "Document " << std::to_string(work.job.id) << " of " << work.job.folder
         << " is somebody else's by now: this program was too slow, or could not be heard";
-    if (work.workplace && HasProduct(work.job.state))
+    const auto isProduct = [&work](const Job& job) {
+        return job.workplace.parent_path() == work.workplace->Path();
+    };
+    if (work.workplace && HasProduct(work.job.state) && HasJobWithProduct(isProduct))
         work.workplace->Leave();
 }
 

@@ -99,7 +99,8 @@ private:
     Circumstances PresentCircumstances();
     void Decide(UnderWay& work);
     bool End(UnderWay& work);
-    static void Abandon(UnderWay& work);
+    void Abandon(UnderWay& work);
+    bool HasJobWithProduct(const std::function<bool(const Job&)>& isMeant);
     std::optional<Fault> DoLastSteps(UnderWay& work);
     void Report(UnderWay& work) const;
     WatchedFolder* Find(const wxString& name);
