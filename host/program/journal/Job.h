@@ -46,7 +46,7 @@ struct Job {
     /// The source's SHA-256, in hexadecimal digits, where machines share the journal; or empty. By
     /// it another machine knows the file, to which device and number say nothing.
     std::string digest;
-    int priority = 50;     ///< 1 to 100
+    int priority = 50; ///< 1 to 100
     JobState state = JobState::Waiting;
     bool open = true; ///< its source is where it was found; no other job has that file then
 

@@ -1,5 +1,5 @@
-// Loaded in front of the program's libraries: ends `quillon watch` or `quillon serve` before its Nth
-// step that a file system keeps, as a power failure does at any moment.
+// Loaded in front of the program's libraries: ends `quillon watch` or `quillon serve` before its
+// Nth step that a file system keeps, as a power failure does at any moment.
 
 #include <dlfcn.h>
 #include <sys/stat.h>
