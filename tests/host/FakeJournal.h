@@ -1,11 +1,11 @@
 #pragma once
 
-#include "host/program/journal/Journal.h"
+#include "host/program/journal/SharedJournal.h"
 
 #include <algorithm>
 
 /// A journal in memory, as far as a page goes: its jobs stand as the test has put them.
-class FakeJournal : public Journal {
+class FakeJournal : public Journal, public SharedJournal {
 public:
     /// What is in it, and outlives each object.
     struct Content {
@@ -13,6 +13,7 @@ public:
         std::set<wxString> paused;
         std::string fault; ///< what each call throws; or empty
         std::vector<std::int64_t> retried;
+        std::optional<std::vector<Machine>> machines; ///< that share it, if any do
     };
 
     explicit FakeJournal(Content& content) : m_content(content) {}
@@ -69,6 +70,14 @@ public:
             m_content.paused.erase(folder);
     }
     std::set<wxString> Paused() override { return m_content.paused; }
+
+    SharedJournal* Shared() override { return m_content.machines ? this : nullptr; }
+    void Announce(const std::vector<AnnouncedFolder>&, const wxString&,
+                  const std::vector<wxString>&) override {}
+    std::vector<AnnouncedFolder> Announced() override { return {}; }
+    void Report(const Machine&, const Claimant&) override {}
+    void TakeLeave(const wxString&) override {}
+    std::vector<Machine> Machines() override { return *m_content.machines; }
 
 private:
     Content& m_content;

@@ -26,6 +26,16 @@ Job JobOf(std::int64_t id, JobState state, const char* name) {
     return job;
 }
 
+/// @param version of what it converts with; empty for none
+Machine MachineOf(const char* name, const char* version) {
+    Machine machine;
+    machine.name = name;
+    machine.makers = {version, "LibreOffice 7", "Ghostscript 10", "f0"};
+    machine.isAlive = true;
+    machine.started = machine.seen = std::chrono::system_clock::now();
+    return machine;
+}
+
 /// A server on a watch that is well, with one folder.
 class Page : public testing::Test {
 protected:
@@ -161,6 +171,12 @@ TEST_F(Page, TellsWhatIsNotWell) {
         {[this] { m_journal.paused = {"letters"}; }, "folder letters is paused\n"},
         {[this] { m_status.folders[0].reachable = false; }, "folder letters cannot be reached\n"},
         {[this] { m_status.folders[0].obstacle = "no space"; }, "folder letters: no space\n"},
+        {[this] { m_journal.machines = {MachineOf("finder:1", "")}; }, "no machine converts"},
+        {[this] {
+             m_journal.machines = {MachineOf("gone:1", "2.0")};
+             m_journal.machines->front().isAlive = false;
+         },
+         "no machine converts"},
         {[this] { m_hasJournal = false; }, "no journal\n"},
     };
     for (const auto& [harm, reason] : cases) {
@@ -200,6 +216,43 @@ TEST_F(Page, GivesFiguresWithoutDocuments) {
           R"(quillon_paused{folder="letters"} 1)"})
         EXPECT_THAT(text, HasSubstr(line));
     EXPECT_THAT(text, Not(HasSubstr("alert")));
+}
+
+TEST_F(Page, ShowsTheMachinesThatShareTheJournal) {
+    EXPECT_THAT(Get("/").body, Not(HasSubstr("Machines")));
+    m_journal.jobs = {JobOf(7, JobState::Converting, "own.doc"),
+                      JobOf(8, JobState::Converting, "others.doc")};
+    m_journal.jobs[1].claimedBy = "b<:2";
+    m_status.running.resize(1);
+    m_status.running[0].job = 7;
+    m_board.Put(m_status);
+    Machine other = MachineOf("b<:2", "2.0");
+    other.jobs = 4;
+    other.running = 2;
+    other.cannot = {"pub"};
+    other.makers.fonts = "f1";
+    Machine gone = MachineOf("c:3", "2.0");
+    gone.isAlive = false;
+    Machine replaced = gone;
+    replaced.name = "a:0";
+    replaced.seen -= std::chrono::minutes(1);
+    m_journal.machines = {MachineOf("a:1", "2.0"), other, MachineOf("d:4", "2.0"), gone, replaced};
+    m_journal.machines->front().obstacle = "<full>";
+
+    const std::string page = Get("/").body;
+    for (const char* shown : {"others.doc", "by b&lt;:2", "converts 4 at a time", "2 under way",
+                              "differs: other fonts<", "has nothing to open pub with",
+                              "&lt;full&gt;", "Not heard of", "<dd>2</dd>"})
+        EXPECT_THAT(page, HasSubstr(shown));
+    for (const char* hidden : {"own.doc", "a:0"}) // one has a line of its own, one an heir
+        EXPECT_THAT(page, Not(HasSubstr(hidden)));
+    EXPECT_EQ(Get("/healthz").status, 200);
+    const std::string figures = Get("/metrics").body;
+    for (const char* line :
+         {R"(quillon_machine_up{machine="a:1"} 1)", R"(quillon_machine_up{machine="c:3"} 0)",
+          R"(quillon_machine_running{machine="b<:2"} 2)",
+          R"(quillon_machine_jobs{machine="b<:2"} 4)"})
+        EXPECT_THAT(figures, HasSubstr(line));
 }
 
 TEST_F(Page, SpeaksItsReadersLanguage) {

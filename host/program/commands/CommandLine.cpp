@@ -58,10 +58,10 @@ Output
   what the system or an engine's libraries say in their own words.
   `quillon queue` has a line for each document of a watched folder that waits, is under way or has
   failed: number, folder, name, state, attempts, next try, reason; then one for each folder, with
-  how many there are in each state.
+  how many there are in each state, and for a queue that machines share one for each machine.
   With --json, JSON Lines on stdout: records of "type" filter, folder, application, engine,
-  printer, distiller, isolation, panel, missing, document, job, queue, retry, cancel, pause, part,
-  summary and error; lines for people then go to stderr. The "code", the "state" and the "fault" (document,
+  printer, distiller, isolation, panel, missing, document, job, queue, machine, retry, cancel,
+  pause, part, summary and error; lines for people then go to stderr. The "code", the "state" and the "fault" (document,
   machine or null) of a document or job are the same in every language, and times are UTC; "fonts"
   are those not installed, each with what was "asked" for and "used", and whether both have the
   "sameMetrics", so that lines break alike.

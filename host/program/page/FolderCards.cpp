@@ -3,8 +3,6 @@
 #include "host/program/page/PageParts.h"
 #include "host/program/page/Wording.h"
 
-#include <algorithm>
-
 namespace {
 
 void WriteBadge(Html& html, const FolderStatus& folder, bool isPaused, const Texts& texts) {
@@ -50,15 +48,11 @@ void WriteFigures(Html& html, const PageContent& content, const FolderStatus& fo
     const Texts& texts = content.texts;
     const wxString& name = folder.configuration.name;
     const auto of = [&](JobState state) { return CountOf(content.journal, state, &name); };
-    const auto running =
-        std::count_if(content.status.running.begin(), content.status.running.end(),
-                      [&name](const RunningDocument& document) { return document.folder == name; });
     const std::size_t failed = of(JobState::Failed);
     html << "<dl class=\"figures\">";
     WriteFigure(html, texts(wxTRANSLATE("Settling")), NumberText(folder.settling));
     WriteFigure(html, texts(wxTRANSLATE("Waiting")), NumberText(of(JobState::Waiting)));
-    WriteFigure(html, texts(wxTRANSLATE("Under way")),
-                NumberText(static_cast<std::size_t>(running)));
+    WriteFigure(html, texts(wxTRANSLATE("Under way")), NumberText(CountUnderWay(content, &name)));
     if (folder.configuration.print)
         WriteFigure(html, texts(wxTRANSLATE("At the printer")),
                     NumberText(of(JobState::Submitting) + of(JobState::Printing)));

@@ -1,5 +1,6 @@
 #include "host/program/page/Health.h"
 
+#include "host/program/journal/Machines.h"
 #include "host/program/page/Wording.h"
 
 #include <algorithm>
@@ -51,6 +52,10 @@ std::vector<wxString> ReasonsOfIllness(const WatchStatus& status, const JournalE
             texts(wxTRANSLATE("the service is ending: what is under way is finished first")));
     if (IsPaused("", status, journal))
         reasons.push_back(texts(wxTRANSLATE("all folders are paused")));
+    if (journal.machines &&
+        std::none_of(journal.machines->begin(), journal.machines->end(), Converts))
+        reasons.push_back(texts(wxTRANSLATE("no machine converts documents: start `quillon serve` "
+                                            "on one of them")));
     if (!hasLooked) // how folders are is not known yet
         return reasons;
     for (const FolderStatus& folder : status.folders) {

@@ -1,5 +1,7 @@
 #include "host/program/page/JournalAccess.h"
 
+#include "host/program/journal/Machines.h"
+
 #include <wx/intl.h>
 
 using Clock = std::chrono::steady_clock;
@@ -10,6 +12,7 @@ constexpr auto Freshness = std::chrono::seconds(1);
 constexpr auto LongestRetry = std::chrono::seconds(5);
 constexpr std::size_t FailedShown = 50;
 constexpr std::size_t DoneShown = 10;
+constexpr std::size_t ConvertingShown = 200;
 constexpr std::size_t RetriedAtOnce = 500;
 
 JobQuery Newest(JobState state, std::size_t limit) {
@@ -50,6 +53,10 @@ JournalExtract JournalAccess::Read() {
         extract.paused = journal.Paused();
         extract.failed = journal.List(Newest(JobState::Failed, FailedShown));
         extract.done = journal.List(Newest(JobState::Archived, DoneShown));
+        if (SharedJournal* const shared = journal.Shared()) {
+            extract.machines = WithoutReplaced(shared->Machines());
+            extract.converting = journal.List(Newest(JobState::Converting, ConvertingShown));
+        }
     });
     if (fault)
         m_extract.fault = fault->what;

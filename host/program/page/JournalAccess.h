@@ -1,16 +1,20 @@
 #pragma once
 
+#include "host/program/journal/SharedJournal.h"
 #include "host/program/page/PageServer.h"
 
 #include <mutex>
+#include <optional>
 
 /// What a page shows of the journal.
 struct JournalExtract {
     wxString fault; ///< why it cannot be read; or empty. Then all that follows is empty
     std::map<wxString, FolderCounts> counts;
     std::set<wxString> paused;
-    std::vector<Job> failed; ///< the last ones, newest first
-    std::vector<Job> done;   ///< likewise
+    std::vector<Job> failed;                      ///< the last ones, newest first
+    std::vector<Job> done;                        ///< likewise
+    std::optional<std::vector<Machine>> machines; ///< that share the journal, if any do
+    std::vector<Job> converting;                  ///< by all of them
 };
 
 /// The journal, as requests need it; for any thread. It is read once a second at most, however

@@ -14,18 +14,18 @@ namespace {
 const prometheus::Histogram::BucketBoundaries SecondsOfDocuments = {0.25, 0.5, 1,  2,   5,   10,
                                                                     20,   30,  60, 120, 300, 600};
 
-/// A figure of which each folder has its own.
-class FolderGauge {
+/// A figure of which each folder, or whatever the label says, has its own.
+class Gauge {
 public:
-    FolderGauge(const char* name, const char* help) {
+    Gauge(const char* name, const char* help, const char* label = "folder") : m_label(label) {
         m_family.name = name;
         m_family.help = help;
         m_family.type = prometheus::MetricType::Gauge;
     }
 
-    void Set(const wxString& folder, double value) {
+    void Set(const wxString& whose, double value) {
         prometheus::ClientMetric metric;
-        metric.label = {{"folder", folder.utf8_string()}};
+        metric.label = {{m_label, whose.utf8_string()}};
         metric.gauge.value = value;
         m_family.metric.push_back(metric);
     }
@@ -33,6 +33,7 @@ public:
     MetricFamily& Family() { return m_family; }
 
 private:
+    const char* const m_label;
     MetricFamily m_family;
 };
 
@@ -44,10 +45,10 @@ double SecondsWaited(const FolderCounts& counts, JournalTime now) {
 
 void AddStatus(std::vector<MetricFamily>& families, const WatchStatus& status,
                const JournalExtract& journal) {
-    FolderGauge running("quillon_running", "Documents under way");
-    FolderGauge free("quillon_free_bytes", "Room where the output goes");
-    FolderGauge reachable("quillon_folder_reachable", "Whether the folder can be seen");
-    FolderGauge paused("quillon_paused", "Whether a person has paused the folder, or all");
+    Gauge running("quillon_running", "Documents under way");
+    Gauge free("quillon_free_bytes", "Room where the output goes");
+    Gauge reachable("quillon_folder_reachable", "Whether the folder can be seen");
+    Gauge paused("quillon_paused", "Whether a person has paused the folder, or all");
     const bool allPaused = IsPaused("", status, journal);
     for (const FolderStatus& folder : status.folders) {
         const wxString& name = folder.configuration.name;
@@ -59,7 +60,7 @@ void AddStatus(std::vector<MetricFamily>& families, const WatchStatus& status,
         reachable.Set(name, folder.reachable ? 1 : 0);
         paused.Set(name, allPaused || IsPaused(name, status, journal) ? 1 : 0);
     }
-    for (FolderGauge* gauge : {&running, &free, &reachable, &paused})
+    for (Gauge* gauge : {&running, &free, &reachable, &paused})
         families.push_back(std::move(gauge->Family()));
 }
 
@@ -68,8 +69,8 @@ void AddJournal(std::vector<MetricFamily>& families, const WatchStatus& status,
                 const JournalExtract& journal, JournalTime now) {
     if (!journal.fault.empty())
         return;
-    FolderGauge waiting("quillon_waiting", "Documents that wait for their turn");
-    FolderGauge oldest("quillon_oldest_waiting_seconds", "How long the first of them has waited");
+    Gauge waiting("quillon_waiting", "Documents that wait for their turn");
+    Gauge oldest("quillon_oldest_waiting_seconds", "How long the first of them has waited");
     for (const FolderStatus& folder : status.folders) {
         const wxString& name = folder.configuration.name;
         const auto found = journal.counts.find(name);
@@ -80,6 +81,20 @@ void AddJournal(std::vector<MetricFamily>& families, const WatchStatus& status,
     }
     families.push_back(std::move(waiting.Family()));
     families.push_back(std::move(oldest.Family()));
+}
+
+void AddMachines(std::vector<MetricFamily>& families, const std::vector<Machine>& machines) {
+    Gauge up("quillon_machine_up", "Whether the machine has reported within its lease", "machine");
+    Gauge running("quillon_machine_running", "Documents that it has under way", "machine");
+    Gauge jobs("quillon_machine_jobs", "How many it may have; 0 for as many as pay, or none",
+               "machine");
+    for (const Machine& machine : machines) {
+        up.Set(machine.name, machine.isAlive ? 1 : 0);
+        running.Set(machine.name, machine.isAlive ? static_cast<double>(machine.running) : 0);
+        jobs.Set(machine.name, machine.jobs);
+    }
+    for (Gauge* gauge : {&up, &running, &jobs})
+        families.push_back(std::move(gauge->Family()));
 }
 
 } // namespace
@@ -118,6 +133,8 @@ std::string Metrics::Text(const WatchStatus& status, const JournalExtract& journ
     std::vector<MetricFamily> families = m_registry.Collect();
     AddStatus(families, status, journal);
     AddJournal(families, status, journal, now);
+    if (journal.machines)
+        AddMachines(families, *journal.machines);
     std::ostringstream text;
     prometheus::TextSerializer().Serialize(text, families);
     return text.str();

@@ -60,7 +60,7 @@ void WriteFooter(Html& html, const PageContent& content) {
 /// A part is what the script replaces when it has changed.
 void WritePart(Html& html, const PageContent& content, const char* id,
                void (*write)(Html& html, const PageContent& content)) {
-    html << "<section id=\"" << id << "\" data-part tabindex=\"-1\">\n";
+    html << "<section id=\"" << id << "\" data-part tabindex=\"-1\">";
     write(html, content);
     html << "</section>\n";
 }
@@ -77,6 +77,7 @@ std::string WritePage(const PageContent& content) {
     WritePart(html, content, "state", WriteState);
     WritePart(html, content, "folders", WriteFolders);
     WritePart(html, content, "running", WriteRunning);
+    WritePart(html, content, "machines", WriteMachines);
     WritePart(html, content, "failed", WriteFailed);
     WritePart(html, content, "done", WriteDone);
     html << "</main>\n";

@@ -77,6 +77,41 @@ void WriteFailedJob(Html& html, const PageContent& content, const Job& job) {
     html << "</li>\n";
 }
 
+/// With how far it is.
+void WriteOwn(Html& html, const PageContent& content, const RunningDocument& document) {
+    const auto seconds = std::chrono::duration<double>(content.steadyNow - document.since);
+    const auto percent = static_cast<std::size_t>(std::clamp(document.percent, 0, 100));
+    const std::string id = std::to_string(document.job);
+    html << "<li class=\"card\"><div class=\"row\"><div><h3 id=\"run-" << id << "\"><bdi>"
+         << OneLine(document.name) << "</bdi></h3><p class=\"quiet\"><bdi>"
+         << OneLine(document.folder) << "</bdi>" << (document.step.empty() ? "" : ", ")
+         << OneLine(document.step) << "</p></div><p class=\"quiet\">"
+         << DurationText(seconds.count(), content.texts)
+         << "</p></div><progress aria-labelledby=\"run-" << id << "\" max=\"100\" value=\""
+         << percent << "\"></progress></li>\n";
+}
+
+/// With the machine that has it.
+void WriteOthers(Html& html, const PageContent& content, const Job& job) {
+    html << "<li class=\"card\"><div class=\"row\"><div><h3><bdi>" << NameOfDocument(job)
+         << "</bdi></h3><p class=\"quiet\"><bdi>" << OneLine(job.folder) << "</bdi>, "
+         << wxString::Format(content.texts(wxTRANSLATE("by %s")), OneLine(job.claimedBy))
+         << "</p></div><p class=\"quiet\">" << AgeText(job.begun, content.now, content.texts)
+         << "</p></div></li>\n";
+}
+
+/// The documents that other machines have under way.
+std::vector<Job> OthersOf(const PageContent& content) {
+    const std::vector<RunningDocument>& own = content.status.running;
+    std::vector<Job> others;
+    for (const Job& job : content.journal.converting)
+        if (std::none_of(own.begin(), own.end(), [&job](const RunningDocument& document) {
+                return document.job == job.id;
+            }))
+            others.push_back(job);
+    return others;
+}
+
 } // namespace
 
 std::size_t CountOf(const JournalExtract& journal, JobState state, const wxString* folder) {
@@ -86,6 +121,17 @@ std::size_t CountOf(const JournalExtract& journal, JobState state, const wxStrin
             if (const auto found = counts.jobs.find(state); found != counts.jobs.end())
                 sum += found->second;
     return sum;
+}
+
+std::size_t CountUnderWay(const PageContent& content, const wxString* folder) {
+    if (content.journal.machines)
+        return CountOf(content.journal, JobState::Converting, folder);
+    const std::vector<RunningDocument>& running = content.status.running;
+    const auto count =
+        std::count_if(running.begin(), running.end(), [folder](const auto& document) {
+            return !folder || document.folder == *folder;
+        });
+    return static_cast<std::size_t>(count);
 }
 
 void BeginForm(Html& html, const PageContent& content, const char* action) {
@@ -102,7 +148,7 @@ void WriteState(Html& html, const PageContent& content) {
     WriteReasons(html, content);
     html << "<div class=\"bar card\"><dl class=\"figures sums\">";
     WriteFigure(html, texts(wxTRANSLATE("Waiting")), CountOf(journal, JobState::Waiting, nullptr));
-    WriteFigure(html, texts(wxTRANSLATE("Under way")), content.status.running.size());
+    WriteFigure(html, texts(wxTRANSLATE("Under way")), CountUnderWay(content, nullptr));
     WriteFigure(html, texts(wxTRANSLATE("Done")),
                 CountOf(journal, JobState::Finished, nullptr) +
                     CountOf(journal, JobState::Archived, nullptr));
@@ -115,23 +161,17 @@ void WriteState(Html& html, const PageContent& content) {
 
 void WriteRunning(Html& html, const PageContent& content) {
     const Texts& texts = content.texts;
+    const std::vector<Job> others = OthersOf(content);
     html << "<div class=\"bar\"><h2>" << texts(wxTRANSLATE("Under way")) << "</h2></div>\n";
-    if (content.status.running.empty()) {
+    if (content.status.running.empty() && others.empty()) {
         html << "<p class=\"quiet\">" << texts(wxTRANSLATE("Nothing at the moment.")) << "</p>\n";
         return;
     }
     html << "<ul class=\"list\">\n";
-    for (const RunningDocument& document : content.status.running) {
-        const auto seconds = std::chrono::duration<double>(content.steadyNow - document.since);
-        const auto percent = static_cast<std::size_t>(std::clamp(document.percent, 0, 100));
-        const std::string id = std::to_string(document.job);
-        html << "<li class=\"card\"><div class=\"row\"><div><h3 id=\"run-" << id << "\"><bdi>"
-             << OneLine(document.name) << "</bdi></h3><p class=\"quiet\"><bdi>"
-             << OneLine(document.folder) << "</bdi>" << (document.step.empty() ? "" : ", ")
-             << OneLine(document.step) << "</p></div><p class=\"quiet\">"
-             << DurationText(seconds.count(), texts) << "</p></div><progress aria-labelledby=\"run-"
-             << id << "\" max=\"100\" value=\"" << percent << "\"></progress></li>\n";
-    }
+    for (const RunningDocument& document : content.status.running)
+        WriteOwn(html, content, document);
+    for (const Job& job : others)
+        WriteOthers(html, content, job);
     html << "</ul>\n";
 }
 

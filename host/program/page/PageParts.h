@@ -12,6 +12,9 @@ void WriteFolders(Html& html, const PageContent& content);
 /// The documents under way.
 void WriteRunning(Html& html, const PageContent& content);
 
+/// The machines that share the journal, if any do.
+void WriteMachines(Html& html, const PageContent& content);
+
 /// The documents that have failed last, with their reasons.
 void WriteFailed(Html& html, const PageContent& content);
 
@@ -24,3 +27,7 @@ void BeginForm(Html& html, const PageContent& content, const char* action);
 /// How many documents of a folder, or of all, have come to a state.
 /// @param folder its name; null for all
 std::size_t CountOf(const JournalExtract& journal, JobState state, const wxString* folder);
+
+/// How many documents of a folder, or of all, are being converted, by this machine or another.
+/// @param folder its name; null for all
+std::size_t CountUnderWay(const PageContent& content, const wxString* folder);

@@ -18,6 +18,7 @@ h1 { font-size: 1.4rem; }
 h2 { font-size: 1.1rem; margin-right: auto; }
 h3 { font-size: 1rem; }
 section { margin-top: 1.5rem; outline-offset: .4rem; }
+section:empty { display: none; }
 .bar { display: flex; flex-wrap: wrap; gap: .5rem 1rem; align-items: center; margin-bottom: .6rem; }
 .card { background: var(--card); border: 1px solid var(--line); border-radius: .5rem;
   padding: .8rem 1rem; }
