@@ -31,7 +31,10 @@ install(FILES "${packaging}/debian/copyright" "${CMAKE_BINARY_DIR}/packaging/cha
         DESTINATION /usr/share/doc/quillon COMPONENT system EXCLUDE_FROM_ALL)
 install(FILES "${packaging}/watch.toml"
         DESTINATION /etc/quillon COMPONENT system EXCLUDE_FROM_ALL)
-install(FILES "${packaging}/quillon.service"
+# There may be a password in it; the installation gives it to the service's group.
+install(FILES "${packaging}/serve.toml" PERMISSIONS OWNER_READ OWNER_WRITE GROUP_READ
+        DESTINATION /etc/quillon COMPONENT system EXCLUDE_FROM_ALL)
+install(FILES "${packaging}/quillon.service" "${packaging}/quillon-serve.service"
         DESTINATION /lib/systemd/system COMPONENT system EXCLUDE_FROM_ALL)
 install(FILES "${packaging}/sysusers.conf" RENAME quillon.conf
         DESTINATION /usr/lib/sysusers.d COMPONENT system EXCLUDE_FROM_ALL)

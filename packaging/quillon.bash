@@ -8,13 +8,14 @@ _quillon_options() {
     convert) printf '%s ' --out --printer --settings --ps --pdf --profile --jobs --set ;;
     settings) printf '%s ' --settings ;;
     watch)
-        printf '%s ' --config --check --once --journal --http \
+        printf '%s ' --config --check --once --journal --queue --http \
             --out --printer --settings --ps --pdf --profile --jobs --set
         ;;
-    queue) printf '%s ' --config --journal --folder --state --limit ;;
-    cancel) printf '%s ' --config --journal ;;
-    retry) printf '%s ' --config --journal --folder --failed ;;
-    pause | resume) printf '%s ' --config --journal ;;
+    serve) printf '%s ' --queue --config --map --any-version --http --jobs ;;
+    queue) printf '%s ' --config --journal --queue --folder --state --limit ;;
+    cancel) printf '%s ' --config --journal --queue ;;
+    retry) printf '%s ' --config --journal --queue --folder --failed ;;
+    pause | resume) printf '%s ' --config --journal --queue ;;
     print-server) printf '%s ' --cups-server-root --cups-server-bin ;;
     esac
 }
@@ -49,7 +50,7 @@ _quillon_choose_files() {
 _quillon() {
     local current=$2 previous=$3 command='' word
     local commands=$'cancel\nconvert\nfilter\npause\nprint-server\nqueue\nresume\nretry\nscreen'
-    commands+=$'\nsettings\nstatus\nwatch'
+    commands+=$'\nserve\nsettings\nstatus\nwatch'
     for word in "${COMP_WORDS[@]:1:COMP_CWORD-1}"; do
         [[ -n $word && $'\n'$commands$'\n' == *$'\n'"$word"$'\n'* ]] && command=$word && break
     done
@@ -70,7 +71,7 @@ _quillon() {
         _quillon_choose $'waiting\nconverting\nsubmitting\nprinting\ndelivering\nfinished\narchived\nfailed\nvanished' \
             "$current"
         ;;
-    --engine-* | --folder | --http | --jobs | -j | --limit | --memory-limit | --printer) ;; # only the user knows
+    --engine-* | --folder | --http | --jobs | -j | --limit | --map | --memory-limit | --printer | --queue) ;; # only the user knows
     *)
         if [[ $current == -* ]]; then
             _quillon_choose "$(_quillon_options "$command" | tr ' ' '\n')" "$current"
