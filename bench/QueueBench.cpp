@@ -46,10 +46,12 @@ void Finish(Journal& journal, Job job) {
 /// @return documents a second
 double Measure(const PostgresServer& server, int clients, bool finishes) {
     std::vector<ClaimableFolder> folders;
+    folders.reserve(100);
     for (int number = 0; number < 100; ++number)
         folders.push_back({wxString::Format("folder%d", number)});
     std::atomic<int> documents{0};
     std::vector<std::thread> threads;
+    threads.reserve(static_cast<std::size_t>(clients));
     const Clock::time_point start = Clock::now();
     for (int client = 0; client < clients; ++client)
         threads.emplace_back([&, journal = std::shared_ptr<Journal>(Open(server)), client] {

@@ -129,6 +129,7 @@ TEST_F(PostgresJournalTest, GivesEachDocumentOnce) {
     std::atomic<std::size_t> entered{0};
     std::atomic<std::size_t> claimed{0};
     std::vector<std::thread> threads;
+    threads.reserve(6);
     for (int finder = 0; finder < 2; ++finder)
         threads.emplace_back([&, journal = std::shared_ptr<Journal>(Open())] {
             for (int number = 0; number < Count; number += 10) {

@@ -129,6 +129,8 @@ void PostgresServer::Start() {
 }
 
 void PostgresServer::Stop() {
+    if (m_process <= 0)
+        return;
     kill(m_process, SIGINT); // without waiting for its clients
     waitpid(m_process, nullptr, 0);
     m_process = -1;
