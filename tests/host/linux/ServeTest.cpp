@@ -239,13 +239,13 @@ TEST_F(ServeTest, OneWithoutTheShareLeavesItToAnother) {
 TEST_F(ServeTest, OneThatWouldPrintOtherPagesDoesNotBegin) {
     const Program worker = Start(Serve());
     Await("a machine", [this] { return AskQueue({"queue"}, "machine").size() == 1; });
-    Run("UPDATE machine SET report = replace(report::text, '\"fonts\":\"', "
-        "'\"fonts\":\"other')::json");
+    Run("INSERT INTO machine SELECT 'older', replace(report::text, '\"fonts\":\"', "
+        "'\"fonts\":\"other')::json, started - interval '1 hour', seen, '1 hour' FROM machine");
     const RunResult other = RunQuillon(Serve());
     EXPECT_EQ(other.exitCode, 3);
     EXPECT_THAT(other.out + other.err, HasSubstr("fonts"));
     const Program any = Start(Serve(".", {"--any-version"}));
-    Await("another machine", [this] { return AskQueue({"queue"}, "machine").size() == 2; });
+    Await("another machine", [this] { return AskQueue({"queue"}, "machine").size() == 3; });
 }
 
 TEST_F(ServeTest, WhatCannotBeReachedFromHereWaitsAndIsTold) {
