@@ -6,9 +6,23 @@
 
 #include <array>
 
+namespace {
+
+/// What makes SHA-256; for all, as long as the program runs.
+BCRYPT_ALG_HANDLE Algorithm() {
+    static const BCRYPT_ALG_HANDLE s_algorithm = [] {
+        BCRYPT_ALG_HANDLE algorithm = nullptr;
+        BCryptOpenAlgorithmProvider(&algorithm, BCRYPT_SHA256_ALGORITHM, nullptr, 0);
+        return algorithm;
+    }();
+    return s_algorithm;
+}
+
+} // namespace
+
 Digest::Digest() {
     BCRYPT_HASH_HANDLE hash = nullptr;
-    if (BCryptCreateHash(BCRYPT_SHA256_ALG_HANDLE, &hash, nullptr, 0, nullptr, 0, 0) >= 0)
+    if (BCryptCreateHash(Algorithm(), &hash, nullptr, 0, nullptr, 0, 0) >= 0)
         m_hash = std::shared_ptr<void>(hash, BCryptDestroyHash);
 }
 
@@ -22,10 +36,10 @@ std::string Digest::Text() {
     if (BCryptFinishHash(m_hash.get(), bytes.data(), static_cast<ULONG>(bytes.size()), 0) < 0)
         return {};
     std::string text;
-    for (const unsigned char byte : bytes) {
+    for (const unsigned char each : bytes) {
         constexpr const char* Digits = "0123456789abcdef";
-        text += Digits[byte >> 4];
-        text += Digits[byte & 15];
+        text += Digits[each >> 4];
+        text += Digits[each & 15];
     }
     return text;
 }

@@ -8,7 +8,7 @@
 
 std::string DigestOfFonts() {
     std::set<std::string> names; // whatever order they are found in
-    const wxRegKey fonts(wxRegKey::HKLM, R"(SOFTWARE\Microsoft\Windows NT\CurrentVersion\Fonts)");
+    wxRegKey fonts(wxRegKey::HKLM, R"(SOFTWARE\Microsoft\Windows NT\CurrentVersion\Fonts)");
     wxString name;
     long place = 0;
     for (bool isThere = fonts.Exists() && fonts.GetFirstValue(name, place); isThere;
