@@ -156,8 +156,8 @@ TEST_F(PrintingTest, AJobThatTheServerHasLostIsHeldAndTold) {
     m_server.Start();
     Run("/usr/sbin/cupsenable ps0");
     Run("echo x | lp -s -d ps0 -t other"); // which gets the number
-    const auto job =
-        AwaitJob("printing", [](const auto& each) { return each["print"]["held"].get<bool>(); });
+    const auto job = AwaitJob(
+        "printing", [](const nlohmann::json& each) { return each["print"]["held"].get<bool>(); });
     EXPECT_THAT(job["reason"].get<std::string>(), HasSubstr("lost"));
     Await("the other job", [this] { return Printed() == Names{"other"}; });
     Run("lp -s -i ps0-" + std::to_string(job["print"]["job"].get<int>()) + " -H resume");
