@@ -19,6 +19,7 @@ wxString ListOf(const std::vector<wxString>& parts) {
 
 std::vector<wxString> TextsOf(const std::set<std::string>& extensions) {
     std::vector<wxString> texts;
+    texts.reserve(extensions.size());
     for (const std::string& extension : extensions)
         texts.push_back(wxString::FromUTF8(extension));
     return texts;

@@ -23,6 +23,7 @@ wxString ListOf(const std::vector<wxString>& parts) {
 
 wxString ListOf(const std::set<std::string>& extensions) {
     std::vector<wxString> parts;
+    parts.reserve(extensions.size());
     for (const std::string& extension : extensions)
         parts.push_back(wxString::FromUTF8(extension));
     return ListOf(parts);
@@ -53,10 +54,10 @@ void WriteMachine(Html& html, const PageContent& content, const Machine& machine
     html << "</h3>\n";
     WriteRemarks(html, content, machine, common);
     html << "</div><p class=\"quiet\">";
-    if (machine.isAlive)
+    if (Converts(machine))
         html << wxString::Format(content.texts(wxTRANSLATE("%zu under way")), machine.running);
-    else
-        html << "<time>" << TimeText(machine.seen) << "</time>";
+    else if (!machine.isAlive)
+        html << wxString::Format(content.texts(wxTRANSLATE("since %s")), TimeText(machine.seen));
     html << "</p></li>\n";
 }
 
