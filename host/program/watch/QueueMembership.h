@@ -10,10 +10,10 @@ public:
     /// @param journal outlives this object
     /// @param self what others are told of it; how it fares comes by Report
     /// @param finder see SharedJournal::Announce
-    QueueMembership(SharedJournal& journal, const Claimant& claimant, Machine self, wxString finder,
-                    PathMap map)
-        : m_journal(journal), m_claimant(claimant), m_self(std::move(self)),
-          m_finder(std::move(finder)), m_map(std::move(map)) {}
+    QueueMembership(SharedJournal& journal, const Claimant& claimant, Machine self,
+                    const wxString& finder, PathMap map)
+        : m_journal(journal), m_claimant(claimant), m_self(std::move(self)), m_finder(finder),
+          m_map(std::move(map)) {}
 
     /// Says that it ends. What cannot be said now will be seen when its lease has run out.
     ~QueueMembership();
