@@ -1,9 +1,12 @@
 #include "host/program/system/Spooler.h"
 
 #include "host/program/linux/PrinterAbilities.h"
+#include "host/program/linux/PrinterDescription.h"
 #include "host/program/linux/SpoolerRequest.h"
 
 #include <wx/intl.h>
+
+#include <algorithm>
 
 namespace {
 
@@ -96,6 +99,17 @@ Fault NoQueue(const wxString& queue, const wxString& server) {
             Blame::Usage, ConversionFailed, _("`lpstat -e` shows which there are")};
 }
 
+/// The attributes of a queue's printer.
+IppMessage AskForPrinter(http_t* server, const wxString& queue, const wxString& address,
+                         Fault& fault) {
+    if (!server)
+        return {nullptr, ippDelete};
+    IppMessage printer = Ask(server, RequestAbout(queue, IPP_OP_GET_PRINTER_ATTRIBUTES), fault);
+    if (!printer && WasNotFound())
+        fault = NoQueue(queue, address);
+    return printer;
+}
+
 } // namespace
 
 bool Spooler::IsAvailable() {
@@ -136,43 +150,47 @@ wxString Spooler::Address() {
 std::optional<Fault> Spooler::Check(const PrintTicket& ticket) {
     Fault fault;
     const auto connection = Connection(fault);
-    if (!connection)
-        return fault;
-    const IppMessage printer =
-        Ask(Http(connection), RequestAbout(ticket.queue, IPP_OP_GET_PRINTER_ATTRIBUTES), fault);
+    const IppMessage printer = AskForPrinter(Http(connection), ticket.queue, Address(), fault);
     if (!printer) {
         LetGo();
-        return WasNotFound() ? NoQueue(ticket.queue, Address()) : fault;
+        return fault;
     }
+    const auto description = PrinterDescription::Fetch(Http(connection), ticket.queue);
     for (const auto& [option, value] : ticket.options)
-        if (auto unsupported = FindUnsupported(printer.get(), ticket.queue, option, value))
+        if (auto unsupported = FindUnsupported(printer.get(), description ? &*description : nullptr,
+                                               ticket.queue, option, value))
             return unsupported;
     return std::nullopt;
 }
 
-std::optional<std::string> Spooler::Choose(const wxString& queue,
-                                           const std::vector<std::string>& types, Fault& fault) {
+std::optional<PrintWay> Spooler::FindWay(const wxString& queue,
+                                         const std::vector<std::string>& types,
+                                         const PageSize& pages, Fault& fault) {
     const auto connection = Connection(fault);
-    if (!connection)
-        return std::nullopt;
-    IppMessage request = RequestAbout(queue, IPP_OP_GET_PRINTER_ATTRIBUTES);
-    AskFor(request.get(), {"document-format-supported"});
-    const IppMessage printer = Ask(Http(connection), std::move(request), fault);
+    const IppMessage printer = AskForPrinter(Http(connection), queue, Address(), fault);
     if (!printer) {
         LetGo();
-        if (WasNotFound())
-            fault = NoQueue(queue, Address());
         return std::nullopt;
     }
+    PrintWay way;
     ipp_attribute_t* const supported = Attribute(printer.get(), "document-format-supported");
     for (const std::string& type : types)
         if (supported && ippContainsString(supported, type.c_str()))
-            return type;
-    fault = {
-        wxString::Format(_("the queue \"%s\" does not take what was made of the document"), queue),
-        Blame::Usage, ConversionFailed,
-        _("Have PDF made as well, by the settings, or choose another queue")};
-    return std::nullopt;
+            way.types.push_back(type);
+    if (way.types.empty()) {
+        fault = {
+            wxString::Format(_("the queue \"%s\" takes neither PostScript nor PDF files"), queue),
+            Blame::Usage, ConversionFailed, _("Choose another queue")};
+        return std::nullopt;
+    }
+    way.media = MediaFor(printer.get(), pages);
+    const auto description = PrinterDescription::Fetch(Http(connection), queue);
+    const bool isTooLarge = pages.width > 0 && way.media.empty();
+    // The server scales PDF only, and nothing where it does not know the printer.
+    if (description && (isTooLarge || !description->TakesPostScript()))
+        std::stable_partition(way.types.begin(), way.types.end(),
+                              [](const std::string& type) { return type == "application/pdf"; });
+    return way;
 }
 
 std::optional<int> Spooler::Create(const PrintTicket& ticket, const wxString& name, Fault& fault) {
@@ -184,7 +202,6 @@ std::optional<int> Spooler::Create(const PrintTicket& ticket, const wxString& na
                  name.utf8_str());
     cups_option_t* options = nullptr;
     int count = 0;
-    count = cupsAddOption("print-scaling", "none", count, &options); // unless somebody asks for it
     for (const auto& [option, value] : ticket.options)
         count = cupsAddOption(option.c_str(), value.c_str(), count, &options);
     cupsEncodeOptions2(request.get(), count, options, IPP_TAG_OPERATION);

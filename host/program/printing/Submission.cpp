@@ -3,6 +3,9 @@
 #include <wx/intl.h>
 
 #include <algorithm>
+#include <fstream>
+#include <sstream>
+#include <string_view>
 
 namespace fs = std::filesystem;
 
@@ -41,31 +44,93 @@ std::optional<Fault> MakeRoom(Spooler& spooler, const Submission& submission) {
                  Blame::Machine};
 }
 
+/// @return the best of what has been made; null when the queue takes none of it
+const Kind* Choose(const Submission& submission, const PrintWay& way) {
+    std::error_code error;
+    for (const std::string& type : way.types)
+        for (const Kind& kind : Kinds)
+            if (type == kind.type && fs::is_regular_file(FileOf(submission, kind), error))
+                return &kind;
+    return nullptr;
+}
+
+Fault NothingFor(const Submission& submission) {
+    return {wxString::Format(_("the queue \"%s\" does not take what was made of the document"),
+                             submission.ticket.queue),
+            Blame::Usage, ConversionFailed,
+            _("Have PDF made as well, by the settings, or choose another queue")};
+}
+
+/// The size of the pages, by the comments in front of PostScript; 0 where they do not tell.
+PageSize SizeOf(const fs::path& postScript) {
+    constexpr std::string_view Media = "%%DocumentMedia:";
+    constexpr int MostLines = 200;
+    std::ifstream file(postScript, std::ios::binary);
+    PageSize size;
+    std::string line;
+    for (int i = 0; i < MostLines && std::getline(file, line); ++i) {
+        if (line.rfind(Media, 0) != 0)
+            continue;
+        std::string name;
+        std::istringstream(line.substr(Media.size())) >> name >> size.width >> size.height;
+        break;
+    }
+    return size;
+}
+
+std::optional<PrintWay> FindWay(Spooler& spooler, const Submission& submission, Fault& fault) {
+    std::vector<std::string> types;
+    for (const Kind& kind : Kinds)
+        types.emplace_back(kind.type);
+    return spooler.FindWay(submission.ticket.queue, types, SizeOf(FileOf(submission, Kinds[0])),
+                           fault);
+}
+
+/// Has pages printed at their size; where the printer has no such paper, or is to take another,
+/// those that are too large for it are made smaller.
+PrintTicket WithPaper(PrintTicket ticket, const std::string& media) {
+    for (const char* const scaling : {"print-scaling", "fit-to-page", "scaling", "natural-scaling"})
+        if (ticket.options.count(scaling) > 0)
+            return ticket;
+    const bool isTheirs = !media.empty() && ticket.options.count("media") == 0 &&
+                          ticket.options.count("PageSize") == 0;
+    if (isTheirs)
+        ticket.options["media"] = media;
+    ticket.options["print-scaling"] = isTheirs ? "none" : "auto-fit";
+    return ticket;
+}
+
 } // namespace
 
 PrintReply MakePrintJob(Spooler& spooler, const Submission& submission) {
     if (std::optional<Fault> fault = spooler.Check(submission.ticket))
         return {fault, {}};
-    if (std::optional<Fault> fault = MakeRoom(spooler, submission))
-        return {fault, {}};
     Fault fault;
-    const std::optional<int> number = spooler.Create(submission.ticket, submission.name, fault);
+    const std::optional<PrintWay> way = FindWay(spooler, submission, fault);
+    if (!way)
+        return {fault, {}};
+    const Kind* const kind = Choose(submission, *way);
+    if (submission.mayWantPdf && (!kind || way->types.front() != kind->type))
+        return {{}, {}, true};
+    if (!kind)
+        return {NothingFor(submission), {}};
+    if (std::optional<Fault> lack = MakeRoom(spooler, submission))
+        return {lack, {}};
+    const std::optional<int> number =
+        spooler.Create(WithPaper(submission.ticket, way->media), submission.name, fault);
     return number ? FindPrintJob(spooler, *number) : PrintReply{fault, {}};
 }
 
 PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int number) {
-    std::vector<std::string> types;
-    std::error_code error;
-    for (const Kind& kind : Kinds)
-        if (fs::is_regular_file(FileOf(submission, kind), error))
-            types.emplace_back(kind.type);
     Fault fault;
-    const auto type = spooler.Choose(submission.ticket.queue, types, fault);
-    if (!type)
+    const std::optional<PrintWay> way = FindWay(spooler, submission, fault);
+    if (!way)
         return {fault, {}};
-    const auto* const kind = std::find_if(std::begin(Kinds), std::end(Kinds),
-                                          [&type](const Kind& each) { return *type == each.type; });
-    return {spooler.Send(submission.ticket.queue, number, FileOf(submission, *kind), *type), {}};
+    const Kind* const kind = Choose(submission, *way);
+    if (!kind)
+        return {NothingFor(submission), {}};
+    return {spooler.Send(submission.ticket.queue, number, FileOf(submission, *kind), kind->type),
+            {}};
 }
 
 PrintReply FindPrintJob(Spooler& spooler, int number) {

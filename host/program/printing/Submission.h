@@ -9,6 +9,7 @@
 struct PrintReply {
     std::optional<Fault> fault; ///< then nothing is known of the job
     std::optional<SpooledJob> job;
+    bool wantsPdf = false; ///< no job has been made, since PDF is what the queue prints as it is
 };
 
 /// How a document is submitted.
@@ -16,6 +17,7 @@ struct Submission {
     PrintTicket ticket;
     wxString name;                  ///< the job's, which no other document has
     std::size_t most = 0;           ///< jobs of this user's in the queue, beyond which none is made
+    bool mayWantPdf = false;        ///< PDF can be made of the document, if only PostScript was
     std::filesystem::path document; ///< PostScript or PDF; the other kind may lie beside it
 };
 

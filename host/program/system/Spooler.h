@@ -35,6 +35,18 @@ struct SpooledJob {
     wxString message; ///< in the server's words; may be empty
 };
 
+/// What a queue does with a document's files.
+struct PrintWay {
+    std::vector<std::string> types; ///< MIME types that it takes, the best first
+    std::string media;              ///< its paper of the pages' size; empty when it has none
+};
+
+/// A size of pages, in points.
+struct PageSize {
+    double width = 0;
+    double height = 0;
+};
+
 /// A print server, as its clients see it. Faults with Blame::Machine and Blame::Usage pass, the
 /// latter when somebody has mended what is wrong; those of the document stay. A call returns within
 /// seconds, whatever the server does. An object is for one thread.
@@ -49,11 +61,11 @@ public:
     /// What is asked for in vain: a queue, or what its printer cannot do.
     std::optional<Fault> Check(const PrintTicket& ticket);
 
-    /// Which kind of a document's files the queue takes.
-    /// @param types MIME types; the first one that it takes is the best
-    /// @return nothing when it cannot be asked, or takes none
-    std::optional<std::string> Choose(const wxString& queue, const std::vector<std::string>& types,
-                                      Fault& fault);
+    /// How the queue prints pages of a size.
+    /// @param types MIME types that there could be
+    /// @return nothing when it cannot be asked, or takes none of them
+    std::optional<PrintWay> FindWay(const wxString& queue, const std::vector<std::string>& types,
+                                    const PageSize& pages, Fault& fault);
 
     /// Makes a job without a document.
     /// @return its number

@@ -14,10 +14,6 @@ namespace {
 /// How often a document's attempt may end this program, before the document is to blame.
 constexpr int MostDeaths = 3;
 
-/// Before a document is tried again that the machine could not convert: longer than its folder
-/// waits, so that another one comes first, in case it is this one that the machine cannot do.
-constexpr std::chrono::seconds GivenBackFor = 40s;
-
 /// For how long a machine may not see what another one has found: what a share's client knows of a
 /// folder is some seconds old.
 constexpr std::chrono::seconds SharesAreLateFor = 60s;
@@ -66,9 +62,9 @@ FolderNews DecideFailure(Job& job, const Outcome& outcome, const FolderConfigura
 
 } // namespace
 
-void GiveBack(Job& job, const Circumstances& circumstances) {
+void GiveBack(Job& job, const Circumstances& circumstances, std::chrono::seconds delay) {
     job.attempts = std::max(job.attempts - 1, 0);
-    TryAgain(job, circumstances.isShared ? 0s : GivenBackFor, circumstances.now);
+    TryAgain(job, circumstances.isShared ? 0s : delay, circumstances.now);
 }
 
 void End(Job& job, JobState state, JournalTime now) {

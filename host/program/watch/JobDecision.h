@@ -25,8 +25,13 @@ enum class FolderNews {
 FolderNews DecideByOutcome(Job& job, const Outcome& outcome, const FolderConfiguration& folder,
                            const Circumstances& circumstances);
 
+/// Before a document is tried again that the machine could not convert: longer than its folder
+/// waits, so that another one comes first, in case it is this one that the machine cannot do.
+constexpr std::chrono::seconds GivenBackFor(40);
+
 /// Has a job tried again after an attempt that says nothing of the document.
-void GiveBack(Job& job, const Circumstances& circumstances);
+void GiveBack(Job& job, const Circumstances& circumstances,
+              std::chrono::seconds delay = GivenBackFor);
 
 /// Says that a job comes no further.
 /// @param state Finished or Failed

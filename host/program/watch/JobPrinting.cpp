@@ -122,7 +122,8 @@ void JobPrinting::Begin(Order& order, Job& job, const FolderConfiguration& folde
         order.step = std::exchange(order.isEmpty, false) ? Step::Send : Step::Find;
     }
     Submission submission = {TicketFor(job, folder), NameFor(job),
-                             folder.print ? folder.print->mostQueued : 0, ProductOf(job)};
+                             folder.print ? folder.print->mostQueued : 0,
+                             folder.print && !WantsPdf(folder.print->ticket), ProductOf(job)};
     order.reply = DeskOf(job.print.server)
                       .Ask([step = order.step, number = job.print.number,
                             submission = std::move(submission)](Spooler& spooler) {
@@ -142,7 +143,12 @@ void JobPrinting::Take(const PrintReply& reply, Order& order, Job& job,
     if (std::exchange(order.trouble, std::nullopt))
         order.delay = 0ms;
     order.next = Clock::now();
-    if (order.step == Step::Find) {
+    if (reply.wantsPdf) {
+        m_wantPdf.emplace(job.print.server, job.print.queue);
+        Forget(job.print);
+        GiveBack(job, {m_journal.Now(), m_journal.Shared() != nullptr}, 0s);
+        order.isToBeTold = true;
+    } else if (order.step == Step::Find) {
         TakeFound(reply, order, job, folder);
     } else if (order.step == Step::Send) {
         job.state = JobState::Printing;
@@ -246,6 +252,12 @@ PrintDesk& JobPrinting::DeskOf(const wxString& server) {
     if (!desk)
         desk = std::make_unique<PrintDesk>(server, m_onNews);
     return *desk;
+}
+
+bool JobPrinting::WantsPdf(const PrintTicket& ticket) const {
+    return std::any_of(m_wantPdf.begin(), m_wantPdf.end(), [&ticket](const auto& known) {
+        return known == std::pair(Spooler(ticket.server).Address(), ticket.queue);
+    });
 }
 
 bool JobPrinting::IsBusy() const {

@@ -4,6 +4,8 @@
 #include "host/program/printing/PrintDesk.h"
 #include "host/program/watch/WatchConfiguration.h"
 
+#include <set>
+
 /// Brings documents to print servers, and follows them there. Each step is told to the journal
 /// before the next one, so that whoever finds the journal after the program was ended asks the
 /// server what it has, and goes on from there. Its calls do not wait for a server.
@@ -24,6 +26,9 @@ public:
 
     /// Lets go of a job that somebody else has now.
     void LetGo(std::int64_t ticket) { m_orders.erase(ticket); }
+
+    /// Whether a queue has been met that prints PDF as it is, and not what applications print.
+    bool WantsPdf(const PrintTicket& ticket) const;
 
     /// Whether anything comes further without somebody's help, or that of time.
     bool IsBusy() const;
@@ -68,6 +73,7 @@ private:
     const std::function<void()> m_onNews;
     std::map<std::int64_t, Order> m_orders;                 ///< by their tickets
     std::map<wxString, std::unique_ptr<PrintDesk>> m_desks; ///< by the server
+    std::set<std::pair<wxString, wxString>> m_wantPdf;      ///< servers and queues
 };
 
 /// What a folder asks for, for one of its documents.

@@ -2,8 +2,10 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
+#include "host/program/settings/Settings.h"
 #include "host/program/watch/JobDecision.h"
 #include "plugin/interface/ResultCodes.h"
+#include "plugin/settings/FilterSettings.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>
@@ -17,6 +19,17 @@ namespace {
 
 /// Before a document's end is tried again.
 constexpr std::chrono::seconds BetweenEnds = 30s;
+
+/// Settings by which a PDF file is made as well, if they can be so.
+std::string WithPdf(const std::string& xml) {
+    Fault ignored;
+    std::optional<Settings> settings = Settings::FromXml(xml, ignored);
+    if (!settings)
+        return xml;
+    settings->Set(FilterSettings::OutputPS.key, "0");
+    settings->Set(FilterSettings::OutputPDF.key, "1");
+    return settings->Xml();
+}
 
 WatchWork::Clock::time_point Now() {
     return WatchWork::Clock::now();
@@ -164,7 +177,9 @@ std::optional<Fault> WatchWork::Prepare(UnderWay& work, WatchedFolder& folder,
         return fault;
     assignment.input = InputOf(work.job);
     assignment.workplace = work.workplace->Path();
-    assignment.settings = *settings;
+    const auto& print = folder.Configuration()->print;
+    assignment.settings =
+        print && m_printing.WantsPdf(print->ticket) ? WithPdf(*settings) : *settings;
     assignment.language =
         folder.Configuration()->language ? folder.Configuration()->language : m_means.language;
     assignment.engineDocuments = EngineDocuments();

@@ -19,9 +19,9 @@ std::optional<Fault> Spooler::Check(const PrintTicket& /*ticket*/) {
     return NotAvailable();
 }
 
-std::optional<std::string> Spooler::Choose(const wxString& /*queue*/,
-                                           const std::vector<std::string>& /*types*/,
-                                           Fault& fault) {
+std::optional<PrintWay> Spooler::FindWay(const wxString& /*queue*/,
+                                         const std::vector<std::string>& /*types*/,
+                                         const PageSize& /*pages*/, Fault& fault) {
     fault = NotAvailable();
     return std::nullopt;
 }
