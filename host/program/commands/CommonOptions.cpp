@@ -139,6 +139,32 @@ void AddJobs(CLI::App& command, std::optional<unsigned>& jobs) {
         ->check(CLI::Range(1U, MostWorkers));
 }
 
+void AddOutputOptions(CLI::App& command, std::string& out, PrintOptions& print) {
+    CLI::Option* const folder =
+        command.add_option("-o,--out", out, "The folder for the output; not needed with --print");
+    folder->required()->type_name("DIR");
+    CLI::Option* const queue = command.add_option_function<std::string>(
+        "--print",
+        [&print, folder](const std::string& name) {
+            print.queue = name;
+            folder->required(false);
+        },
+        "Have a queue of the print server print the output");
+    queue->type_name("QUEUE");
+    command.add_flag("--wait", print.waits, "Wait until it is on paper")->needs(queue);
+    command
+        .add_option("--print-server", print.server,
+                    "The print server, if not the one that this user has")
+        ->type_name("HOST")
+        ->needs(queue);
+    command
+        .add_option("--print-option", print.assignments,
+                    "One of the queue's options; may be given several times")
+        ->type_name("NAME=VALUE")
+        ->allow_extra_args(false)
+        ->needs(queue);
+}
+
 void AddSettingsOptions(CLI::App& command, SettingsOptions& options) {
     command.add_option("--printer", options.printer, "The printer to print on")->type_name("NAME");
     command.add_option("--settings", options.file, "A file with settings")->type_name("FILE.xml");

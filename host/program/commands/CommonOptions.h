@@ -76,5 +76,16 @@ void AddFlag(CLI::App& command, const std::string& name, const std::string& desc
 /// Adds how many documents are converted at a time.
 void AddJobs(CLI::App& command, std::optional<unsigned>& jobs);
 
+/// How a run's output is printed by a print server.
+struct PrintOptions {
+    std::optional<std::string> queue; ///< without which it is not
+    std::optional<std::string> server;
+    std::vector<std::string> assignments; ///< NAME=VALUE
+    bool waits = false;                   ///< until all is on paper
+};
+
+/// Adds those that have output printed, and the folder for it, which is needed without them only.
+void AddOutputOptions(CLI::App& command, std::string& out, PrintOptions& print);
+
 /// Adds those that say how documents are printed.
 void AddSettingsOptions(CLI::App& command, SettingsOptions& options);

@@ -1,5 +1,6 @@
 #include "host/program/base/PathText.h"
 #include "host/program/commands/Command.h"
+#include "host/program/commands/ConvertPrinting.h"
 #include "host/program/documents/Conversion.h"
 #include "host/program/documents/Delivery.h"
 #include "host/program/documents/OutputFolder.h"
@@ -12,6 +13,7 @@
 #include "host/program/system/Interruption.h"
 #include "host/program/workers/WorkerCount.h"
 #include "host/program/workers/WorkerPool.h"
+#include "plugin/interface/ResultCodes.h"
 
 #include <wx/intl.h>
 
@@ -21,7 +23,8 @@ namespace {
 
 struct ConvertOptions {
     std::vector<std::string> paths;
-    std::string out;
+    std::string out; ///< empty when the output is only printed
+    PrintOptions print;
     SettingsOptions settings;
     std::optional<unsigned> jobs; ///< documents at a time; as many as pay when it is not given
 };
@@ -53,7 +56,11 @@ public:
             Tell(*m_arrived[m_told.size()], m_reporter);
     }
 
-    ExitCode Finish() const { return TellSummary(m_told, m_reporter); }
+    ExitCode Finish(bool wasInterrupted) const {
+        return TellSummary(m_told, m_reporter, wasInterrupted);
+    }
+
+    std::vector<Outcome>& Told() { return m_told; }
 
 private:
     std::vector<std::optional<Outcome>> m_arrived;
@@ -67,7 +74,18 @@ struct Run {
     const std::vector<wxString>& names;
     const FilterSet& filters;
     const OutputFolder& outputFolder;
+    PrintRun* print = nullptr; ///< null when nothing is printed
+    bool keepsOutput = true;   ///< in the folder
 };
+
+/// Brings what has been made of a document to where it is to be.
+void HandOver(const Run& run, std::size_t number, const Workplace& workplace, Outcome& outcome) {
+    if (run.print && outcome.state == State::Converted)
+        run.print->Submit(outcome, run.filters.ErrorText(Result::PrintFailed));
+    if (run.keepsOutput)
+        Deliver(workplace, run.names[number], run.filters, outcome);
+    outcome.made.clear();
+}
 
 /// The inputs that are a filter's business.
 std::vector<Input> Convertible(const Run& run) {
@@ -96,7 +114,7 @@ Outcome ConvertHere(const Run& run, std::size_t number, Reporter& reporter) {
         return WithoutWorkplace(run, input, fault);
     Progress progress(reporter, Shown(input.given.filename()));
     Outcome outcome = ConvertInput(input, run.filters, workplace->Path(), progress);
-    Deliver(*workplace, run.names[number], run.filters, outcome);
+    HandOver(run, number, *workplace, outcome);
     return outcome;
 }
 
@@ -181,7 +199,7 @@ private:
         const auto underWay = m_underWay.find(number);
         if (outcome.fault && outcome.text.empty())
             outcome.text = m_run.filters.ErrorText(outcome.fault->code);
-        Deliver(underWay->second.workplace, m_run.names[number], m_run.filters, outcome);
+        HandOver(m_run, number, underWay->second.workplace, outcome);
         m_underWay.erase(underWay);
         Add(number, std::move(outcome));
     }
@@ -196,25 +214,44 @@ private:
     WorkerPool m_pool;
 };
 
+/// The folder that the output goes to: the one that is named, or a temporary one.
+std::optional<OutputFolder> OpenOutput(const std::string& named,
+                                       std::optional<Workplace>& temporary, Fault& fault) {
+    if (named.empty()) {
+        temporary = Workplace::CreateTemporary(fault);
+        return temporary ? OutputFolder::Open(temporary->Path(), fault) : std::nullopt;
+    }
+    std::optional<OutputFolder> folder = OutputFolder::Open(FromArgument(named), fault);
+    if (!folder)
+        fault.what = wxString::Format(_("the output folder %s cannot be used: %s"),
+                                      Shown(FromArgument(named)), fault.what);
+    return folder;
+}
+
 ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
                     Reporter& reporter) {
     Fault fault;
-    const std::optional<Settings> settings = MakeRunSettings(convert.settings, fault);
+    std::optional<PrintRun> print;
+    if (convert.print.queue && !(print = OpenPrintRun(convert.print, fault)))
+        return reporter.Error(fault);
+    SettingsOptions wanted = convert.settings;
+    if (print && print->WantsPdf())
+        wanted.pdf = true;
+    const std::optional<Settings> settings = MakeRunSettings(wanted, fault);
     if (!settings)
         return reporter.Error(fault);
     FilterSet filters(options.FiltersFolder());
     const std::vector<Input> inputs = ListInputs(convert.paths);
     if (const auto end = EndIdleRun(filters, inputs, reporter))
         return *end;
-    std::optional<OutputFolder> outputFolder = OutputFolder::Open(FromArgument(convert.out), fault);
-    if (!outputFolder) {
-        fault.what = wxString::Format(_("the output folder %s cannot be used: %s"),
-                                      Shown(FromArgument(convert.out)), fault.what);
+    std::optional<Workplace> temporary;
+    std::optional<OutputFolder> outputFolder = OpenOutput(convert.out, temporary, fault);
+    if (!outputFolder)
         return reporter.Error(fault);
-    }
     Workplace::RemoveAbandoned(outputFolder->Path());
     const std::vector<wxString> names = AllotNames(inputs, filters, *outputFolder);
-    const Run run = {inputs, names, filters, *outputFolder};
+    const Run run = {
+        inputs, names, filters, *outputFolder, print ? &*print : nullptr, !convert.out.empty()};
     OrderedReport report(inputs.size(), reporter);
     const std::vector<Input> convertible = Convertible(run);
     const std::size_t workers = convert.jobs ? *convert.jobs : WorthwhileWorkers(convertible);
@@ -230,7 +267,9 @@ ExitCode RunConvert(const ConvertOptions& convert, const CommonOptions& options,
         filters.ApplySettings(settings->Node());
         ConvertInTurn(run, reporter, report);
     }
-    return report.Finish();
+    const bool isAllOver =
+        !convert.print.waits || AwaitPrints(report.Told(), filters, *print, reporter);
+    return report.Finish(!isAllOver);
 }
 
 } // namespace
@@ -245,7 +284,7 @@ void AddConvert(CLI::App& program, Command& chosen) {
             };
         });
     AddPaths(convert, given->paths);
-    AddRequired(convert, "-o,--out", "DIR", "The folder for the output", given->out);
+    AddOutputOptions(convert, given->out, given->print);
     AddSettingsOptions(convert, given->settings);
     AddJobs(convert, given->jobs);
 }

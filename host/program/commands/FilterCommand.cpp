@@ -72,25 +72,6 @@ std::optional<std::string> MakeJobSettings(const SpoolerJob& job, Fault& fault) 
     return settings ? std::optional(settings->Xml()) : std::nullopt;
 }
 
-/// A folder for the document and what is made of it, which nobody else may look into.
-std::optional<Workplace> MakeWorkplace(Fault& fault) {
-    std::error_code error;
-    const fs::path folder = fs::temp_directory_path(error);
-    if (error) {
-        fault = {wxString::Format(_("the folder for temporary files cannot be used: %s"),
-                                  Because(error)),
-                 Blame::Machine};
-        return std::nullopt;
-    }
-    Workplace::RemoveAbandoned(folder);
-    std::optional<Workplace> workplace = Workplace::Create(folder, fault);
-    if (!workplace)
-        fault.what = wxString::Format(_("no folder can be made in %s"), Shown(folder));
-    else
-        fs::permissions(workplace->Path(), fs::perms::owner_all, error);
-    return workplace;
-}
-
 /// Why there is no output, with the document's name in front.
 Fault ReasonOf(const Outcome& outcome) {
     Fault fault = outcome.fault.value_or(Fault());
@@ -122,7 +103,8 @@ std::optional<std::ifstream> Convert(const SpoolerJob& job, const CommonOptions&
                                      Reporter& reporter, Fault& fault) {
     Assignment work;
     const std::optional<std::string> settings = MakeJobSettings(job, fault);
-    const std::optional<Workplace> workplace = settings ? MakeWorkplace(fault) : std::nullopt;
+    const std::optional<Workplace> workplace =
+        settings ? Workplace::CreateTemporary(fault) : std::nullopt;
     const std::optional<fs::path> document =
         workplace ? job.CopyDocument(workplace->Path(), fault) : std::nullopt;
     if (!document)

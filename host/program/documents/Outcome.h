@@ -20,11 +20,20 @@ enum class State {
     Changed,      ///< is not what it was, or gone, when its turn came or while it was converted
 };
 
+/// What a print server has of a file.
+struct PrintedJob {
+    wxString server; ///< its address
+    wxString queue;
+    int number = 0;
+    wxString uuid; ///< tells it from another one that gets the same number
+};
+
 /// What has become of one file.
 struct Outcome {
     std::filesystem::path input;
     std::filesystem::path made;   ///< its output, as long as that is not in its place
     std::filesystem::path output; ///< in its place; empty when there is none
+    std::optional<PrintedJob> print;
     State state = State::Accepted;
     std::optional<Fault> fault; ///< why it has come no further
     wxString text;              ///< the result code's message

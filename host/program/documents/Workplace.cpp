@@ -112,6 +112,24 @@ void Workplace::RemoveAbandoned(const fs::path& outputFolder, Kind kind) {
     }
 }
 
+std::optional<Workplace> Workplace::CreateTemporary(Fault& fault) {
+    std::error_code error;
+    const fs::path folder = fs::temp_directory_path(error);
+    if (error) {
+        fault = {wxString::Format(_("the folder for temporary files cannot be used: %s"),
+                                  Because(error)),
+                 Blame::Machine};
+        return std::nullopt;
+    }
+    RemoveAbandoned(folder);
+    std::optional<Workplace> workplace = Create(folder, fault);
+    if (!workplace)
+        fault.what = wxString::Format(_("no folder can be made in %s"), Shown(folder));
+    else
+        fs::permissions(workplace->Path(), fs::perms::owner_all, error);
+    return workplace;
+}
+
 std::optional<Workplace> Workplace::TakeOver(const fs::path& path) {
     std::shared_ptr<void> mark = OpenMark(path, OPEN_EXISTING);
     return mark ? std::optional(Workplace(path, std::move(mark))) : std::nullopt;

@@ -17,6 +17,9 @@ public:
     static std::optional<Workplace> Create(const std::filesystem::path& outputFolder, Fault& fault,
                                            Kind kind = Kind::OfRun);
 
+    /// Makes one among the temporary files, which nobody else may look into.
+    static std::optional<Workplace> CreateTemporary(Fault& fault);
+
     /// Takes over one whose program was ended, or has left it.
     /// @return nothing when it is gone, or somebody else has it
     static std::optional<Workplace> TakeOver(const std::filesystem::path& path);

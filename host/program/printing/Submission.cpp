@@ -1,5 +1,8 @@
 #include "host/program/printing/Submission.h"
 
+#include "host/services/OneLine.h"
+#include "plugin/interface/ResultCodes.h"
+
 #include <wx/intl.h>
 
 #include <algorithm>
@@ -37,7 +40,7 @@ std::optional<Fault> MakeRoom(Spooler& spooler, const Submission& submission) {
         else if (auto left = spooler.Cancel(job.number))
             return left;
     }
-    if (others < submission.most)
+    if (others < *submission.most)
         return std::nullopt;
     return Fault{wxString::Format(_("the queue \"%s\" has %zu jobs of this user already"),
                                   submission.ticket.queue, others),
@@ -78,12 +81,16 @@ PageSize SizeOf(const fs::path& postScript) {
     return size;
 }
 
-std::optional<PrintWay> FindWay(Spooler& spooler, const Submission& submission, Fault& fault) {
+std::optional<PrintWay> FindWay(Spooler& spooler, const wxString& queue, const PageSize& pages,
+                                Fault& fault) {
     std::vector<std::string> types;
     for (const Kind& kind : Kinds)
         types.emplace_back(kind.type);
-    return spooler.FindWay(submission.ticket.queue, types, SizeOf(FileOf(submission, Kinds[0])),
-                           fault);
+    return spooler.FindWay(queue, types, pages, fault);
+}
+
+std::optional<PrintWay> FindWay(Spooler& spooler, const Submission& submission, Fault& fault) {
+    return FindWay(spooler, submission.ticket.queue, SizeOf(FileOf(submission, Kinds[0])), fault);
 }
 
 /// Has pages printed at their size; where the printer has no such paper, or is to take another,
@@ -114,8 +121,9 @@ PrintReply MakePrintJob(Spooler& spooler, const Submission& submission) {
         return {{}, {}, true};
     if (!kind)
         return {NothingFor(submission), {}};
-    if (std::optional<Fault> lack = MakeRoom(spooler, submission))
-        return {lack, {}};
+    if (submission.most)
+        if (std::optional<Fault> lack = MakeRoom(spooler, submission))
+            return {lack, {}};
     const std::optional<int> number =
         spooler.Create(WithPaper(submission.ticket, way->media), submission.name, fault);
     return number ? FindPrintJob(spooler, *number) : PrintReply{fault, {}};
@@ -139,4 +147,37 @@ PrintReply FindPrintJob(Spooler& spooler, int number) {
     if (!jobs)
         return {fault, {}};
     return {{}, jobs->empty() ? std::nullopt : std::optional(std::move(jobs->front()))};
+}
+
+std::optional<bool> WantsPdf(Spooler& spooler, const wxString& queue, Fault& fault) {
+    const std::optional<PrintWay> way = FindWay(spooler, queue, {}, fault);
+    return way ? std::optional(way->types.front() != Kinds[0].type) : std::nullopt;
+}
+
+wxString JobText(const wxString& queue, int number) {
+    return wxString::Format(_("job %d of %s"), number, OneLine(queue));
+}
+
+bool IsOver(const SpooledJob& job) {
+    using Progress = SpooledJob::Progress;
+    return job.progress == Progress::Completed || job.progress == Progress::Aborted ||
+           job.progress == Progress::Canceled;
+}
+
+std::optional<Fault> WhyNotPrinted(const SpooledJob& job, const wxString& queue) {
+    if (!IsOver(job) || job.progress == SpooledJob::Progress::Completed)
+        return std::nullopt;
+    wxString what = wxString::Format(job.progress == SpooledJob::Progress::Canceled
+                                         ? _("%s was cancelled")
+                                         : _("the print server has given up %s"),
+                                     JobText(queue, job.number));
+    if (!job.message.empty())
+        what << ": " << job.message;
+    return Fault{what, Blame::Document, Result::PrintFailed};
+}
+
+Fault LossOf(const wxString& queue, int number) {
+    return {wxString::Format(_("the print server has lost %s; whether it was printed is not known"),
+                             JobText(queue, number)),
+            Blame::Machine, Result::PrintFailed};
 }

@@ -15,8 +15,10 @@ struct PrintReply {
 /// How a document is submitted.
 struct Submission {
     PrintTicket ticket;
-    wxString name;                  ///< the job's, which no other document has
-    std::size_t most = 0;           ///< jobs of this user's in the queue, beyond which none is made
+    wxString name; ///< the job's, which no other document has
+    /// Jobs of this user's in the queue, beyond which none is made. Not given, none is looked for
+    /// that an earlier program may have left either.
+    std::optional<std::size_t> most;
     bool mayWantPdf = false;        ///< PDF can be made of the document, if only PostScript was
     std::filesystem::path document; ///< PostScript or PDF; the other kind may lie beside it
 };
@@ -31,3 +33,19 @@ PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int num
 /// Looks for a job.
 /// @return without a job when the server has none of that number
 PrintReply FindPrintJob(Spooler& spooler, int number);
+
+/// Whether PDF is what a queue prints as it is, and not what applications print.
+/// @return nothing when it cannot be asked, or takes neither
+std::optional<bool> WantsPdf(Spooler& spooler, const wxString& queue, Fault& fault);
+
+/// What people know a job by.
+wxString JobText(const wxString& queue, int number);
+
+/// Whether nothing comes of a job any more.
+bool IsOver(const SpooledJob& job);
+
+/// Why a job that is over has not come out.
+std::optional<Fault> WhyNotPrinted(const SpooledJob& job, const wxString& queue);
+
+/// That a server knows nothing of a job that it has had.
+Fault LossOf(const wxString& queue, int number);

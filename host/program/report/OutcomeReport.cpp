@@ -28,11 +28,21 @@ wxString ReasonOf(const Outcome& outcome) {
     return outcome.fault ? outcome.fault->Text() : wxString();
 }
 
+wxString JobText(const PrintedJob& job) {
+    return wxString::Format(_("job %d of %s"), job.number, OneLine(job.queue));
+}
+
+Json RecordOf(const PrintedJob& job) {
+    return {{"server", JsonText(job.server)}, {"queue", JsonText(job.queue)}, {"job", job.number}};
+}
+
 /// The outcome as a line for people.
 wxString LineOf(const Outcome& outcome) {
     wxString line = Shown(outcome.input);
     if (!outcome.output.empty())
         line << " -> " << Shown(outcome.output);
+    if (outcome.print)
+        line << (outcome.output.empty() ? " -> " : ", ") << JobText(*outcome.print);
     line << ": " << wxGetTranslation(NameOf(outcome.state)) << ", " << CodeOf(outcome) << ' '
          << OneLine(outcome.text);
     if (const wxString reason = ReasonOf(outcome); !reason.empty())
@@ -88,6 +98,7 @@ Json RecordOf(const Outcome& outcome) {
     if (!IsText(outcome.input)) // JSON is text; this name is not, and must not be lost
         record["inputBytes"] = HexOf(outcome.input.u8string());
     record["output"] = outcome.output.empty() ? Json() : Json(outcome.output.u8string());
+    record["print"] = outcome.print ? RecordOf(*outcome.print) : Json();
     record["state"] = NameOf(outcome.state);
     record["code"] = CodeOf(outcome);
     record["text"] = JsonText(outcome.text);
@@ -147,11 +158,28 @@ void Tell(const Outcome& outcome, Reporter& reporter) {
     reporter.Record(RecordOf(outcome));
 }
 
-ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter) {
+void TellPrint(const Outcome& outcome, bool isOver, const wxString& message, Reporter& reporter) {
+    const bool isPrinted = isOver && outcome.state == State::Converted;
+    const wxString reason = isOver ? ReasonOf(outcome) : _("the print server still has it");
+    const wxString line = Shown(outcome.input) + ": " + JobText(*outcome.print) + ": " +
+                          (isPrinted ? _("printed") : OneLine(reason));
+    SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__) << line;
+    reporter.Line(line);
+    Json record = RecordOf(*outcome.print);
+    record["type"] = "print";
+    record["input"] = outcome.input.u8string();
+    record["state"] = isPrinted ? "printed" : isOver ? "failed" : "open";
+    record["reason"] = JsonText(reason);
+    record["message"] = JsonText(message);
+    reporter.Record(record);
+}
+
+ExitCode TellSummary(const std::vector<Outcome>& outcomes, Reporter& reporter,
+                     bool wasInterrupted) {
     std::map<State, unsigned> counts;
     for (const Outcome& outcome : outcomes)
         ++counts[outcome.state];
-    const ExitCode exitCode = Verdict(outcomes);
+    const ExitCode exitCode = wasInterrupted ? ExitCode::Interrupted : Verdict(outcomes);
     wxString line;
     Json record = {{"type", "summary"}};
     for (const auto& [state, count] : counts) {

@@ -48,16 +48,12 @@ bool IsProductThere(const Job& job) {
     return fs::exists(ProductOf(job), error) || error;
 }
 
-wxString JobText(const PrintOrder& order) {
-    return wxString::Format(_("job %d of %s"), order.number, OneLine(order.queue));
-}
-
 Fault LossOf(const Job& job, bool isHeld) {
-    return {wxString::Format(_("the print server has lost %s; whether it was printed is not known"),
-                             JobText(job.print)),
-            Blame::Machine, Result::PrintFailed,
-            isHeld ? _("It is held in the queue: have it printed with `lp -H resume`, or cancel it")
-                   : _("It is printed again")};
+    Fault loss = ::LossOf(job.print.queue, job.print.number);
+    loss.advice =
+        isHeld ? _("It is held in the queue: have it printed with `lp -H resume`, or cancel it")
+               : _("It is printed again");
+    return loss;
 }
 
 void Forget(PrintOrder& order) {
@@ -205,14 +201,8 @@ void JobPrinting::TakeFound(const PrintReply& reply, Order& order, Job& job,
 void JobPrinting::TakeEnd(const SpooledJob& found, Order& order, Job& job,
                           const FolderConfiguration& folder) {
     job.print.message = found.message;
-    if (found.progress != SpooledJob::Progress::Completed) {
-        wxString what = wxString::Format(found.progress == SpooledJob::Progress::Canceled
-                                             ? _("%s was cancelled")
-                                             : _("the print server has given up %s"),
-                                         JobText(job.print));
-        if (!found.message.empty())
-            what << ": " << found.message;
-        Fail(order, job, {what, Blame::Document, Result::PrintFailed});
+    if (const std::optional<Fault> fault = WhyNotPrinted(found, job.print.queue)) {
+        Fail(order, job, *fault);
         return;
     }
     job.fault.reset();
