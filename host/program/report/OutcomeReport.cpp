@@ -161,8 +161,10 @@ void Tell(const Outcome& outcome, Reporter& reporter) {
 void TellPrint(const Outcome& outcome, bool isOver, const wxString& message, Reporter& reporter) {
     const bool isPrinted = isOver && outcome.state == State::Converted;
     const wxString reason = isOver ? ReasonOf(outcome) : _("the print server still has it");
-    const wxString line = Shown(outcome.input) + ": " + JobText(*outcome.print) + ": " +
-                          (isPrinted ? _("printed") : OneLine(reason));
+    wxString line = Shown(outcome.input) + ": ";
+    if (isPrinted || !isOver)
+        line << JobText(*outcome.print) << ": ";
+    line << (isPrinted ? _("printed") : OneLine(reason));
     SetLevelAndGetLogger(LevelInformation, __FILE__, __func__, __LINE__) << line;
     reporter.Line(line);
     Json record = RecordOf(*outcome.print);

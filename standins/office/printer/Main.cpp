@@ -16,6 +16,7 @@
 #include <cstdlib>
 #include <exception>
 #include <map>
+#include <sstream>
 #include <string>
 
 #ifdef __SANITIZE_ADDRESS__
@@ -38,6 +39,20 @@ standins::Reach WriterReach(const std::vector<std::string>& fontFolders) {
                       "/usr/share/zoneinfo"};
     AllowFonts(reach, fontFolders);
     return reach;
+}
+
+/// @throws CLI::ValidationError
+standins::PrinterPaper ReadPaper(const std::string& text) {
+    standins::PrinterPaper paper;
+    std::istringstream numbers(text);
+    char comma = ',';
+    for (double* const value :
+         {&paper.width, &paper.height, &paper.left, &paper.bottom, &paper.right, &paper.top})
+        if (comma != ',' || !(numbers >> *value) || *value < 0)
+            throw CLI::ValidationError("--paper", text);
+        else
+            numbers >> comma;
+    return paper;
 }
 
 void AddOptions(CLI::App& options, standins::PrintJob& job) {
@@ -64,6 +79,15 @@ void AddOptions(CLI::App& options, standins::PrintJob& job) {
     options.add_flag("--fit", job.fitToPaper, "scale pages to the paper");
     options.add_flag("--frames", job.frames, "a frame around each page");
     options.add_flag("--comments", job.comments, "comments too");
+    options
+        .add_option_function<std::vector<std::string>>(
+            "--paper",
+            [&job](const std::vector<std::string>& papers) {
+                for (const std::string& paper : papers)
+                    job.papers.push_back(ReadPaper(paper));
+            },
+            "what the printer has: width, height, and white at the left, bottom, right and top")
+        ->allow_extra_args(false);
     options.add_option("--colours", job.colours, "all, gray or black")
         ->transform(CLI::CheckedTransformer(std::map<std::string, Colours>{
             {"all", Colours::All}, {"gray", Colours::Gray}, {"black", Colours::BlackAndWhite}}));

@@ -3,6 +3,7 @@
 #include "standins/office/printer/Text.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace standins {
 
@@ -14,6 +15,44 @@ constexpr double PaperMargin = 18;
 Area PaperFor(Size page) {
     const bool isWide = page.width > page.height;
     return {0, 0, isWide ? Paper.height : Paper.width, isWide ? Paper.width : Paper.height};
+}
+
+bool IsAlike(double a, double b) {
+    constexpr double Alike = 4; // such as A4 as one program rounds it and the other
+    return std::abs(a - b) <= Alike;
+}
+
+bool HasPaper(const std::vector<PrinterPaper>& papers, Size page) {
+    return std::any_of(papers.begin(), papers.end(), [page](const PrinterPaper& paper) {
+        return (IsAlike(paper.width, page.width) && IsAlike(paper.height, page.height)) ||
+               (IsAlike(paper.height, page.width) && IsAlike(paper.width, page.height));
+    });
+}
+
+/// Where a page stands on a sheet.
+struct Place {
+    Size sheet;
+    Area page;
+};
+
+/// On the printer's own paper, turned as the page is: what is too large is made smaller.
+Place PlaceOn(const PrinterPaper& paper, Size page, bool fills) {
+    Place place = {{paper.width, paper.height},
+                   {paper.left, paper.top, paper.width - paper.left - paper.right,
+                    paper.height - paper.top - paper.bottom}};
+    if (page.width > page.height) { // whichever way the printer turns it
+        const double side = std::max(paper.top, paper.bottom);
+        const double edge = std::max(paper.left, paper.right);
+        place = {{paper.height, paper.width},
+                 {side, edge, paper.height - 2 * side, paper.width - 2 * edge}};
+    }
+    const Area& white = place.page;
+    if (fills || page.width > white.width || page.height > white.height)
+        place.page = FitInto(white, page);
+    else
+        place.page = {white.x + (white.width - page.width) / 2,
+                      white.y + (white.height - page.height) / 2, page.width, page.height};
+    return place;
 }
 
 Area WithoutMargin(const Area& area) {
@@ -63,6 +102,11 @@ void PdfSheets::Print(int number, PostScriptOutput& output) const {
 
 void PdfSheets::PrintPage(int page, PostScriptOutput& output) const {
     const Size size = m_document.PageSize(page);
+    if (!m_job.papers.empty() && (m_job.fitToPaper || !HasPaper(m_job.papers, size))) {
+        const Place place = PlaceOn(m_job.papers.front(), size, m_job.fitToPaper);
+        DrawPage(page, place.page, output.NewSheet(place.sheet));
+        return;
+    }
     const Area paper = m_job.fitToPaper ? PaperFor(size) : Area{0, 0, size.width, size.height};
     cairo_t* sheet = output.NewSheet({paper.width, paper.height});
     DrawPage(page, m_job.fitToPaper ? FitInto(WithoutMargin(paper), size) : paper, sheet);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <vector>
 
 namespace standins {
 
@@ -12,6 +13,16 @@ enum class Contents {
 };
 
 enum class Colours { All, Gray, BlackAndWhite };
+
+/// Paper that the printer has, upright, and how much of its edges stays white, in points.
+struct PrinterPaper {
+    double width = 0;
+    double height = 0;
+    double left = 0;
+    double bottom = 0;
+    double right = 0;
+    double top = 0;
+};
 
 /// How a document is printed.
 struct PrintJob {
@@ -28,6 +39,7 @@ struct PrintJob {
     bool comments = false;    ///< marked in the pages, and on sheets of their own at the end
     bool printHidden = false; ///< hidden slides in the outline
     Colours colours = Colours::All;
+    std::vector<PrinterPaper> papers; ///< the usual one first; any size when there are none
 };
 
 } // namespace standins

@@ -165,6 +165,31 @@ TEST_F(PrintingTest, AJobThatTheServerHasLostIsHeldAndTold) {
     EXPECT_THAT(Printed(), ElementsAre("other", "a.doc (letters 1)"));
 }
 
+TEST_F(PrintingTest, ConvertPrintsAndWaitsForThePaper) {
+    StartServer();
+    const std::string document = m_folder.Write("a.doc", "script").u8string();
+    const auto convert = [&](Arguments more, const char* queue = "ps0") {
+        more.insert(more.begin(), {"convert", document, "--json", "--print", queue});
+        return RunQuillon(more);
+    };
+    RunResult run = convert({"--wait"});
+    EXPECT_EQ(run.exitCode, 0) << run.err;
+    EXPECT_EQ(run.Records("document").at(0)["output"], nullptr);
+    EXPECT_EQ(run.Records("print").at(0)["state"], "printed");
+    EXPECT_EQ(convert({"--out", Path("out"), "--print-option", "copies=2", "--wait"}).exitCode, 0);
+    EXPECT_THAT(FilesIn("out"), ElementsAre("a.ps"));
+    EXPECT_THAT(Printed(), ElementsAre("a.doc", "a.doc"));
+    Run("/usr/sbin/cupsreject ps0");
+    EXPECT_EQ(convert({}, "other").exitCode, 3);
+    EXPECT_EQ(convert({"--print-option", "Tray=2"}).exitCode, 3);
+    Run("/usr/sbin/cupsaccept ps0");
+    Run("/usr/sbin/cupsdisable ps0");
+    RunningProgram waiting(QuillonCommand({"convert", document, "--print", "ps0", "--wait"}));
+    Await("the job", [] { return std::system("lpstat -o | grep -q .") == 0; });
+    Run("cancel -a ps0");
+    EXPECT_EQ(waiting.Wait().exitCode, 1);
+}
+
 TEST_F(PrintingTest, WhereverOneOfThemDiesNothingIsPrintedTwice) {
     StartServer();
     std::size_t printed = 0;

@@ -64,7 +64,7 @@ private:
         const std::wstring wanted = call.Has(ActivePrinter) ? call.Text(ActivePrinter) : printer;
         RequirePrinter(wanted);
         printer = wanted;
-        Print(call, {PrToFileName, Copies, Collate}, pages);
+        Print(call, printer, {PrToFileName, Copies, Collate}, pages);
     }
 };
 

@@ -1,5 +1,6 @@
 #include "standins/office/inprocess/models/ObjectModel.h"
 
+#include "standins/office/inprocess/Papers.h"
 #include "standins/office/inprocess/Printers.h"
 
 namespace standins {
@@ -19,8 +20,11 @@ void DocumentObject::Close(Call& /*call*/) {
     m_document.Close();
 }
 
-void DocumentObject::Print(const Call& call, const PrintArguments& arguments, Export pages,
+void DocumentObject::Print(const Call& call, const std::wstring& printer,
+                           const PrintArguments& arguments, Export pages,
                            std::vector<std::string> layout) const {
+    const std::vector<std::string> papers = PaperOptions(printer);
+    layout.insert(layout.end(), papers.begin(), papers.end());
     PrintToFile({std::move(pages), m_document.Name(), call.Text(arguments.outputFile),
                  CheckCopies(call.Number(arguments.copies, 1)), call.Flag(arguments.collate, true),
                  std::move(layout)});

@@ -39,10 +39,11 @@ protected:
     void Close(Call& call);
 
     /// Prints into the file that the call names.
+    /// @param printer whose paper it is for
     /// @param pages what is made of the document
     /// @param layout as in PrintRequest
-    void Print(const Call& call, const PrintArguments& arguments, Export pages,
-               std::vector<std::string> layout = {}) const;
+    void Print(const Call& call, const std::wstring& printer, const PrintArguments& arguments,
+               Export pages, std::vector<std::string> layout = {}) const;
 
 private:
     OpenedDocument m_document;

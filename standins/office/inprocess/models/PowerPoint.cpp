@@ -113,7 +113,8 @@ private:
         RequireWholeToFile(call,
                            L"A range of slides is not supported: a presentation is printed whole.");
         RequirePrinter(m_print->printer);
-        Print(call, AfterRange, Document().MadeAs(ExportFor(*m_print)), LayoutFor(*m_print));
+        Print(call, m_print->printer, AfterRange, Document().MadeAs(ExportFor(*m_print)),
+              LayoutFor(*m_print));
     }
 
     SharedPrint m_print;

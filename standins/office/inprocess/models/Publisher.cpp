@@ -36,7 +36,7 @@ private:
         RequireWholeToFile(call,
                            L"A range of pages is not supported: a publication is printed whole.");
         RequirePrinter(m_printer);
-        Print(call, AfterRange, pages);
+        Print(call, m_printer, AfterRange, pages);
     }
 
     std::wstring m_printer;

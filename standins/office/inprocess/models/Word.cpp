@@ -91,7 +91,7 @@ private:
         const Export& pages = Document().Pages();
         RequirePrinter(TheSession()->printer);
         RefuseUnsupported(call);
-        Print(call, {OutputFileName, Copies, Collate}, pages);
+        Print(call, TheSession()->printer, {OutputFileName, Copies, Collate}, pages);
     }
 };
 
