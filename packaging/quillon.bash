@@ -5,7 +5,8 @@ _quillon_options() {
     printf '%s ' --help --version --lang --json --verbose --quiet --log --engine-stall \
         --engine-limit --memory-limit --require-isolation --engine-documents --filters --stand-ins
     case $1 in
-    convert) printf '%s ' --out --printer --settings --ps --pdf --profile --jobs --set ;;
+    convert) printf '%s ' --out --printer --settings --ps --pdf --profile --jobs --set \
+        --print --print-server --print-option --wait ;;
     settings) printf '%s ' --settings ;;
     watch)
         printf '%s ' --config --check --once --journal --queue --http \
@@ -71,7 +72,7 @@ _quillon() {
         _quillon_choose $'waiting\nconverting\nsubmitting\nprinting\ndelivering\nfinished\narchived\nfailed\nvanished' \
             "$current"
         ;;
-    --engine-* | --folder | --http | --jobs | -j | --limit | --map | --memory-limit | --printer | --queue) ;; # only the user knows
+    --engine-* | --folder | --http | --jobs | -j | --limit | --map | --memory-limit | --printer | --print | --print-* | --queue) ;; # only the user knows
     *)
         if [[ $current == -* ]]; then
             _quillon_choose "$(_quillon_options "$command" | tr ' ' '\n')" "$current"
