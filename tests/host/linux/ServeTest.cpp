@@ -10,7 +10,6 @@
 
 namespace fs = std::filesystem;
 using testing::ElementsAre;
-using testing::IsEmpty;
 using testing::SizeIs;
 
 namespace {
