@@ -43,7 +43,7 @@ protected:
 
     Program StartFinder() const {
         Program finder = Start(Watch());
-        AwaitFile(m_folder / "in/processed");
+        AwaitFile(m_folder / "in/failed"); // the last one of what it makes
         return finder;
     }
 
