@@ -1,6 +1,7 @@
 // Documents of watched folders on a print server.
 
 #include "tests/host/WatchRun.h"
+#include "tests/host/linux/DyingProgram.h"
 #include "tests/support/linux/CupsServer.h"
 
 #include <csignal>
@@ -200,11 +201,10 @@ TEST_F(PrintingTest, WhereverOneOfThemDiesNothingIsPrintedTwice) {
              {"journal.db", "journal.db-wal", "journal.db-shm", "in/processed/a.doc"})
             fs::remove(m_folder / file);
         Put("a.doc");
-        setenv("TEST_DIE_AT_STEP", std::to_string(step).c_str(), 1);
-        setenv("LD_PRELOAD", DIE_AT_STEP, 1);
-        died = WatchOnce().exitCode == -SIGKILL;
-        unsetenv("LD_PRELOAD");
-        unsetenv("TEST_DIE_AT_STEP");
+        {
+            const DyingProgram dying(step);
+            died = WatchOnce().exitCode == -SIGKILL;
+        }
         EXPECT_EQ(WatchOnce().exitCode, 0);
         AwaitDone();
         EXPECT_EQ(Printed().size(), ++printed);
