@@ -129,7 +129,12 @@ TEST_F(PostgresJournalTest, GivesEachDocumentOnce) {
     std::atomic<std::size_t> entered{0};
     std::atomic<std::size_t> claimed{0};
     std::vector<std::thread> threads;
-    threads.reserve(6);
+    const auto join = [&threads] {
+        for (std::thread& thread : threads)
+            thread.join();
+        threads.clear();
+    };
+    threads.reserve(4);
     for (int finder = 0; finder < 2; ++finder)
         threads.emplace_back([&, journal = std::shared_ptr<Journal>(Open())] {
             for (int number = 0; number < Count; number += 10) {
@@ -140,6 +145,7 @@ TEST_F(PostgresJournalTest, GivesEachDocumentOnce) {
                 entered += journal->Insert(found);
             }
         });
+    join(); // what is done with may come again
     for (int worker = 0; worker < 4; ++worker)
         threads.emplace_back([&, journal = std::shared_ptr<Journal>(Open())] {
             while (claimed < Count)
@@ -153,8 +159,7 @@ TEST_F(PostgresJournalTest, GivesEachDocumentOnce) {
                     std::this_thread::yield();
                 }
         });
-    for (std::thread& thread : threads)
-        thread.join();
+    join();
     EXPECT_EQ(entered, static_cast<std::size_t>(Count));
     EXPECT_EQ(claimed, static_cast<std::size_t>(Count));
     const auto journal = Open();
