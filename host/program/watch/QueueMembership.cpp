@@ -1,6 +1,7 @@
 #include "host/program/watch/QueueMembership.h"
 
 #include "common/WQServices.h"
+#include "host/program/journal/Machines.h"
 #include "host/program/watch/FolderAnnouncement.h"
 
 #include <wx/intl.h>
@@ -67,7 +68,7 @@ void QueueMembership::Report(const WatchStatus& status) {
 
 std::optional<Fault> FindMisfit(const PageMakers& makers, const std::vector<Machine>& machines) {
     const auto measure = std::find_if(machines.begin(), machines.end(), [](const Machine& machine) {
-        return machine.isAlive && !machine.takesAnyVersion && !machine.makers.program.empty();
+        return Converts(machine) && !machine.takesAnyVersion;
     });
     if (measure == machines.end() || measure->makers == makers)
         return std::nullopt;

@@ -72,7 +72,7 @@ ExitCode WatchService::Run() {
     bool isReady = false;
     while (!m_isOver && !(m_isDraining && IsDrained())) {
         Pass();
-        if (!isReady && (m_isOpen || !m_means.self.finds)) {
+        if (!isReady && m_isOpen) {
             if (const std::optional<Fault> other = FindOtherWatcher())
                 return m_reporter.Error(*other);
             isReady = std::all_of(m_folders.begin(), m_folders.end(),
@@ -163,11 +163,11 @@ void WatchService::Pass() {
         ServiceManager::TellStopping(DrainingTakes);
     }
     try {
-        if (!m_isOpen && m_means.self.finds)
-            OpenFolders(m_configuration.folders);
         if (!m_isDraining && Interruption::ReloadRequested())
             Reload();
         MeetOthers(now);
+        if (!m_isOpen)
+            OpenFolders(m_configuration.folders);
         m_paused = m_journal.Paused();
         LookAfterFolders();
         if (!m_isDraining && Works())
@@ -271,10 +271,12 @@ void WatchService::Announce() {
 void WatchService::MeetOthers(Clock::time_point now) {
     if (!m_membership || now - m_met < std::min(BetweenMeetings, m_claimant.lease / 3))
         return;
-    if (m_means.self.finds)
+    if (m_means.self.finds) {
         Announce();
-    else if (const auto folders = m_membership->News())
-        OpenFolders(*folders);
+    } else if (auto folders = m_membership->News()) {
+        m_configuration.folders = std::move(*folders);
+        m_isOpen = false;
+    }
     if (Works()) {
         m_claimant.cannot = FindUnopenable(m_filters);
         TakeOver(now);
