@@ -57,34 +57,6 @@ wxString CommandLineFor(const std::vector<std::string>& arguments) {
     return line;
 }
 
-/// Lets a child have these handles, and no other that may be inherited at this moment.
-class InheritedHandles {
-public:
-    explicit InheritedHandles(std::array<HANDLE, 3> handles) : m_handles(handles) {
-        for (HANDLE handle : m_handles)
-            SetHandleInformation(handle, HANDLE_FLAG_INHERIT, HANDLE_FLAG_INHERIT);
-        SIZE_T size = 0;
-        InitializeProcThreadAttributeList(nullptr, 1, 0, &size);
-        m_bytes.resize(size);
-        m_ready = InitializeProcThreadAttributeList(List(), 1, 0, &size) &&
-                  UpdateProcThreadAttribute(List(), 0, PROC_THREAD_ATTRIBUTE_HANDLE_LIST,
-                                            m_handles.data(), sizeof m_handles, nullptr, nullptr);
-    }
-    ~InheritedHandles() { DeleteProcThreadAttributeList(List()); }
-    InheritedHandles(const InheritedHandles&) = delete;
-    InheritedHandles& operator=(const InheritedHandles&) = delete;
-
-    bool IsReady() const { return m_ready; }
-    LPPROC_THREAD_ATTRIBUTE_LIST List() {
-        return reinterpret_cast<LPPROC_THREAD_ATTRIBUTE_LIST>(m_bytes.data());
-    }
-
-private:
-    std::array<HANDLE, 3> m_handles;
-    std::vector<char> m_bytes;
-    bool m_ready = false;
-};
-
 /// What is in it ends with this process, however that ends. It has it for as long as it lives.
 HANDLE Job() {
     static const HANDLE s_job = [] {
@@ -97,11 +69,45 @@ HANDLE Job() {
     return s_job;
 }
 
+/// Lets a child have these handles, and no other that may be inherited at this moment, and has it
+/// in the job from its beginning: one put there afterwards would be left over, suspended, by an end
+/// of this process in between.
+class ChildAttributes {
+public:
+    explicit ChildAttributes(std::array<HANDLE, 3> handles) : m_handles(handles) {
+        for (HANDLE handle : m_handles)
+            SetHandleInformation(handle, HANDLE_FLAG_INHERIT, HANDLE_FLAG_INHERIT);
+        constexpr DWORD Count = 2;
+        SIZE_T size = 0;
+        InitializeProcThreadAttributeList(nullptr, Count, 0, &size);
+        m_bytes.resize(size);
+        m_ready = InitializeProcThreadAttributeList(List(), Count, 0, &size) &&
+                  UpdateProcThreadAttribute(List(), 0, PROC_THREAD_ATTRIBUTE_HANDLE_LIST,
+                                            m_handles.data(), sizeof m_handles, nullptr, nullptr) &&
+                  UpdateProcThreadAttribute(List(), 0, PROC_THREAD_ATTRIBUTE_JOB_LIST, &m_job,
+                                            sizeof m_job, nullptr, nullptr);
+    }
+    ~ChildAttributes() { DeleteProcThreadAttributeList(List()); }
+    ChildAttributes(const ChildAttributes&) = delete;
+    ChildAttributes& operator=(const ChildAttributes&) = delete;
+
+    bool IsReady() const { return m_ready; }
+    LPPROC_THREAD_ATTRIBUTE_LIST List() {
+        return reinterpret_cast<LPPROC_THREAD_ATTRIBUTE_LIST>(m_bytes.data());
+    }
+
+private:
+    std::array<HANDLE, 3> m_handles;
+    HANDLE m_job = Job();
+    std::vector<char> m_bytes;
+    bool m_ready = false;
+};
+
 /// @return the process's handle, or null
 HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
     HANDLE err = GetStdHandle(STD_ERROR_HANDLE);
-    InheritedHandles inherited({in, out, err});
-    if (!inherited.IsReady())
+    ChildAttributes attributes({in, out, err});
+    if (!attributes.IsReady())
         return nullptr;
     STARTUPINFOEXW startup = {};
     startup.StartupInfo.cb = sizeof startup;
@@ -109,18 +115,14 @@ HANDLE Spawn(const std::vector<std::string>& arguments, HANDLE in, HANDLE out) {
     startup.StartupInfo.hStdInput = in;
     startup.StartupInfo.hStdOutput = out;
     startup.StartupInfo.hStdError = err;
-    startup.lpAttributeList = inherited.List();
+    startup.lpAttributeList = attributes.List();
     std::wstring line = CommandLineFor(arguments).ToStdWstring();
     PROCESS_INFORMATION process = {};
     // A group of its own begins without Ctrl-C: it must not end before it knows what that means.
-    // It is in the job before it does anything.
-    constexpr DWORD Flags =
-        EXTENDED_STARTUPINFO_PRESENT | CREATE_NEW_PROCESS_GROUP | CREATE_SUSPENDED;
+    constexpr DWORD Flags = EXTENDED_STARTUPINFO_PRESENT | CREATE_NEW_PROCESS_GROUP;
     if (!CreateProcessW(nullptr, line.data(), nullptr, nullptr, TRUE, Flags, nullptr, nullptr,
                         &startup.StartupInfo, &process))
         return nullptr;
-    AssignProcessToJobObject(Job(), process.hProcess);
-    ResumeThread(process.hThread);
     CloseHandle(process.hThread);
     return process.hProcess;
 }
