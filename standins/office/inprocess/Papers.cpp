@@ -73,7 +73,7 @@ std::vector<std::string> PaperOptions(const std::wstring& printer) {
     if (!name || name->empty() || name->find('/') != std::string::npos)
         return {};
     const Description description = Fetch(*name);
-    if (!description || description->variable_sizes != 0)
+    if (!description)
         return {};
     std::vector<std::string> options;
     ppdMarkDefaults(description.get());
@@ -83,6 +83,8 @@ std::vector<std::string> PaperOptions(const std::wstring& printer) {
         if (paper.width > 0 && paper.length > 0)
             options.insert(place, OptionFor(paper));
     }
+    if (!options.empty() && description->variable_sizes == 0)
+        options.emplace_back("--only-these-papers");
     return options;
 }
 

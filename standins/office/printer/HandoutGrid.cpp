@@ -15,9 +15,9 @@ int ColumnsFor(int slides) {
 
 } // namespace
 
-HandoutGrid::HandoutGrid(int slides, bool downFirst)
+HandoutGrid::HandoutGrid(int slides, bool downFirst, Size paper)
     : m_columns(ColumnsFor(slides)), m_rows(slides / m_columns), m_hasLines(slides == 3),
-      m_downFirst(downFirst) {}
+      m_downFirst(downFirst), m_paper(paper) {}
 
 Area HandoutGrid::SlideArea(int place) const {
     return m_downFirst ? Cell(place / m_rows, place % m_rows)
@@ -34,8 +34,8 @@ Area HandoutGrid::LinesArea(int place) const {
 /// @param column one more than there are for the lines
 Area HandoutGrid::Cell(int column, int row) const {
     const int columns = m_columns + (m_hasLines ? 1 : 0);
-    const double width = (Paper.width - 2 * Margin - (columns - 1) * Gap) / columns;
-    const double height = (Paper.height - 2 * Margin - (m_rows - 1) * Gap) / m_rows;
+    const double width = (m_paper.width - 2 * Margin - (columns - 1) * Gap) / columns;
+    const double height = (m_paper.height - 2 * Margin - (m_rows - 1) * Gap) / m_rows;
     return {Margin + column * (width + Gap), Margin + row * (height + Gap), width, height};
 }
 

@@ -17,7 +17,7 @@ class HandoutGrid {
 public:
     /// @param slides on a sheet: 1, 2, 3, 4, 6 or 9
     /// @param downFirst column by column, not row by row
-    HandoutGrid(int slides, bool downFirst);
+    HandoutGrid(int slides, bool downFirst, Size paper);
 
     int Slides() const { return m_columns * m_rows; }
     /// Beside each slide there is room to write.
@@ -35,6 +35,7 @@ private:
     int m_rows;
     bool m_hasLines;
     bool m_downFirst;
+    Size m_paper;
 };
 
 /// The largest area within another that has the proportion of `size`, in its middle.

@@ -88,6 +88,8 @@ void AddOptions(CLI::App& options, standins::PrintJob& job) {
             },
             "what the printer has: width, height, and white at the left, bottom, right and top")
         ->allow_extra_args(false);
+    options.add_flag("--only-these-papers", job.onlyThesePapers, "not any other size too")
+        ->needs("--paper");
     options.add_option("--colours", job.colours, "all, gray or black")
         ->transform(CLI::CheckedTransformer(std::map<std::string, Colours>{
             {"all", Colours::All}, {"gray", Colours::Gray}, {"black", Colours::BlackAndWhite}}));

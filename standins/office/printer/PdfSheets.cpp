@@ -12,9 +12,10 @@ namespace {
 /// What printers leave white at the edges.
 constexpr double PaperMargin = 18;
 
-Area PaperFor(Size page) {
+/// Turned as a page is.
+Area Turned(Size paper, Size page) {
     const bool isWide = page.width > page.height;
-    return {0, 0, isWide ? Paper.height : Paper.width, isWide ? Paper.width : Paper.height};
+    return {0, 0, isWide ? paper.height : paper.width, isWide ? paper.width : paper.height};
 }
 
 bool IsAlike(double a, double b) {
@@ -84,7 +85,7 @@ void RuleLines(const Area& area, cairo_t* sheet) {
 
 PdfSheets::PdfSheets(const PdfDocument& document, const PrintJob& job,
                      std::vector<Comment> comments)
-    : m_document(document), m_job(job), m_grid(job.slidesPerSheet, job.downFirst),
+    : m_document(document), m_job(job), m_grid(job.slidesPerSheet, job.downFirst, PaperFor(job)),
       m_comments(std::move(comments)) {}
 
 int PdfSheets::Count() const {
@@ -102,18 +103,19 @@ void PdfSheets::Print(int number, PostScriptOutput& output) const {
 
 void PdfSheets::PrintPage(int page, PostScriptOutput& output) const {
     const Size size = m_document.PageSize(page);
-    if (!m_job.papers.empty() && (m_job.fitToPaper || !HasPaper(m_job.papers, size))) {
+    if (m_job.onlyThesePapers && (m_job.fitToPaper || !HasPaper(m_job.papers, size))) {
         const Place place = PlaceOn(m_job.papers.front(), size, m_job.fitToPaper);
         DrawPage(page, place.page, output.NewSheet(place.sheet));
         return;
     }
-    const Area paper = m_job.fitToPaper ? PaperFor(size) : Area{0, 0, size.width, size.height};
+    const Area paper =
+        m_job.fitToPaper ? Turned(PaperFor(m_job), size) : Area{0, 0, size.width, size.height};
     cairo_t* sheet = output.NewSheet({paper.width, paper.height});
     DrawPage(page, m_job.fitToPaper ? FitInto(WithoutMargin(paper), size) : paper, sheet);
 }
 
 void PdfSheets::PrintHandout(int first, PostScriptOutput& output) const {
-    cairo_t* sheet = output.NewSheet(Paper);
+    cairo_t* sheet = output.NewSheet(PaperFor(m_job));
     const int end = std::min(first + m_grid.Slides(), m_document.PageCount());
     for (int page = first; page < end; ++page) {
         const Area place = m_grid.SlideArea(page - first);

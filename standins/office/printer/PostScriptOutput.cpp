@@ -17,6 +17,11 @@ constexpr std::size_t Gathered = std::size_t{256} << 10;
 
 } // namespace
 
+Size PaperFor(const PrintJob& job) {
+    constexpr Size A4{595, 842};
+    return job.papers.empty() ? A4 : Size{job.papers.front().width, job.papers.front().height};
+}
+
 PostScriptOutput::PostScriptOutput(int file, const PrintJob& job)
     : m_file(file), m_procedures(ColourProcedures(job.colours)),
       m_surface(cairo_ps_surface_create_for_stream(Take, this, 1, 1), cairo_surface_destroy),

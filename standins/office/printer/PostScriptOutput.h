@@ -17,8 +17,8 @@ struct Size {
     double height;
 };
 
-/// A4 upright: what is laid out here is laid out for it.
-constexpr Size Paper{595, 842};
+/// The paper, upright, that what is laid out here is laid out for: the printer's usual one.
+Size PaperFor(const PrintJob& job);
 
 /// A PostScript file of level 3 in the making.
 class PostScriptOutput {

@@ -59,13 +59,13 @@ std::vector<Paragraph> CommentTexts(const std::vector<Comment>& comments) {
 
 Failure WritePostScript(int document, PostScriptOutput& output, const PrintJob& job) {
     if (job.contents == Contents::Outline) {
-        const TextSheets outline(ReadOutline(document, job.printHidden));
+        const TextSheets outline(ReadOutline(document, job.printHidden), PaperFor(job));
         return Print(AllSheets({&outline}), output, job);
     }
     const PdfDocument pdf(document);
     const std::vector<Comment> comments = job.comments ? pdf.Comments() : std::vector<Comment>();
     const PdfSheets pages(pdf, job, comments);
-    const TextSheets notes(CommentTexts(comments));
+    const TextSheets notes(CommentTexts(comments), PaperFor(job));
     return Print(AllSheets({&pages, &notes}), output, job);
 }
 

@@ -39,7 +39,8 @@ struct PrintJob {
     bool comments = false;    ///< marked in the pages, and on sheets of their own at the end
     bool printHidden = false; ///< hidden slides in the outline
     Colours colours = Colours::All;
-    std::vector<PrinterPaper> papers; ///< the usual one first; any size when there are none
+    std::vector<PrinterPaper> papers; ///< the usual one first; none when that is not known
+    bool onlyThesePapers = false;     ///< not any other size too
 };
 
 } // namespace standins

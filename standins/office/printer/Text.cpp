@@ -7,7 +7,6 @@ namespace standins {
 namespace {
 
 constexpr double Margin = 60;
-constexpr double Bottom = Paper.height - Margin;
 
 struct FontDeleter {
     void operator()(PangoFontDescription* font) const { pango_font_description_free(font); }
@@ -50,8 +49,8 @@ void TextSheets::ObjectDeleter::operator()(void* object) const {
     g_object_unref(object);
 }
 
-TextSheets::TextSheets(std::vector<Paragraph> paragraphs)
-    : m_paragraphs(std::move(paragraphs)),
+TextSheets::TextSheets(std::vector<Paragraph> paragraphs, Size paper)
+    : m_paragraphs(std::move(paragraphs)), m_paper(paper),
       m_context(pango_font_map_create_context(pango_cairo_font_map_get_default())), m_next(Margin) {
     // Lines break alike wherever they are printed.
     const std::unique_ptr<cairo_font_options_t, decltype(&cairo_font_options_destroy)> options(
@@ -67,7 +66,7 @@ TextSheets::Layout TextSheets::MakeLayout(const Paragraph& paragraph) const {
     Layout layout(pango_layout_new(m_context.get()));
     SetFont(layout.get(), paragraph.size, paragraph.isBold);
     SetText(layout.get(), paragraph.text);
-    const double width = Paper.width - 2 * Margin - paragraph.indent;
+    const double width = m_paper.width - 2 * Margin - paragraph.indent;
     pango_layout_set_width(layout.get(), static_cast<int>(width * PANGO_SCALE));
     pango_layout_set_wrap(layout.get(), PANGO_WRAP_WORD_CHAR);
     return layout;
@@ -80,7 +79,7 @@ void TextSheets::Place(std::size_t paragraph) {
     const int lines = pango_layout_get_line_count(layout.get());
     for (int line = 0; line < lines; ++line) {
         const double height = LineHeight(pango_layout_get_line_readonly(layout.get(), line));
-        const bool isNewSheet = m_sheets.empty() || m_next + height > Bottom;
+        const bool isNewSheet = m_sheets.empty() || m_next + height > m_paper.height - Margin;
         if (isNewSheet) {
             m_sheets.emplace_back();
             m_next = Margin;
@@ -93,7 +92,7 @@ void TextSheets::Place(std::size_t paragraph) {
 }
 
 void TextSheets::Print(int number, PostScriptOutput& output) const {
-    cairo_t* sheet = output.NewSheet(Paper);
+    cairo_t* sheet = output.NewSheet(m_paper);
     for (const Piece& piece : m_sheets[static_cast<std::size_t>(number)])
         DrawPiece(piece, sheet);
 }

@@ -24,7 +24,7 @@ struct Paragraph {
 /// Paragraphs on as many sheets as they need.
 class TextSheets : public Sheets {
 public:
-    explicit TextSheets(std::vector<Paragraph> paragraphs);
+    TextSheets(std::vector<Paragraph> paragraphs, Size paper);
 
     int Count() const override { return static_cast<int>(m_sheets.size()); }
     void Print(int number, PostScriptOutput& output) const override;
@@ -47,6 +47,7 @@ private:
     void DrawPiece(const Piece& piece, cairo_t* sheet) const;
 
     std::vector<Paragraph> m_paragraphs;
+    Size m_paper;
     std::unique_ptr<PangoContext, ObjectDeleter> m_context;
     std::vector<std::vector<Piece>> m_sheets;
     double m_next; ///< where the next paragraph goes while they are placed
