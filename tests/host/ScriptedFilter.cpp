@@ -161,6 +161,10 @@ public:
             System::EndThisProcess();
         if (script["output"] != "none")
             wxFile(outputFolder + '/' + outputName, wxFile::write).Write(m_server + m_settings);
+        if (script["output"] == "pdf" && m_settings.Contains("OUTPUTFILETYPEPS=0")) {
+            outputName = wxFileName(item.fileName).GetName() + ".pdf";
+            wxFile(outputFolder + '/' + outputName, wxFile::write).Write("%PDF");
+        }
         if (!script["companion"].empty()) // beside the output, as PostScript stays beside PDF
             wxFile(outputFolder + '/' + wxFileName(outputName).GetName() + script["companion"],
                    wxFile::write);

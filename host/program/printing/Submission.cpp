@@ -24,7 +24,10 @@ constexpr Kind Kinds[] = {{".ps", "application/postscript"}, {".pdf", "applicati
 
 fs::path FileOf(const Submission& submission, const Kind& kind) {
     fs::path file = submission.document;
-    return file.replace_extension(kind.ending);
+    file.replace_extension(kind.ending);
+    const fs::path forPrinter = file.parent_path() / ForPrinterFolder / file.filename();
+    std::error_code error;
+    return fs::is_regular_file(forPrinter, error) ? forPrinter : file;
 }
 
 /// Takes away what was left without its document, and counts the others.

@@ -12,6 +12,9 @@ struct PrintReply {
     bool wantsPdf = false; ///< no job has been made, since PDF is what the queue prints as it is
 };
 
+/// The folder beside a document's output where what is made for the printer alone lies.
+constexpr const char* ForPrinterFolder = "printer";
+
 /// How a document is submitted.
 struct Submission {
     PrintTicket ticket;
@@ -19,8 +22,9 @@ struct Submission {
     /// Jobs of this user's in the queue, beyond which none is made. Not given, none is looked for
     /// that an earlier program may have left either.
     std::optional<std::size_t> most;
-    bool mayWantPdf = false;        ///< PDF can be made of the document, if only PostScript was
-    std::filesystem::path document; ///< PostScript or PDF; the other kind may lie beside it
+    bool mayWantPdf = false; ///< PDF can be made of the document, if only PostScript was
+    /// PostScript or PDF; the other kind may lie beside it, or in ForPrinterFolder.
+    std::filesystem::path document;
 };
 
 /// Makes the job, without its document. One that was made before, by a program that was ended

@@ -2,10 +2,9 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
-#include "host/program/settings/Settings.h"
 #include "host/program/watch/JobDecision.h"
+#include "host/program/watch/PrinterPdf.h"
 #include "plugin/interface/ResultCodes.h"
-#include "plugin/settings/FilterSettings.h"
 
 #include <wx/filename.h>
 #include <wx/intl.h>
@@ -19,17 +18,6 @@ namespace {
 
 /// Before a document's end is tried again.
 constexpr std::chrono::seconds BetweenEnds = 30s;
-
-/// Settings by which a PDF file is made as well, if they can be so.
-std::string WithPdf(const std::string& xml) {
-    Fault ignored;
-    std::optional<Settings> settings = Settings::FromXml(xml, ignored);
-    if (!settings)
-        return xml;
-    settings->Set(FilterSettings::OutputPS.key, "0");
-    settings->Set(FilterSettings::OutputPDF.key, "1");
-    return settings->Xml();
-}
 
 WatchWork::Clock::time_point Now() {
     return WatchWork::Clock::now();
@@ -177,9 +165,9 @@ std::optional<Fault> WatchWork::Prepare(UnderWay& work, WatchedFolder& folder,
         return fault;
     assignment.input = InputOf(work.job);
     assignment.workplace = work.workplace->Path();
-    const auto& print = folder.Configuration()->print;
-    assignment.settings =
-        print && m_printing.WantsPdf(print->ticket) ? WithPdf(*settings) : *settings;
+    assignment.settings = *settings;
+    if (const auto& print = folder.Configuration()->print)
+        work.pdfIsForPrinter = m_printing.WantsPdf(print->ticket) && AskForPdf(assignment.settings);
     assignment.language =
         folder.Configuration()->language ? folder.Configuration()->language : m_means.language;
     assignment.engineDocuments = EngineDocuments();
@@ -253,6 +241,8 @@ void WatchWork::Decide(UnderWay& work) {
     Job& job = work.job;
     const FolderNews news =
         DecideByOutcome(job, *work.outcome, *work.folder, PresentCircumstances());
+    if (work.pdfIsForPrinter && job.state == JobState::Submitting)
+        SetPdfAside(job);
     WatchedFolder* const folder = Find(job.folder);
     if (folder && news == FolderNews::Works)
         folder->Unblock();

@@ -86,6 +86,7 @@ private:
         std::optional<Workplace> workplace; ///< until what is in it is delivered
         RunningDocument shown;
         std::optional<Outcome> outcome; ///< when the worker is done
+        bool pdfIsForPrinter = false;   ///< the settings do not ask for it
         bool isToBeTold = false;        ///< to the journal, what has been decided
         bool isReported = false;
         Clock::time_point next; ///< when its end may be tried again

@@ -48,7 +48,7 @@ protected:
         const std::string obstacle = CupsServer::Obstacle("/usr/sbin/cupsd");
         if (!obstacle.empty())
             GTEST_SKIP() << obstacle;
-        m_server.AddBackend("paper", "head -c 5 \"$6\" >>" + Paper().string());
+        m_server.AddBackend("paper", "echo \"$CONTENT_TYPE\" >>" + Paper().string());
         m_server.Start();
     }
 
@@ -120,6 +120,28 @@ TEST_F(PrintPaperTest, SheetsAreThoseOfTheQueue) {
             EXPECT_LE(sheets.drawn.top, white.top);
         }
     }
+}
+
+TEST_F(PrintPaperTest, PdfForTheQueueAloneIsNotDelivered) {
+    AddQueue("letter", "*cupsFilter2: \"application/pdf application/pdf 0 -\"\n");
+    const struct {
+        const char* settings;
+        Names output;
+    } rows[] = {{"[folder.set]\nOUTPUTFILETYPEPS = '1'\n", {"a.ps"}}, {"", {"a.pdf", "a.ps"}}};
+    std::string printed;
+    for (const auto& row : rows) {
+        Configure("on_same_name = 'replace'\n[folder.print]\nqueue = 'letter'\nkeep = true\n" +
+                  std::string(row.settings));
+        Put("a.doc", "output=pdf");
+        const RunResult run = WatchOnce();
+        EXPECT_EQ(run.exitCode, 0) << run.err;
+        EXPECT_EQ(FilesIn("out"), row.output);
+        EXPECT_EQ(ReadBytes(Paper()), printed += "application/pdf\n");
+    }
+    EXPECT_EQ(
+        RunQuillon({"convert", Path("in/processed/a.doc"), "--print", "letter", "--wait"}).exitCode,
+        0);
+    EXPECT_EQ(ReadBytes(Paper()), printed += "application/pdf\n");
 }
 
 } // namespace
