@@ -26,7 +26,6 @@ public:
     bool Commit(const Job&) override { return false; }
     std::vector<Job> TakeOver(const std::vector<wxString>&, const Claimant&) override { return {}; }
     void Remove(std::int64_t) override {}
-    bool HasNews() override { return true; }
     JournalTime Now() override { return std::chrono::system_clock::now(); }
 
     std::vector<Job> List(const JobQuery& query) override {

@@ -1,7 +1,6 @@
 #include "host/program/base/PathText.h"
 #include "host/program/commands/JournalOptions.h"
 #include "host/program/commands/ServiceRun.h"
-#include "host/program/report/Readiness.h"
 
 #include <wx/intl.h>
 
@@ -12,11 +11,8 @@ namespace fs = std::filesystem;
 namespace {
 
 struct ServeOptions {
-    std::optional<std::string> queue;
-    std::optional<std::string> configuration; ///< a file
-    std::vector<std::string> shares;          ///< SHARE=DIR
-    std::optional<std::string> http;
-    std::optional<unsigned> jobs;
+    ServiceOptions service;
+    std::vector<std::string> shares; ///< SHARE=DIR
     bool anyVersion = false;
 };
 
@@ -42,18 +38,12 @@ std::optional<PathMap> ReadMap(const std::vector<std::string>& given, Fault& fau
 std::optional<WatchConfiguration> ReadConfiguration(const ServeOptions& options, Fault& fault) {
     std::optional<WatchConfiguration> configuration = StandardWatchConfiguration();
     configuration->http.clear();
-    if (options.configuration)
-        configuration =
-            ReadWatchConfiguration(FromArgument(*options.configuration), fault, FoldersNeed::None);
+    if (const auto& file = options.service.configuration)
+        configuration = ReadWatchConfiguration(FromArgument(*file), fault, FoldersNeed::None);
     if (!configuration)
         return std::nullopt;
     configuration->folders.clear();
-    if (options.queue)
-        configuration->journal = *options.queue;
-    if (options.http)
-        configuration->http = *options.http;
-    if (options.jobs)
-        configuration->jobs = *options.jobs;
+    Override(*configuration, options.service);
     if (!options.shares.empty()) {
         const std::optional<PathMap> map = ReadMap(options.shares, fault);
         if (!map)
@@ -73,14 +63,11 @@ ExitCode RunServe(const ServeOptions& serve, const CommonOptions& options, Repor
     std::optional<WatchConfiguration> configuration = ReadConfiguration(serve, fault);
     if (!configuration)
         return reporter.Error(fault);
-    const FilterSet filters(options.FiltersFolder());
-    if (const std::optional<Fault> missing = FindMissingFilter(filters))
-        return reporter.Error(*missing);
-    ServiceRun run = {std::move(*configuration), MeansOf(options)};
+    ServiceRun run = {std::move(*configuration), {}};
     run.finds = false;
     run.anyVersion = serve.anyVersion;
-    run.pageIsAsked = serve.http.has_value();
-    return RunService(std::move(run), filters, reporter);
+    run.pageIsAsked = serve.service.http.has_value();
+    return RunService(std::move(run), options, reporter);
 }
 
 } // namespace
@@ -95,16 +82,16 @@ void AddServe(CLI::App& program, Command& chosen) {
                 return RunServe(*given, options, reporter);
             };
         });
-    AddQueueUrl(serve, given->queue);
+    AddQueueUrl(serve, given->service.queue);
     AddOption(serve, "--config", "FILE.toml", "Where queue, map, jobs, lease and http stand",
-              given->configuration);
+              given->service.configuration);
     serve
         .add_option("--map", given->shares,
                     "Where this machine has a share that the watches name; as often as needed")
         ->type_name("SHARE=DIR");
-    AddOption(serve, "--http", "HOST:PORT", "Where to show a page", given->http);
+    AddOption(serve, "--http", "HOST:PORT", "Where to show a page", given->service.http);
     AddFlag(serve, "--any-version",
             "Also where pages may look another way than from the machines that work already",
             given->anyVersion);
-    AddJobs(serve, given->jobs);
+    AddJobs(serve, given->service.jobs);
 }

@@ -2,6 +2,7 @@
 
 #include "host/program/machine/Engines.h"
 #include "host/program/page/PageServer.h"
+#include "host/program/report/Readiness.h"
 #include "host/program/system/InstalledFonts.h"
 #include "host/program/system/Interruption.h"
 #include "machine/OfficeApplication.h"
@@ -56,18 +57,39 @@ std::optional<Fault> FindObstacle(const Machine& self, Journal& journal) {
     }
 }
 
-} // namespace
+std::unique_ptr<PageServer> StartPage(const WatchConfiguration& configuration,
+                                      WatchService& service, const StatusBoard& board,
+                                      Fault& fault) {
+    const auto openJournal = [where = configuration.journal, map = configuration.map](Fault& why) {
+        return OpenJournal(where, why, JournalNeed::Make, map);
+    };
+    return PageServer::Start(
+        configuration.http, openJournal, board, [&service] { service.Wake(); }, fault);
+}
 
-WatchService::Means MeansOf(const CommonOptions& options) {
-    WatchService::Means means;
+void TakeCommonOptions(WatchService::Means& means, const CommonOptions& options) {
     means.workerArguments = WorkerArguments(options);
     means.workerPatience = WorkerPatience(options);
     means.language = options.language;
     means.engineDocuments = options.engineDocuments;
-    return means;
 }
 
-ExitCode RunService(ServiceRun run, const FilterSet& filters, Reporter& reporter) {
+} // namespace
+
+void Override(WatchConfiguration& configuration, const ServiceOptions& options) {
+    if (options.queue)
+        configuration.journal = *options.queue;
+    if (options.http)
+        configuration.http = *options.http;
+    if (options.jobs)
+        configuration.jobs = *options.jobs;
+}
+
+ExitCode RunService(ServiceRun run, const CommonOptions& options, Reporter& reporter) {
+    const FilterSet filters(options.FiltersFolder());
+    if (const std::optional<Fault> missing = FindMissingFilter(filters))
+        return reporter.Error(*missing);
+    TakeCommonOptions(run.means, options);
     const WatchConfiguration& configuration = run.configuration;
     Fault fault;
     const std::unique_ptr<Journal> journal =
@@ -82,12 +104,7 @@ ExitCode RunService(ServiceRun run, const FilterSet& filters, Reporter& reporter
     std::unique_ptr<PageServer> page;
     std::optional<PageAudience> audience;
     if (!configuration.http.empty()) {
-        const auto openJournal = [where = configuration.journal,
-                                  map = configuration.map](Fault& why) {
-            return OpenJournal(where, why, JournalNeed::Make, map);
-        };
-        page = PageServer::Start(
-            configuration.http, openJournal, board, [&service] { service.Wake(); }, fault);
+        page = StartPage(configuration, service, board, fault);
         if (!page && run.pageIsAsked)
             return reporter.Error(fault);
         if (!page) // documents are printed all the same

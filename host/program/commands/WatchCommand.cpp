@@ -2,7 +2,6 @@
 #include "host/program/commands/JournalOptions.h"
 #include "host/program/commands/ServiceRun.h"
 #include "host/program/page/PageServer.h"
-#include "host/program/report/Readiness.h"
 #include "host/program/watch/ConfigurationCheck.h"
 #include "host/program/watch/FolderLock.h"
 #include "host/program/watch/FolderPlaces.h"
@@ -20,12 +19,9 @@ namespace {
 struct WatchOptions {
     std::optional<std::string> folder;
     std::optional<std::string> out;
-    std::optional<std::string> configuration; ///< a file
+    ServiceOptions service;
     std::optional<std::string> journal;
-    std::optional<std::string> queue;
-    std::optional<std::string> http;
     SettingsOptions settings;
-    std::optional<unsigned> jobs;
     bool check = false;
     bool once = false;
 };
@@ -72,23 +68,18 @@ std::optional<WatchConfiguration> ConfigurationOf(const WatchOptions& options, F
 
 /// What is to be watched: the file's word, and the command line's in its place.
 std::optional<WatchConfiguration> ReadConfiguration(const WatchOptions& options, Fault& fault) {
-    if (options.configuration && options.folder) {
+    const std::optional<std::string>& file = options.service.configuration;
+    if (file && options.folder) {
         fault = {_("name either a folder or a file with --config"), Blame::Usage};
         return std::nullopt;
     }
     std::optional<WatchConfiguration> configuration =
-        options.configuration ? ReadWatchConfiguration(FromArgument(*options.configuration), fault)
-                              : ConfigurationOf(options, fault);
+        file ? ReadWatchConfiguration(FromArgument(*file), fault) : ConfigurationOf(options, fault);
     if (!configuration)
         return std::nullopt;
     if (options.journal)
         configuration->journal = fs::absolute(FromArgument(*options.journal)).u8string();
-    if (options.queue)
-        configuration->journal = *options.queue;
-    if (options.http)
-        configuration->http = *options.http;
-    if (options.jobs)
-        configuration->jobs = *options.jobs;
+    Override(*configuration, options.service);
     if (const auto clash = FindClash(*configuration)) {
         fault = {clash->what, Blame::Usage};
         return std::nullopt;
@@ -112,25 +103,23 @@ std::vector<Fault> FindObstacleOfPage(const WatchConfiguration& configuration) {
 
 ExitCode RunWatch(const WatchOptions& watch, const CommonOptions& options, Reporter& reporter) {
     Fault fault;
-    const std::optional<WatchConfiguration> configuration = ReadConfiguration(watch, fault);
+    std::optional<WatchConfiguration> configuration = ReadConfiguration(watch, fault);
     if (!configuration)
         return reporter.Error(fault);
-    const FilterSet filters(options.FiltersFolder());
     if (watch.check)
-        return TellCheck(*configuration, filters, reporter, FindObstacleOfPage(*configuration));
-    if (const std::optional<Fault> missing = FindMissingFilter(filters))
-        return reporter.Error(*missing);
-    ServiceRun run = {*configuration, MeansOf(options)};
+        return TellCheck(*configuration, FilterSet(options.FiltersFolder()), reporter,
+                         FindObstacleOfPage(*configuration));
+    const std::optional<std::string>& file = watch.service.configuration;
+    ServiceRun run = {std::move(*configuration), {}};
     run.means.once = watch.once;
-    run.means.finder = wxGetHostName() + ' ' +
-                       Shown(fs::absolute(FromArgument(watch.configuration ? *watch.configuration
-                                                                           : *watch.folder)));
-    run.pageIsAsked = watch.http.has_value();
-    if (watch.configuration) {
+    run.means.finder =
+        wxGetHostName() + ' ' + Shown(fs::absolute(FromArgument(file ? *file : *watch.folder)));
+    run.pageIsAsked = watch.service.http.has_value();
+    if (file) {
         run.means.reload = [watch](Fault& why) { return ReadConfiguration(watch, why); };
         run.obeysHangUp = true;
     }
-    return RunService(std::move(run), filters, reporter);
+    return RunService(std::move(run), options, reporter);
 }
 
 } // namespace
@@ -148,13 +137,13 @@ void AddWatch(CLI::App& program, Command& chosen) {
     AddOption(watch, "FOLDER", "DIR", "The folder that documents come into", given->folder);
     AddOption(watch, "-o,--out", "DIR", "The folder for the output", given->out);
     AddOption(watch, "--config", "FILE.toml", "What to watch, in place of one folder",
-              given->configuration);
+              given->service.configuration);
     AddFlag(watch, "--check", "Say what would be done, and what will not work", given->check);
     AddFlag(watch, "--once", "End when all that has settled is done", given->once);
     AddOption(watch, "--journal", "FILE", "Where it is kept what is known of documents",
               given->journal);
-    AddQueueUrl(watch, given->queue);
-    AddOption(watch, "--http", "HOST:PORT", "Where to show a page", given->http);
+    AddQueueUrl(watch, given->service.queue);
+    AddOption(watch, "--http", "HOST:PORT", "Where to show a page", given->service.http);
     AddSettingsOptions(watch, given->settings);
-    AddJobs(watch, given->jobs);
+    AddJobs(watch, given->service.jobs);
 }

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/base/Fault.h"
+#include "host/program/documents/Outcome.h"
 #include "host/program/system/FileIdentity.h"
 
 #include <wx/string.h>
@@ -25,12 +25,8 @@ enum class JobState {
 /// The journal's clock: the system's, or that of the server that keeps the journal.
 using JournalTime = std::chrono::system_clock::time_point;
 
-/// What a print server has of a document, or is to have.
-struct PrintOrder {
-    wxString server;   ///< its address; with the number
-    wxString queue;    ///< likewise
-    int number = 0;    ///< of the job there; 0 for none yet
-    wxString uuid;     ///< tells it from another one that gets the same number
+/// What a print server has of a document, or is to have: as long as its number is 0 there is none.
+struct PrintOrder : PrintedJob {
     bool held = false; ///< it waits there for a person: the server had lost it once
     wxString message;  ///< what the server says of it, in its own words; or empty
 };

@@ -119,9 +119,6 @@ public:
     /// Names of folders as above.
     virtual std::set<wxString> Paused() = 0;
 
-    /// Whether another object or program may have changed anything since the last call.
-    virtual bool HasNews() = 0;
-
     /// What its clock says.
     virtual JournalTime Now() = 0;
 

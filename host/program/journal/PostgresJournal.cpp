@@ -224,11 +224,6 @@ std::set<wxString> PostgresJournal::Paused() {
     return folders;
 }
 
-bool PostgresJournal::HasNews() {
-    const std::uint64_t news = m_connection.News();
-    return std::exchange(m_newsSeen, news) != news;
-}
-
 /// While the server is away, its clock goes on.
 JournalTime PostgresJournal::Now() {
     const Steady::time_point before = Steady::now();

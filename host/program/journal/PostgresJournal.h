@@ -33,7 +33,6 @@ public:
     void Remove(std::int64_t id) override;
     void SetPaused(const wxString& folder, bool paused) override;
     std::set<wxString> Paused() override;
-    bool HasNews() override;
     JournalTime Now() override;
     SharedJournal* Shared() override { return &m_shared; }
 
@@ -60,7 +59,6 @@ private:
     const Options m_options;
     PostgresConnection m_connection;
     PostgresShared m_shared{m_connection};
-    std::uint64_t m_newsSeen = 0;
     std::uint64_t m_ownChanges = 0;
     std::optional<Remembered<std::string>> m_nothing; ///< what was asked for when there was none
     std::optional<Remembered<std::set<wxString>>> m_paused;

@@ -32,11 +32,6 @@ std::string OrderOf(const JobQuery& query) {
     return query.folder ? "id" : "priority DESC, id";
 }
 
-std::int64_t DataVersion(SqliteDatabase& database) {
-    SqliteStatement version(database, "PRAGMA data_version");
-    return version.Next() ? version.Integer() : 0;
-}
-
 } // namespace
 
 std::unique_ptr<SqliteJournal> SqliteJournal::Open(const std::filesystem::path& file,
@@ -50,7 +45,6 @@ bool SqliteJournal::EnsureOpen(Fault& fault) {
         return true;
     m_database = OpenJournalFile(m_file, m_options.need, m_isDamaged, m_options.patience, fault);
     m_isDamaged = false;
-    m_dataVersion = 0; // it may be another file
     return m_database != nullptr;
 }
 
@@ -251,12 +245,5 @@ std::set<wxString> SqliteJournal::Paused() {
         while (row.Next())
             folders.insert(row.Text());
         return folders;
-    });
-}
-
-bool SqliteJournal::HasNews() {
-    return With([&](SqliteDatabase& database) {
-        const std::int64_t version = DataVersion(database);
-        return std::exchange(m_dataVersion, version) != version;
     });
 }

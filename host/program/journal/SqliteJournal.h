@@ -31,7 +31,6 @@ public:
     void Remove(std::int64_t id) override;
     void SetPaused(const wxString& folder, bool paused) override;
     std::set<wxString> Paused() override;
-    bool HasNews() override;
     JournalTime Now() override { return m_options.now(); }
 
 private:
@@ -50,5 +49,4 @@ private:
     Options m_options;
     std::unique_ptr<SqliteDatabase> m_database; ///< null after an error
     bool m_isDamaged = false;
-    std::int64_t m_dataVersion = 0; ///< changes when another object or program writes
 };
