@@ -64,9 +64,7 @@ protected:
     pid_t AwaitWorker() const {
         std::string machine;
         Await("a document under way", [&] {
-            pqxx::connection connection(m_url);
-            pqxx::work work(connection);
-            const auto rows = work.exec("SELECT claimed_by FROM job WHERE state='converting'");
+            const auto rows = Rows("SELECT claimed_by FROM job WHERE state='converting'");
             machine = rows.empty() ? "" : rows[0][0].as<std::string>();
             return !machine.empty();
         });
@@ -78,6 +76,11 @@ protected:
         pqxx::work work(connection);
         work.exec(sql);
         work.commit();
+    }
+
+    pqxx::result Rows(const std::string& sql) const {
+        pqxx::connection connection(m_url);
+        return pqxx::work(connection).exec(sql);
     }
 
     /// Has nobody wait for what a machine has that is dead.
@@ -93,9 +96,7 @@ protected:
     }
 
     bool HasOpenJobs(std::size_t atLeast = 1) const {
-        pqxx::connection connection(m_url);
-        pqxx::work work(connection);
-        return work.exec("SELECT 1 FROM job WHERE open").size() >= atLeast;
+        return Rows("SELECT 1 FROM job WHERE open").size() >= atLeast;
     }
 
     static PostgresServer& Server() { return PostgresServer::OfAllTests(); }
@@ -109,8 +110,12 @@ TEST_F(ServeTest, MachinesWithOtherPathsConvertWhatOneFinds) {
     const Program workers[] = {Start(Serve("elsewhere", {"-j", "2"})),
                                Start(Serve(".", {"-j", "2"}))};
     for (int number = 0; number < Documents; ++number)
-        Put(std::to_string(number) + ".doc");
+        Put(std::to_string(number) + ".doc", "wait=" + Path("go"));
     Put("refused.doc", "screen=-1005");
+    Await("work for both", [this] {
+        return Rows("SELECT DISTINCT claimed_by FROM job WHERE state='converting'").size() == 2;
+    });
+    m_folder.Write("go", "");
     AwaitOutputs(Documents);
     Await("an end of all", [this] { return !HasOpenJobs(); });
     EXPECT_THAT(FilesIn("out"), SizeIs(Documents));
