@@ -1,5 +1,6 @@
 #include "host/program/watch/ConfigurationValue.h"
 
+#include "host/program/base/PathText.h"
 #include "host/program/watch/Quantities.h"
 #include "host/services/OneLine.h"
 
@@ -67,6 +68,10 @@ void ConfigurationValue::RefuseKey(const wxString& what, const std::vector<wxStr
                               Suggestion(m_key, known)};
 }
 
+void ConfigurationValue::RefuseKey(const std::vector<wxString>& known) const {
+    RefuseKey(_("there is no key \"%s\" here"), known);
+}
+
 wxString ConfigurationValue::Text() const {
     const std::optional<std::string_view> text = m_node->value_exact<std::string_view>();
     if (!text)
@@ -89,6 +94,11 @@ wxString ConfigurationValue::AsText() const {
     if (const auto number = m_node->value_exact<std::int64_t>())
         return wxString(std::to_string(*number));
     return Text();
+}
+
+std::filesystem::path ConfigurationValue::Path(const std::filesystem::path& base) const {
+    std::filesystem::path path = (base / FromText(Word())).lexically_normal();
+    return path.has_filename() || path == path.root_path() ? path : path.parent_path();
 }
 
 bool ConfigurationValue::Flag() const {

@@ -6,6 +6,8 @@
 
 #include <chrono>
 #include <cstdint>
+#include <filesystem>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -39,12 +41,16 @@ public:
     /// @param what has "%s" for the key
     /// @param known the keys that there are
     [[noreturn]] void RefuseKey(const wxString& what, const std::vector<wxString>& known) const;
+    /// As one that is not known here.
+    [[noreturn]] void RefuseKey(const std::vector<wxString>& known) const;
 
     wxString Text() const;
     /// A text that is not empty.
     wxString Word() const;
     /// A text, a number, or true and false as "1" and "0".
     wxString AsText() const;
+    /// @param base what it is relative to
+    std::filesystem::path Path(const std::filesystem::path& base) const;
     bool Flag() const;
     std::int64_t Number(std::int64_t least, std::int64_t most) const;
     std::chrono::milliseconds Time(std::chrono::milliseconds least,
@@ -66,3 +72,22 @@ private:
     FilePosition m_keyAt;
     const toml::node* m_node;
 };
+
+/// What reads the value of each key that a table may have.
+template <typename Target>
+using KeyReaders = std::map<std::string, void (*)(const ConfigurationValue&, Target&)>;
+
+/// Reads a table. Throws a Misfit when it has a key that none of them reads.
+template <typename Target>
+void ReadTable(const ConfigurationValue& table, const KeyReaders<Target>& readers, Target& target) {
+    for (const ConfigurationValue& value : table.Values()) {
+        if (const auto reader = readers.find(value.Key()); reader != readers.end()) {
+            reader->second(value, target);
+            continue;
+        }
+        std::vector<wxString> known;
+        for (const auto& [key, read] : readers)
+            known.push_back(wxString::FromUTF8(key));
+        value.RefuseKey(known);
+    }
+}

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/journal/SharedJournal.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 /// What a machine that finds a folder's documents tells others of it.
 /// @param fault receives why it cannot be told: its settings file cannot be read

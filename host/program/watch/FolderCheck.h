@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/system/FileSystemKind.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 /// How a watch of a folder would work.
 struct FolderCheck {

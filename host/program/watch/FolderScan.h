@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/system/FileIdentity.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 #include <functional>
 #include <map>

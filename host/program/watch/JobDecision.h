@@ -2,7 +2,7 @@
 
 #include "host/program/documents/Outcome.h"
 #include "host/program/journal/Job.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 // What becomes of a job. These change the job alone; the journal is told by whoever calls them.
 

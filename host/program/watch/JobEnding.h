@@ -2,7 +2,7 @@
 
 #include "host/program/journal/Journal.h"
 #include "host/program/report/Texts.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 // The last steps of a document's way. Each is told to the journal before it is done, so that
 // whoever finds the journal after the program was ended between any two of them knows what is left

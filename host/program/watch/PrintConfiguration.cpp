@@ -46,10 +46,8 @@ std::string ReadHold(Value value) {
     return text == "0" ? "no-hold" : ReadWord(value);
 }
 
-using Keys = std::map<std::string, void (*)(Value, PrintConfiguration&)>;
-
 // clang-format off
-const Keys PrintKeys = {
+const KeyReaders<PrintConfiguration> PrintKeys = {
     {"after_loss", [](Value value, PrintConfiguration& p) { p.printsLost = value.Choice({"hold", "print"}) == 1; }},
     {"copies", [](Value value, PrintConfiguration& p) { p.ticket.options["copies"] = std::to_string(value.Number(1, 9999)); }},
     {"hold", [](Value value, PrintConfiguration& p) { p.ticket.options["job-hold-until"] = ReadHold(value); }},
@@ -77,16 +75,7 @@ PrintConfiguration ReadPrinting(const ConfigurationValue& table) {
                                       "submitted to; take this part out, and the output goes to "
                                       "\"out\"")};
     PrintConfiguration printing;
-    for (const ConfigurationValue& value : table.Values()) {
-        if (const auto key = PrintKeys.find(value.Key()); key != PrintKeys.end()) {
-            key->second(value, printing);
-            continue;
-        }
-        std::vector<wxString> known;
-        for (const auto& [name, read] : PrintKeys)
-            known.push_back(wxString::FromUTF8(name));
-        value.RefuseKey(_("there is no key \"%s\" here"), known);
-    }
+    ReadTable(table, PrintKeys, printing);
     if (printing.ticket.queue.empty())
         throw Misfit{table.KeyAt(), _("it has no \"queue\"; `lpstat -e` shows which there are")};
     return printing;

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/journal/Journal.h"
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 /// Removes a folder's processed documents whose time is over, and what the journal tells of those
 /// and of documents that vanished. Where documents are kept for ever, the journal tells of them for

@@ -2,51 +2,7 @@
 
 #include "host/program/base/Fault.h"
 #include "host/program/journal/PathMap.h"
-#include "host/program/watch/PrintConfiguration.h"
-
-#include <wx/string.h>
-
-#include <chrono>
-#include <cstdint>
-#include <filesystem>
-#include <optional>
-#include <string>
-#include <vector>
-
-/// What becomes of an output whose name is taken.
-enum class OnSameName {
-    Number,  ///< it is called "letter (2)"
-    Replace, ///< the other one goes
-};
-
-/// What becomes of files in a watched folder that no filter takes.
-enum class Others {
-    Leave, ///< they stay where they are
-    Fail,  ///< they fail, as documents do that are refused
-    Pass,  ///< they come out as they are
-};
-
-/// One watched folder.
-struct FolderConfiguration {
-    wxString name;
-    std::filesystem::path in; ///< absolute, as all paths here
-    std::filesystem::path out;
-    bool isOthers = false; ///< another machine finds its documents, and has told of the folder
-    std::optional<std::filesystem::path> settings; ///< the file, read anew for each document
-    std::optional<std::string> settingsText;       ///< what it says, where another machine has it
-    std::vector<std::string> assignments;          ///< KEY=VALUE, in place of the file's
-    std::optional<std::string> language;           ///< of reasons; the program's if not given
-    int priority = 50;
-    bool byName = false;      ///< documents in the order of their names, not of their arrival
-    bool folderIsJob = false; ///< a folder inside is begun when all in it has settled
-    OnSameName onSameName = OnSameName::Number;
-    Others others = Others::Leave;
-    std::optional<std::chrono::milliseconds>
-        settle;                                ///< as long as the file system wants if not given
-    std::optional<PrintConfiguration> print;   ///< otherwise the output goes to `out`
-    std::vector<std::chrono::seconds> retries; ///< the time before each further attempt
-    std::optional<std::chrono::seconds> keepProcessed; ///< for ever if not given
-};
+#include "host/program/watch/FolderConfiguration.h"
 
 /// What a watch works by.
 struct WatchConfiguration {
@@ -61,12 +17,7 @@ struct WatchConfiguration {
 };
 
 /// What holds where a configuration says nothing.
-FolderConfiguration StandardFolderConfiguration();
 WatchConfiguration StandardWatchConfiguration();
-
-/// For how long a file must stay as it is until it has settled.
-/// @param isOnShare where a writer that pauses is seen late
-std::chrono::milliseconds SettleTime(const FolderConfiguration& folder, bool isOnShare);
 
 /// Whether a configuration must have folders.
 enum class FoldersNeed { Some, None };

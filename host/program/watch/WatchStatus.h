@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/program/watch/WatchConfiguration.h"
+#include "host/program/watch/FolderConfiguration.h"
 
 #include <chrono>
 #include <mutex>
