@@ -3,6 +3,7 @@
 #include "host/program/linux/PrinterAbilities.h"
 #include "host/program/linux/PrinterDescription.h"
 #include "host/program/linux/SpoolerRequest.h"
+#include "host/services/OneLine.h"
 
 #include <wx/intl.h>
 
@@ -99,6 +100,20 @@ Fault NoQueue(const wxString& queue, const wxString& server) {
             Blame::Usage, ConversionFailed, _("`lpstat -e` shows which there are")};
 }
 
+/// That a queue takes no jobs, which somebody has told it.
+std::optional<Fault> FindRefusal(ipp_t* printer, const wxString& queue) {
+    ipp_attribute_t* const accepts = Attribute(printer, "printer-is-accepting-jobs");
+    if (!accepts || ippGetBoolean(accepts, 0))
+        return std::nullopt;
+    wxString what = wxString::Format(_("the queue \"%s\" takes no jobs at the moment"), queue);
+    const char* const reason =
+        ippGetString(Attribute(printer, "printer-state-message"), 0, nullptr);
+    if (reason && *reason)
+        what << ": " << OneLine(wxString::FromUTF8(reason));
+    return Fault{what, Blame::Machine, ConversionFailed,
+                 wxString::Format(_("`cupsaccept %s` has it take them again"), queue)};
+}
+
 /// The attributes of a queue's printer.
 IppMessage AskForPrinter(http_t* server, const wxString& queue, const wxString& address,
                          Fault& fault) {
@@ -160,7 +175,7 @@ std::optional<Fault> Spooler::Check(const PrintTicket& ticket) {
         if (auto unsupported = FindUnsupported(printer.get(), description ? &*description : nullptr,
                                                ticket.queue, option, value))
             return unsupported;
-    return std::nullopt;
+    return FindRefusal(printer.get(), ticket.queue);
 }
 
 std::optional<PrintWay> Spooler::FindWay(const wxString& queue,

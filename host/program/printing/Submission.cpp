@@ -129,7 +129,12 @@ PrintReply MakePrintJob(Spooler& spooler, const Submission& submission) {
             return {lack, {}};
     const std::optional<int> number =
         spooler.Create(WithPaper(submission.ticket, way->media), submission.name, fault);
-    return number ? FindPrintJob(spooler, *number) : PrintReply{fault, {}};
+    if (!number)
+        return {fault, {}};
+    PrintReply reply = FindPrintJob(spooler, *number);
+    if (reply.fault)
+        spooler.Cancel(*number); // nobody knows of it
+    return reply;
 }
 
 PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int number) {

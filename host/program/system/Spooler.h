@@ -58,7 +58,7 @@ public:
     /// @param server see PrintTicket
     explicit Spooler(const wxString& server) : m_server(server) {}
 
-    /// What is asked for in vain: a queue, or what its printer cannot do.
+    /// What is asked for in vain: a queue that takes jobs, or what its printer cannot do.
     std::optional<Fault> Check(const PrintTicket& ticket);
 
     /// How the queue prints pages of a size.

@@ -4,9 +4,12 @@
 #include "tests/host/linux/DyingProgram.h"
 #include "tests/support/linux/CupsServer.h"
 
+#include <httplib.h>
+
 #include <csignal>
 #include <cstdlib>
 #include <fstream>
+#include <thread>
 
 namespace fs = std::filesystem;
 using testing::ElementsAre;
@@ -115,6 +118,50 @@ TEST_F(PrintingTest, SaysWhatCannotBePrintedSo) {
         EXPECT_EQ(run.exitCode, exitCode) << run.err;
         EXPECT_THAT(run.err, HasSubstr(reason));
     }
+    Run("/usr/sbin/cupsreject -r 'being moved' ps0");
+    ConfigurePrinting();
+    EXPECT_THAT(RunQuillon(Watch({"--check"})).err,
+                HasSubstr("no jobs at the moment: being moved"));
+}
+
+/// What is there in place of a print server.
+TEST_F(PrintingTest, SaysWhatIsNoPrintServer) {
+    using httplib::Response;
+    const struct {
+        const char* name;
+        std::function<void(Response&)> answer;
+        const char* reason;
+    } cases[] = {
+        {"a web page", [](Response& to) { to.set_content("<html>", "text/html"); }, "not as a"},
+        {"garbage", [](Response& to) { to.set_content("\1\1xx", "application/ipp"); }, "not as a"},
+        {"an end",
+         [](Response& to) {
+             to.set_content_provider(9, "application/ipp",
+                                     [](auto, auto, httplib::DataSink&) { return false; });
+         },
+         "not answer"},
+        {"a lock",
+         [](Response& to) {
+             to.status = 401;
+             to.set_header("WWW-Authenticate", "Basic realm=\"CUPS\"");
+         },
+         "asks for a password"},
+        {"a closed door", [](Response& to) { to.status = 403; }, "does not let this user"},
+        {"a break", [](Response& to) { to.status = 503; }, "not answer"},
+    };
+    for (const auto& [name, answer, reason] : cases) {
+        SCOPED_TRACE(name);
+        httplib::Server server;
+        server.Post(".*", [&answer = answer](const auto&, Response& to) { answer(to); });
+        const int port = server.bind_to_any_port("127.0.0.1");
+        std::thread thread([&server] { server.listen_after_bind(); });
+        ConfigurePrinting("server = '127.0.0.1:" + std::to_string(port) + "'\n");
+        const RunResult run = RunQuillon(Watch({"--check"}));
+        EXPECT_EQ(run.exitCode, 3);
+        EXPECT_THAT(run.err, HasSubstr(reason));
+        server.stop();
+        thread.join();
+    }
 }
 
 TEST_F(PrintingTest, WaitsForAPrinterThatIsAwayOrFull) {
@@ -142,6 +189,26 @@ TEST_F(PrintingTest, WhatIsCancelledFails) {
     AwaitFile(m_folder / "in/failed/a.doc.txt");
     EXPECT_THAT(ReadBytes(m_folder / "in/failed/a.doc.txt"), HasSubstr("cancelled"));
     EXPECT_EQ(Ask({"cancel", id}).exitCode, 1) << "it is there no more";
+}
+
+TEST_F(PrintingTest, WhatThePrinterGivesUpFails) {
+    StartServer();
+    m_server.AddBackend("wet", "echo 'ERROR: the paper is wet' >&2; exit 1");
+    m_server.AddQueue("ps0", "wet:/", {});
+    Run("lpadmin -p ps0 -o printer-error-policy=abort-job");
+    Put("a.doc");
+    EXPECT_EQ(WatchOnce().exitCode, 1);
+    EXPECT_THAT(ReadBytes(m_folder / "in/failed/a.doc.txt"),
+                HasSubstr("given up job 1 of ps0: the paper is wet"));
+}
+
+TEST_F(PrintingTest, WhatIsLostAgainIsHeld) {
+    StartServer("PreserveJobHistory No\n"); // as if what is on paper were lost
+    ConfigurePrinting("after_loss = 'print'\n");
+    Put("a.doc");
+    const RunningProgram watch(QuillonCommand(Watch()));
+    AwaitJob("printing", [](const auto& job) { return job["print"]["held"].template get<bool>(); });
+    EXPECT_EQ(Printed().size(), 2U);
 }
 
 TEST_F(PrintingTest, AJobThatTheServerHasLostIsHeldAndTold) {
@@ -180,9 +247,10 @@ TEST_F(PrintingTest, ConvertPrintsAndWaitsForThePaper) {
     EXPECT_EQ(convert({"--out", Path("out"), "--print-option", "copies=2", "--wait"}).exitCode, 0);
     EXPECT_THAT(FilesIn("out"), ElementsAre("a.ps"));
     EXPECT_THAT(Printed(), ElementsAre("a.doc", "a.doc"));
-    Run("/usr/sbin/cupsreject ps0");
     EXPECT_EQ(convert({}, "other").exitCode, 3);
     EXPECT_EQ(convert({"--print-option", "Tray=2"}).exitCode, 3);
+    Run("/usr/sbin/cupsreject ps0");
+    EXPECT_EQ(convert({}).exitCode, 2);
     Run("/usr/sbin/cupsaccept ps0");
     Run("/usr/sbin/cupsdisable ps0");
     RunningProgram waiting(QuillonCommand({"convert", document, "--print", "ps0", "--wait"}));
