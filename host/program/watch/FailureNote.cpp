@@ -24,6 +24,18 @@ wxString Sentence(const wxString& text, const Texts& texts) {
                                   : wxString::Format(texts(wxTRANSLATE("%s.")), sentence);
 }
 
+/// What can be done to print it after all. It may be damaged, but not once a printer has had it.
+wxString WayOut(const Job& job, const fs::path& in, const Texts& texts) {
+    const wxString text =
+        job.print.number > 0
+            ? texts(wxTRANSLATE("What to do: put it back into %s to print it again, or: "
+                                "quillon retry %lld"))
+            : texts(wxTRANSLATE("What to do: open it in its application, mend it, save it, and put "
+                                "it back into %s to try it again. To try it again as it is: "
+                                "quillon retry %lld"));
+    return wxString::Format(text, Shown(in), static_cast<long long>(job.id));
+}
+
 wxString ReasonOf(const Job& job) {
     return job.fault && !job.fault->what.empty() ? job.fault->what : job.text;
 }
@@ -47,11 +59,7 @@ std::string NoteFor(const Job& job, const fs::path& in, const Texts& texts) {
     if (job.fault && !job.fault->advice.empty())
         line(Sentence(job.fault->advice, texts));
     line({});
-    line(wxString::Format(
-        texts(wxTRANSLATE("What to do: open it in its application, mend it, save it, and put it "
-                          "back into %s to try it again. To try it again as it is: "
-                          "quillon retry %lld")),
-        Shown(in), static_cast<long long>(job.id)));
+    line(WayOut(job, in, texts));
     line({});
     line(wxString::Format(texts(wxTRANSLATE("When: %s")), TimeText(job.ended)));
     line(wxString::Format(texts(wxTRANSLATE("Attempts: %d")), job.attempts));

@@ -213,9 +213,11 @@ void JobPrinting::TakeEnd(const SpooledJob& found, Order& order, Job& job,
     order.isToBeTold = true;
 }
 
-/// A person can see what has come out, and this program cannot.
+/// A person can see what has come out, and this program cannot. A second loss is no accident: a
+/// server that keeps no history loses every job, on paper or not, and the paper would not end.
 void JobPrinting::TakeLoss(Order& order, Job& job, const FolderConfiguration& folder) {
-    job.print.held = !folder.print || !folder.print->printsLost;
+    const bool wasLost = job.fault.has_value();
+    job.print.held = wasLost || !folder.print || !folder.print->printsLost;
     job.fault = LossOf(job, job.print.held);
     job.text = m_errorText(job.fault->code);
     SetLevelAndGetLogger(LevelError, __FILE__, __func__, __LINE__)
