@@ -11,6 +11,14 @@ FilterSet::FilterSet(const std::filesystem::path& folder) {
     }
 }
 
+std::set<std::string> FilterSet::Extensions() const {
+    std::set<std::string> extensions;
+    for (const auto& filter : m_filters)
+        for (const wxString& extension : filter->Extensions())
+            extensions.insert(extension.Lower().utf8_string());
+    return extensions;
+}
+
 Filter* FilterSet::Claiming(const wxString& extension) const {
     for (const auto& filter : m_filters)
         if (filter->Claims(extension))

@@ -4,6 +4,8 @@
 
 #include <filesystem>
 #include <memory>
+#include <set>
+#include <string>
 #include <vector>
 
 /// The filters of a folder.
@@ -13,6 +15,9 @@ public:
     explicit FilterSet(const std::filesystem::path& folder);
 
     const std::vector<std::unique_ptr<Filter>>& Filters() const { return m_filters; }
+
+    /// Of the files that they claim, in lower case, without dots.
+    std::set<std::string> Extensions() const;
 
     /// @param extension without dot
     /// @return the first filter that claims files with it, or null

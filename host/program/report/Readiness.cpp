@@ -51,6 +51,16 @@ std::optional<Fault> FindMissingFilter(const FilterSet& filters) {
           "Install the program anew"));
 }
 
+std::set<std::string> FindUnopenable(const FilterSet& filters) {
+    std::set<std::string> extensions;
+    for (const std::string& extension : filters.Extensions()) {
+        const auto application = ApplicationForExtension(wxString::FromUTF8(extension));
+        if (application && FindMissingApplication(*application))
+            extensions.insert(extension);
+    }
+    return extensions;
+}
+
 std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation) {
     std::vector<Fault> missing;
     if (ListConvertible(filters).empty())

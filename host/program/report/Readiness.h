@@ -8,6 +8,9 @@
 /// Whether there is no filter at all, without which no document can be looked at.
 std::optional<Fault> FindMissingFilter(const FilterSet& filters);
 
+/// Extensions of documents that there is no application for on this machine.
+std::set<std::string> FindUnopenable(const FilterSet& filters);
+
 /// What is missing to convert documents at all, or to make PDF files of them.
 /// @param requireIsolation whether documents must be kept from the rest of the machine
 std::vector<Fault> FindMissing(const FilterSet& filters, bool requireIsolation);

@@ -17,22 +17,24 @@ QueueMembership::~QueueMembership() {
     }
 }
 
-std::map<wxString, Fault> QueueMembership::Announce(const std::vector<FolderConfiguration>& folders,
-                                                    const std::vector<wxString>& all) {
+void QueueMembership::Announce(WatchedFolders& folders) {
     std::vector<AnnouncedFolder> announced;
-    std::map<wxString, Fault> faults;
-    for (const FolderConfiguration& folder : folders) {
+    std::vector<wxString> all;
+    for (WatchedFolder& folder : folders) {
+        all.push_back(folder.Name());
+        folder.ShowUntold({});
+        if (!folder.View().hasLooked || folder.View().fault)
+            continue; // it may be another watch's
         Fault fault;
-        if (std::optional<AnnouncedFolder> each = AnnouncementOf(folder, m_map, fault))
+        if (auto each = AnnouncementOf(*folder.Configuration(), m_map, fault))
             announced.push_back(std::move(*each));
         else
-            faults[folder.name] = fault;
+            folder.ShowUntold(fault);
     }
     if (announced != m_announced || all != m_all)
         m_journal.Announce(announced, m_finder, all);
     m_announced = std::move(announced);
-    m_all = all;
-    return faults;
+    m_all = std::move(all);
 }
 
 std::optional<std::vector<FolderConfiguration>> QueueMembership::News() {

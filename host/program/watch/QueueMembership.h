@@ -1,7 +1,7 @@
 #pragma once
 
 #include "host/program/journal/SharedJournal.h"
-#include "host/program/watch/WatchStatus.h"
+#include "host/program/watch/WatchedFolders.h"
 
 /// This program among those that work on a shared journal: what it tells them, and hears of them.
 /// All that asks the journal throws JournalError.
@@ -20,11 +20,9 @@ public:
     QueueMembership(const QueueMembership&) = delete;
     QueueMembership& operator=(const QueueMembership&) = delete;
 
-    /// Tells of folders whose documents this machine finds, where anything has changed.
-    /// @param all that it is to find documents in, also those that it does not have at the moment
-    /// @return why some cannot be told of
-    std::map<wxString, Fault> Announce(const std::vector<FolderConfiguration>& folders,
-                                       const std::vector<wxString>& all);
+    /// Tells of the folders whose documents this machine finds, where anything has changed. Those
+    /// that cannot be told of show why.
+    void Announce(WatchedFolders& folders);
 
     /// The folders that others have told of, when they have changed since the last call.
     std::optional<std::vector<FolderConfiguration>> News();
@@ -39,7 +37,7 @@ private:
     const wxString m_finder;
     const PathMap m_map;
     std::vector<AnnouncedFolder> m_announced; ///< last, by this machine
-    std::vector<wxString> m_all;              ///< likewise
+    std::vector<wxString> m_all; ///< likewise, with those that it does not have at the moment
     std::optional<std::vector<AnnouncedFolder>> m_heard;
     wxString m_refused; ///< why some of those cannot be worked for
 };

@@ -15,9 +15,7 @@ void RemoveSource(const Job& job) {
         fs::remove(job.aside, error);
 }
 
-} // namespace
-
-void RemoveOldDocuments(const FolderConfiguration& folder, Journal& journal) {
+void RemoveOldDocumentsOf(const FolderConfiguration& folder, Journal& journal) {
     const std::chrono::seconds lasts =
         folder.keepProcessed.value_or(std::chrono::seconds(RecordsLast));
     for (const JobState state : {JobState::Archived, JobState::Vanished}) {
@@ -32,4 +30,12 @@ void RemoveOldDocuments(const FolderConfiguration& folder, Journal& journal) {
             journal.Remove(job.id);
         }
     }
+}
+
+} // namespace
+
+void RemoveOldDocuments(const WatchedFolders& folders, Journal& journal) {
+    for (const WatchedFolder& folder : folders)
+        if (!folder.Configuration()->isOthers)
+            RemoveOldDocumentsOf(*folder.Configuration(), journal);
 }

@@ -6,7 +6,7 @@
 
 #include <wx/intl.h>
 
-void WatchReport::TellFolders(const std::list<WatchedFolder>& folders) {
+void WatchReport::TellFolders(const WatchedFolders& folders) {
     for (const WatchedFolder& folder : folders) {
         const FolderConfiguration& configuration = *folder.Configuration();
         m_reporter.Line(wxString::Format(configuration.isOthers
@@ -16,7 +16,7 @@ void WatchReport::TellFolders(const std::list<WatchedFolder>& folders) {
     }
 }
 
-void WatchReport::TellObstacles(const std::list<WatchedFolder>& folders) {
+void WatchReport::TellObstacles(const WatchedFolders& folders) {
     for (const WatchedFolder& folder : folders) {
         const std::optional<Fault> obstacle = folder.Obstacle();
         const wxString text = obstacle ? obstacle->Text() : wxString();

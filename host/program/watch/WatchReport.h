@@ -2,9 +2,7 @@
 
 #include "host/program/documents/Outcome.h"
 #include "host/program/report/Reporter.h"
-#include "host/program/watch/WatchedFolder.h"
-
-#include <list>
+#include "host/program/watch/WatchedFolders.h"
 
 /// Says to people how a watch fares.
 class WatchReport {
@@ -13,10 +11,10 @@ public:
     explicit WatchReport(Reporter& reporter) : m_reporter(reporter) {}
 
     /// Says which folders are worked for.
-    void TellFolders(const std::list<WatchedFolder>& folders);
+    void TellFolders(const WatchedFolders& folders);
 
     /// Says when a folder's documents wait for something, and when they do no longer.
-    void TellObstacles(const std::list<WatchedFolder>& folders);
+    void TellObstacles(const WatchedFolders& folders);
 
     /// Says what has become of a document.
     void Tell(const Job& job, const Outcome& outcome);

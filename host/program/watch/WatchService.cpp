@@ -2,10 +2,9 @@
 
 #include "common/WQServices.h"
 #include "host/program/base/PathText.h"
-#include "host/program/machine/MissingParts.h"
+#include "host/program/report/Readiness.h"
 #include "host/program/system/Interruption.h"
 #include "host/program/system/ServiceManager.h"
-#include "host/program/watch/FreeSpace.h"
 #include "host/program/watch/Retention.h"
 
 #include <wx/intl.h>
@@ -20,32 +19,11 @@ namespace {
 constexpr std::chrono::seconds BetweenHeartbeats = 10s;
 constexpr std::chrono::seconds BetweenStatuses = 1s;
 constexpr std::chrono::seconds BetweenMeetings = 5s;
-constexpr std::chrono::minutes BetweenSweeps = 10min;
 constexpr std::chrono::minutes BetweenRemovals = 1min;
 
 /// How long a document under way may take to be finished before the program ends, beyond what a
 /// service is given anyway.
 constexpr std::chrono::seconds DrainingTakes = 120s;
-
-/// In lower case, without dots.
-std::set<std::string> ExtensionsOf(const FilterSet& filters) {
-    std::set<std::string> extensions;
-    for (const auto& filter : filters.Filters())
-        for (const wxString& extension : filter->Extensions())
-            extensions.insert(extension.Lower().utf8_string());
-    return extensions;
-}
-
-/// Extensions of documents that there is no application for on this machine.
-std::set<std::string> FindUnopenable(const FilterSet& filters) {
-    std::set<std::string> extensions;
-    for (const std::string& extension : ExtensionsOf(filters)) {
-        const auto application = ApplicationForExtension(wxString::FromUTF8(extension));
-        if (application && FindMissingApplication(*application))
-            extensions.insert(extension);
-    }
-    return extensions;
-}
 
 } // namespace
 
@@ -54,6 +32,7 @@ WatchService::WatchService(WatchConfiguration configuration, Means means, Journa
     : m_configuration(std::move(configuration)), m_means(std::move(means)), m_journal(journal),
       m_filters(filters), m_board(board), m_reporter(reporter), m_report(reporter),
       m_claimant({m_means.self.name, m_configuration.lease, {}}),
+      m_folders(filters.Extensions(), journal.Shared() != nullptr, [this] { m_work.Wake(); }),
       m_work({m_claimant, m_means.workerArguments, m_means.workerPatience, m_means.language,
               m_means.engineDocuments, m_configuration.jobs,
               [this](const Job& job, const Outcome& outcome) { OnEnd(job, outcome); },
@@ -73,10 +52,11 @@ ExitCode WatchService::Run() {
     while (!m_isOver && !(m_isDraining && IsDrained())) {
         Pass();
         if (!isReady && m_isOpen) {
-            if (const std::optional<Fault> other = FindOtherWatcher())
-                return m_reporter.Error(*other);
-            isReady = std::all_of(m_folders.begin(), m_folders.end(),
-                                  [](const auto& folder) { return folder.View().hasLooked; });
+            if (const std::optional<Fault> misuse = m_folders.Misuse()) {
+                m_folders.Close(); // before what they wake
+                return m_reporter.Error(*misuse);
+            }
+            isReady = m_folders.HaveBeenSeen();
             if (isReady) {
                 TellReady();
                 m_met = {};
@@ -86,14 +66,14 @@ ExitCode WatchService::Run() {
         m_work.Step();
     }
     const ExitCode exitCode = Verdict();
-    m_folders.clear();
+    m_folders.Close();
     m_work.Close();
     return exitCode;
 }
 
 void WatchService::TellReady() {
     m_report.TellFolders(m_folders);
-    if (m_folders.empty())
+    if (m_folders.IsEmpty())
         m_reporter.Line(
             _("No machine has told of a folder yet; documents are begun when one does."));
     ServiceManager::TellReady();
@@ -109,30 +89,14 @@ ExitCode WatchService::Verdict() const {
         return ExitCode::Done;
     if (m_isDraining)
         return ExitCode::Interrupted;
-    const bool isBlocked = std::any_of(m_folders.begin(), m_folders.end(), [](const auto& folder) {
-        return folder.Obstacle().has_value();
-    });
-    if (isBlocked)
+    if (m_folders.IsAnyBlocked())
         return ExitCode::MachineAtFault;
     return m_report.HasFailures() ? ExitCode::DocumentsAtFault : ExitCode::Done;
 }
 
 void WatchService::OpenFolders(const std::vector<FolderConfiguration>& folders) {
-    const std::set<std::string> extensions = ExtensionsOf(m_filters);
-    const std::map<wxString, FolderCounts> counts = m_journal.Counts();
+    m_folders.Open(folders, m_journal.Counts());
     m_isOpen = true;
-    m_folders.clear();
-    for (const FolderConfiguration& folder : folders)
-        m_folders.emplace_back(folder, extensions, m_membership != nullptr,
-                               counts.count(folder.name) != 0, [this] { m_work.Wake(); });
-}
-
-/// @return why the watch cannot begin
-std::optional<Fault> WatchService::FindOtherWatcher() const {
-    for (const WatchedFolder& folder : m_folders)
-        if (folder.View().fault && folder.View().fault->blame == Blame::Usage)
-            return folder.View().fault;
-    return std::nullopt;
 }
 
 /// A configuration that cannot be used changes nothing.
@@ -168,7 +132,6 @@ void WatchService::Pass() {
         MeetOthers(now);
         if (!m_isOpen)
             OpenFolders(m_configuration.folders);
-        m_paused = m_journal.Paused();
         LookAfterFolders();
         if (!m_isDraining && Works())
             m_work.BeginJobs();
@@ -182,9 +145,7 @@ void WatchService::Pass() {
                 ServiceManager::TellStopping(DrainingTakes);
         }
         if (now - m_removedOld > BetweenRemovals) {
-            for (const WatchedFolder& folder : m_folders)
-                if (!folder.Configuration()->isOthers)
-                    RemoveOldDocuments(*folder.Configuration(), m_journal);
+            RemoveOldDocuments(m_folders, m_journal);
             m_removedOld = now;
         }
         m_isOver = m_means.once && !hasEnded && IsDone();
@@ -204,21 +165,21 @@ void WatchService::Pass() {
 }
 
 void WatchService::LookAfterFolders() {
+    const std::set<wxString> paused = m_journal.Paused();
     std::error_code none; // then engines have none either, and say so
     std::vector<fs::path> places = {fs::temp_directory_path(none)};
     if (!m_membership)
         places.push_back(FromArgument(m_configuration.journal).parent_path());
-    const std::optional<Fault> shortage = FindShortage(places, m_configuration.minFree);
     if (std::exchange(m_mustForget, false))
-        for (WatchedFolder& folder : m_folders)
-            folder.Watcher().Forget();
+        m_folders.Forget();
+    m_folders.Update(paused, m_configuration.minFree, places);
     for (WatchedFolder& folder : m_folders) {
-        folder.Update(m_paused, m_configuration.minFree, shortage);
         if (folder.View().awaitsAdmission) {
             Recover(folder);
             folder.Watcher().Admit();
         }
-        Insert(folder);
+        if (WatchedFolders::Insert(folder, m_journal))
+            m_work.Expect();
     }
 }
 
@@ -226,44 +187,17 @@ void WatchService::LookAfterFolders() {
 void WatchService::Recover(WatchedFolder& folder) {
     if (!Works())
         return;
-    if (const std::size_t count = m_work.Recover({&folder}))
+    if (const std::size_t count = m_work.Recovery().Recover(folder))
         m_reporter.Line(
             wxString::Format(wxPLURAL("%s: recovered %zu document", "%s: recovered %zu documents",
                                       static_cast<unsigned>(count)),
                              folder.Name(), count));
-    m_work.Sweep(folder.Configuration()->out);
-}
-
-/// Takes over what other machines have lost, and removes what they have left.
-void WatchService::TakeOver(Clock::time_point now) {
-    std::vector<WatchedFolder*> folders;
-    for (WatchedFolder& folder : m_folders)
-        if (folder.MayBegin(now))
-            folders.push_back(&folder);
-    const bool isSweeping = now - m_swept > BetweenSweeps;
-    if (folders.empty() || (m_work.Recover(folders) == 0 && !isSweeping))
-        return;
-    for (const WatchedFolder* const folder : folders)
-        m_work.Sweep(folder->Configuration()->out);
-    m_swept = now;
+    m_work.Recovery().Sweep(folder.Configuration()->out);
 }
 
 /// Whether it converts documents, too.
 bool WatchService::Works() const {
     return !m_membership || !m_means.self.finds || m_configuration.jobs > 0;
-}
-
-/// Tells others of the folders that are this machine's: one that another one watches is not.
-void WatchService::Announce() {
-    std::vector<FolderConfiguration> folders;
-    std::vector<wxString> all;
-    for (const WatchedFolder& folder : m_folders) {
-        all.push_back(folder.Name());
-        if (folder.View().hasLooked && !folder.View().fault)
-            folders.push_back(*folder.Configuration());
-    }
-    if (m_isOpen)
-        m_untold = m_membership->Announce(folders, all);
 }
 
 /// Tells others that have the same journal of this machine, hears of them, and takes over what they
@@ -272,28 +206,18 @@ void WatchService::MeetOthers(Clock::time_point now) {
     if (!m_membership || now - m_met < std::min(BetweenMeetings, m_claimant.lease / 3))
         return;
     if (m_means.self.finds) {
-        Announce();
+        if (m_isOpen)
+            m_membership->Announce(m_folders);
     } else if (auto folders = m_membership->News()) {
         m_configuration.folders = std::move(*folders);
         m_isOpen = false;
     }
     if (Works()) {
         m_claimant.cannot = FindUnopenable(m_filters);
-        TakeOver(now);
+        m_work.Recovery().TakeOver(now);
     }
     m_membership->Report(Status());
     m_met = now;
-}
-
-void WatchService::Insert(WatchedFolder& folder) {
-    std::vector<NewJob> jobs;
-    for (SettledFile& file : folder.Watcher().Take())
-        jobs.push_back({folder.Name(), std::move(file.path), file.inside, file.identity,
-                        folder.Configuration()->priority, std::move(file.digest)});
-    if (jobs.empty())
-        return;
-    m_journal.Insert(jobs);
-    m_work.Expect();
 }
 
 WatchStatus WatchService::Status() const {
@@ -303,12 +227,8 @@ WatchStatus WatchService::Status() const {
     if (!m_journalFault.empty())
         status.journalFault = wxString::Format(_("the journal cannot be used: %s"), m_journalFault);
     status.draining = m_isDraining;
-    for (const WatchedFolder& folder : m_folders) {
+    for (const WatchedFolder& folder : m_folders)
         status.folders.push_back(folder.Status());
-        wxString& obstacle = status.folders.back().obstacle;
-        if (const auto untold = m_untold.find(folder.Name()); untold != m_untold.end())
-            obstacle << (obstacle.empty() ? "" : "; ") << untold->second.Text();
-    }
     status.running = m_work.Running();
     return status;
 }
@@ -323,15 +243,8 @@ void WatchService::TellStatus() {
 
 /// Whether nothing is left that has settled, or may yet.
 bool WatchService::IsDone() const {
-    if (m_isDraining || m_work.IsBusy() || m_work.IsPrinting())
-        return false;
-    for (const WatchedFolder& folder : m_folders) {
-        const FolderWatcher::View& view = folder.View();
-        const bool isLookingYet = !view.hasLooked || view.awaitsAdmission || view.scans == 0;
-        if (!view.fault && (isLookingYet || view.settling > 0))
-            return false;
-    }
-    return true; // whatever waits could have been begun, and was not: it waits for another day
+    // Whatever waits then could have been begun, and was not: it waits for another day.
+    return !m_isDraining && !m_work.IsBusy() && !m_work.IsPrinting() && m_folders.HaveSettled();
 }
 
 void WatchService::OnEnd(const Job& job, const Outcome& outcome) {

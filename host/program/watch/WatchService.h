@@ -48,16 +48,12 @@ private:
     using Clock = std::chrono::steady_clock;
 
     void OpenFolders(const std::vector<FolderConfiguration>& folders);
-    std::optional<Fault> FindOtherWatcher() const;
     void Reload();
     void Pass();
     void LookAfterFolders();
-    void Insert(WatchedFolder& folder);
-    void Announce();
     void MeetOthers(Clock::time_point now);
     bool Works() const;
     void Recover(WatchedFolder& folder);
-    void TakeOver(Clock::time_point now);
     void TellReady();
     WatchStatus Status() const;
     void TellStatus();
@@ -78,8 +74,7 @@ private:
     Claimant m_claimant;
     std::unique_ptr<QueueMembership>
         m_membership; ///< null when the journal is this machine's alone
-    std::set<wxString> m_paused;
-    WatchWork::Folders m_folders;
+    WatchedFolders m_folders;
     WatchWork m_work;
 
     const std::chrono::system_clock::time_point m_started;
@@ -87,8 +82,6 @@ private:
     Clock::time_point m_heartbeat;
     Clock::time_point m_told;
     Clock::time_point m_met; ///< others
-    Clock::time_point m_swept = Clock::now();
-    std::map<wxString, Fault> m_untold; ///< why folders cannot be told of
     Clock::time_point m_removedOld;
     wxString m_journalFault;
     bool m_mustForget = false; ///< what was found may not be in the journal

@@ -93,6 +93,8 @@ FolderStatus WatchedFolder::Status() const {
     status.reachable = m_view.hasLooked && !m_view.fault;
     if (const std::optional<Fault> obstacle = Obstacle())
         status.obstacle = obstacle->Text();
+    if (m_untold)
+        status.obstacle << (status.obstacle.empty() ? "" : "; ") << m_untold->Text();
     status.paused = m_isPaused;
     status.settling = m_view.settling;
     status.freeBytes = m_view.freeBytes;

@@ -44,6 +44,9 @@ public:
         m_isPrintingFull = isFull;
     }
 
+    /// Says why other machines cannot be told of it, if that is so.
+    void ShowUntold(std::optional<Fault> fault) { m_untold = std::move(fault); }
+
     /// Says that the machine could not convert a document of it.
     void Block(Fault fault);
     /// Says that it could.
@@ -72,6 +75,7 @@ private:
     bool m_isProbing = false;
     std::optional<Fault> m_printTrouble;
     bool m_isPrintingFull = false;
+    std::optional<Fault> m_untold;
 
     std::optional<std::string> m_settings;
     FileIdentity m_settingsFile; ///< that they are of
