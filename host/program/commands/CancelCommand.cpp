@@ -32,13 +32,11 @@ std::optional<Fault> Cancel(std::int64_t id, Journal& journal) {
     if (!job)
         return Fault{_("no print server has it; `quillon queue --state printing` shows which can "
                        "be cancelled")};
-    Spooler spooler(job->print.server);
-    const PrintReply reply = FindPrintJob(spooler, job->print.number);
-    if (reply.fault)
-        return reply.fault;
-    if (!reply.job || reply.job->uuid != job->print.uuid)
-        return Fault{_("the print server has lost it")};
-    return spooler.Cancel(job->print.number);
+    const PrintOrder& print = job->print;
+    Spooler spooler(print.server);
+    if (std::optional<Fault> loss = FindLoss(spooler, print.queue, print.number, print.uuid))
+        return loss;
+    return spooler.Cancel(print.number);
 }
 
 ExitCode Run(const CancelOptions& options, Journal& journal, Reporter& reporter) {

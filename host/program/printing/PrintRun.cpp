@@ -57,6 +57,22 @@ PrintReply PrintRun::MakeJob(const Submission& submission) {
     }
 }
 
+/// A server that dies while it answers has the document.
+std::optional<Fault> PrintRun::Send(const Submission& submission, const PrintedJob& job) {
+    std::optional<Fault> fault = SendToPrinter(m_spooler, submission, job.number, job.uuid);
+    if (!fault)
+        return std::nullopt;
+    const PrintReply found = FindPrintJob(m_spooler, job.number);
+    if (found.fault)
+        return fault;
+    if (!found.job || found.job->uuid != job.uuid)
+        return LossOf(job.queue, job.number);
+    if (found.job->documents > 0)
+        return std::nullopt;
+    m_spooler.Cancel(job.number); // it would wait for its document
+    return fault;
+}
+
 void PrintRun::Submit(Outcome& outcome, const wxString& message) {
     Submission submission;
     submission.ticket = m_ticket;
@@ -66,12 +82,11 @@ void PrintRun::Submit(Outcome& outcome, const wxString& message) {
     if (reply.job) {
         const PrintedJob job = {m_spooler.Address(), m_ticket.queue, reply.job->number,
                                 reply.job->uuid};
-        reply = SendToPrinter(m_spooler, submission, job.number);
+        reply.fault = Send(submission, job);
         if (!reply.fault) {
             outcome.print = job;
             return;
         }
-        m_spooler.Cancel(job.number); // it would wait for its document
     }
     Fault fault = reply.fault.value_or(
         Fault{_("the print server's answer cannot be understood"), Blame::Machine});

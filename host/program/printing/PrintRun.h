@@ -35,6 +35,7 @@ private:
     explicit PrintRun(PrintTicket ticket);
 
     PrintReply MakeJob(const Submission& submission);
+    std::optional<Fault> Send(const Submission& submission, const PrintedJob& job);
 
     PrintTicket m_ticket;
     Spooler m_spooler;

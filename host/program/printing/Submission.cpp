@@ -137,16 +137,18 @@ PrintReply MakePrintJob(Spooler& spooler, const Submission& submission) {
     return reply;
 }
 
-PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int number) {
+std::optional<Fault> SendToPrinter(Spooler& spooler, const Submission& submission, int number,
+                                   const wxString& uuid) {
+    if (std::optional<Fault> loss = FindLoss(spooler, submission.ticket.queue, number, uuid))
+        return loss;
     Fault fault;
     const std::optional<PrintWay> way = FindWay(spooler, submission, fault);
     if (!way)
-        return {fault, {}};
+        return fault;
     const Kind* const kind = Choose(submission, *way);
     if (!kind)
-        return {NothingFor(submission), {}};
-    return {spooler.Send(submission.ticket.queue, number, FileOf(submission, *kind), kind->type),
-            {}};
+        return NothingFor(submission);
+    return spooler.Send(submission.ticket.queue, number, FileOf(submission, *kind), kind->type);
 }
 
 PrintReply FindPrintJob(Spooler& spooler, int number) {
@@ -155,6 +157,14 @@ PrintReply FindPrintJob(Spooler& spooler, int number) {
     if (!jobs)
         return {fault, {}};
     return {{}, jobs->empty() ? std::nullopt : std::optional(std::move(jobs->front()))};
+}
+
+std::optional<Fault> FindLoss(Spooler& spooler, const wxString& queue, int number,
+                              const wxString& uuid) {
+    PrintReply reply = FindPrintJob(spooler, number);
+    if (reply.fault || (reply.job && reply.job->uuid == uuid))
+        return std::move(reply.fault);
+    return LossOf(queue, number);
 }
 
 std::optional<bool> WantsPdf(Spooler& spooler, const wxString& queue, Fault& fault) {

@@ -31,12 +31,19 @@ struct Submission {
 /// before it could write down the number, is taken away.
 PrintReply MakePrintJob(Spooler& spooler, const Submission& submission);
 
-/// Gives the job its document. To be asked for once: a print server takes a second one, too.
-PrintReply SendToPrinter(Spooler& spooler, const Submission& submission, int number);
+/// Gives the job its document, unless the server has lost it meanwhile: its number may be that of
+/// another one. To be asked for once: a print server takes a second document, too.
+std::optional<Fault> SendToPrinter(Spooler& spooler, const Submission& submission, int number,
+                                   const wxString& uuid);
 
 /// Looks for a job.
 /// @return without a job when the server has none of that number
 PrintReply FindPrintJob(Spooler& spooler, int number);
+
+/// Why a job is not to be touched: the server has none of that number any more, or another one, or
+/// cannot say.
+std::optional<Fault> FindLoss(Spooler& spooler, const wxString& queue, int number,
+                              const wxString& uuid);
 
 /// Whether PDF is what a queue prints as it is, and not what applications print.
 /// @return nothing when it cannot be asked, or takes neither

@@ -121,12 +121,13 @@ void JobPrinting::Begin(Order& order, Job& job, const FolderConfiguration& folde
                              folder.print ? folder.print->mostQueued : 0,
                              folder.print && !WantsPdf(folder.print->ticket), ProductOf(job)};
     order.reply = DeskOf(job.print.server)
-                      .Ask([step = order.step, number = job.print.number,
+                      .Ask([step = order.step, number = job.print.number, uuid = job.print.uuid,
                             submission = std::move(submission)](Spooler& spooler) {
                           if (step == Step::Make)
                               return MakePrintJob(spooler, submission);
-                          return step == Step::Send ? SendToPrinter(spooler, submission, number)
-                                                    : FindPrintJob(spooler, number);
+                          if (step == Step::Find)
+                              return FindPrintJob(spooler, number);
+                          return PrintReply{SendToPrinter(spooler, submission, number, uuid), {}};
                       });
 }
 
